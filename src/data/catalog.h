@@ -1,0 +1,47 @@
+#pragma once
+
+#include "data/db_connection.h"
+#include "platform/user_prompt.h"
+
+#include <QString>
+#include <QStringList>
+
+namespace mirel {
+
+// Reads a database's own catalog and gives each database its lasting identity: a hidden table named "MirelSys"
+// and a stamp of 14 digits, the moment at which the system first opened the database.
+//
+// Every call runs on the file `database`; failures are reported through the prompt and return false with an
+// empty result.
+class Catalog {
+public:
+    // Both must outlive the catalog.
+    Catalog(DbConnection& connection, UserPrompt& prompt) : connection_(connection), prompt_(prompt) {}
+
+    // The user's tables by name; the catalog's own tables and the stamp table are left out.
+    bool ListTables(const QString& database, QStringList& tables);
+    // The stamp, empty when the database bears none. False when the statement failed.
+    bool FindDatabaseStamp(const QString& database, QString& stamp);
+    // Gives the database a stamp that no file in `folderOfSideFiles` bears yet. Says nothing when it fails:
+    // a database that cannot be written is opened without a stamp.
+    bool EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp);
+    bool ListFields(const QString& table, const QString& database, QStringList& fields);
+    // The index on a field: its name and flags (bit 0 descending, bit 1 unique). True, with an empty name and
+    // flags 0, also when there is none.
+    bool FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
+                        int& flags);
+    // Runs a statement that yields no rows.
+    bool ExecuteStatement(const QString& database, const QString& statement);
+
+private:
+    DbConnection& connection_;
+    UserPrompt& prompt_;
+};
+
+// A name as it stands in a statement: bare when it is empty, begins with "[", is "*", or is a letter followed
+// by letters, digits and "_", and no reserved word of the dialect; in brackets otherwise.
+QString FieldReference(QStringView name);
+// A text as a literal: in single quotes, inner ones doubled.
+QString QuoteText(QStringView text);
+
+} // namespace mirel

@@ -1,0 +1,81 @@
+#pragma once
+
+#include "data/db_connection.h"
+
+#include <QString>
+
+#include <memory>
+#include <span>
+
+namespace mirel {
+
+// One open result: the rows of a table or of a SELECT, and a current position in them. Every statement of the
+// system runs through Open, those without rows as well.
+//
+// Positions count from 0. After Open the recordset stands on the first record, or at the end when there is
+// none. Field indexes count from 0 in the order of the result's columns.
+//
+// Owns its cursor and closes it when destroyed; the connection must outlive it. A call that fails returns false
+// and leaves the position where it was; LastResult() says why. Missing fields give neutral values.
+class DbRecordset {
+public:
+    explicit DbRecordset(DbConnection& connection);
+    ~DbRecordset();
+    Q_DISABLE_COPY_MOVE(DbRecordset)
+
+    // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
+    // with the full path `database`. CREATE and DROP DATABASE take an empty path.
+    [[nodiscard]] bool Open(const QString& source, const QString& database, CursorType cursor, LockType lock);
+    void Close();
+    bool IsOpen() const { return open_; }
+
+    Hr LastResult() const { return lastResult_; }
+    QString ErrorContext() const;  // what the provider adds to the last failure
+    QString Source() const;
+    LockType Lock() const;  // ReadOnly also for a result that cannot be updated
+
+    int FieldCount() const;                    // 0 when not open
+    QString FieldName(int index) const;        // empty: no such column
+    int FieldIndex(QStringView name) const;    // exact, case counts; -1: no such column
+    FieldType TypeOfField(int index) const;    // None: no such column
+    int FieldSize(int index) const;            // -1: no such column, or no limit
+    std::span<const ResultField> Fields() const;
+
+    // Moves past either end stop there and are no failure.
+    [[nodiscard]] bool MoveFirst();
+    [[nodiscard]] bool MoveLast();
+    [[nodiscard]] bool MoveNext();
+    [[nodiscard]] bool MovePrevious();
+    [[nodiscard]] bool MoveTo(qint64 position);
+    bool IsEof() const;
+    bool IsBof() const;
+    qint64 Position() const;  // -1 at either end
+
+    qint64 RecordCount();             // finishes counting; -1 when not open or forward-only
+    bool CountStep(int budgetMs);     // true once the count is known
+    quint64 Generation() const;       // grows when records may have changed or moved
+
+    // The current record's value; integer 0 when there is no such column, null at either end.
+    Value FieldValue(int index) const;
+    Value FieldValue(QStringView name) const;
+    // The value as text: VariantText of it, with empty text for NULL.
+    QString ValueText(int index) const;
+
+    [[nodiscard]] bool Read(const ReadRange& range, const CellSink& sink);
+
+    [[nodiscard]] bool AddNew(std::span<const FieldChange> values);
+    [[nodiscard]] bool Update(std::span<const FieldChange> values);
+    [[nodiscard]] bool Update(int index, const Value& value);
+    [[nodiscard]] bool Delete();
+    [[nodiscard]] bool UpdateAll(int field, const Value& value, const BulkProgress& progress);
+    [[nodiscard]] bool DeleteAll(const BulkProgress& progress);
+
+private:
+    bool Keep(Hr result) const;  // remembers the result; true when it is no failure
+
+    std::unique_ptr<ProviderRecordset> cursor_;
+    bool open_ = false;
+    mutable Hr lastResult_ = Hr::Ok;
+};
+
+} // namespace mirel

@@ -1,0 +1,17 @@
+#pragma once
+
+#include "platform/field_type.h"
+
+#include <QString>
+
+namespace mirel {
+
+// The names under which people see the storage types ("Text", "Memo", "Yes/No", …). False, and `name` as it
+// was, for a type that has none.
+bool TypeNameOfField(FieldType type, QString& name);
+
+// The type clause of CREATE TABLE for such a name: exact, case counts; "Boolean" is taken beside "Yes/No"; any
+// other name gives "Text", the long text. `size` counts for "Text" alone, which becomes Varchar(size).
+QString DdlTypeOfName(QStringView name, int size);
+
+} // namespace mirel

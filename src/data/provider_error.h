@@ -1,0 +1,16 @@
+#pragma once
+
+#include "data/db_recordset.h"
+#include "platform/user_prompt.h"
+
+namespace mirel {
+
+// The words of a failed provider call: "Error: (80040E37)", the context, a line end, the message for that
+// result. `recordset` (may be null) tells a read-only join from a faulty command.
+QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& context);
+
+// The single place where a failure of the provider becomes a message to the user. Nothing happens when `hr` is
+// no failure.
+void ReportProviderError(UserPrompt& prompt, const DbRecordset* recordset, Hr hr);
+
+} // namespace mirel

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <QString>
+
+namespace mirel {
+
+// The per-application profile: integers and texts by section and key, in one text file. A line that cannot be
+// read gives the default; other programs' lines and hand edits survive. Not cached between programs: each write
+// goes to the file at once.
+class Profile {
+public:
+    explicit Profile(QString path);
+
+    int ReadInt(const QString& section, const QString& key, int fallback) const;
+    QString ReadText(const QString& section, const QString& key, const QString& fallback) const;
+    bool WriteInt(const QString& section, const QString& key, int value);
+    bool WriteText(const QString& section, const QString& key, const QString& value);
+
+private:
+    QString path_;
+};
+
+} // namespace mirel

@@ -1,0 +1,47 @@
+#pragma once
+
+#include "platform/value.h"
+
+#include <QLocale>
+#include <QString>
+
+#include <optional>
+
+namespace mirel {
+
+// How this user writes dates and times; the one place that formats and parses them for people. Files and
+// statements use the C locale and ISO dates instead.
+//
+// The date text is the locale's short date with a four-digit year, the time text the locale's time with
+// seconds; for US English "7/4/2001" and "9:05:00 AM". Under the C and POSIX locales it is US English.
+class UserLocale {
+public:
+    explicit UserLocale(const QLocale& locale);
+
+    // The locale of this process: the system's, unless a test set another.
+    static const UserLocale& Current();
+    static void SetCurrent(const QLocale& locale);
+
+    // Midnight is left out, and so is the base date 1899-12-30 (a value that is both shows its time). Empty for
+    // what is no date.
+    QString DateTimeText(double oleDays) const;
+    QString DateText(double oleDays) const;
+    QString TimeText(double oleDays) const;
+    // Takes the locale's form and always ISO "2001-07-04", each with an optional time after a blank or "T", and
+    // a time alone (on the base date).
+    std::optional<double> ParseDateTime(QStringView text) const;
+
+    const QLocale& Locale() const { return locale_; }
+
+private:
+    QLocale locale_;
+    QString dateFormat_;  // for QLocale::toString
+    QString timeFormat_;
+};
+
+// A value as text where nobody says otherwise: integers in decimal, a double with up to 15 significant digits
+// and "." as its point, a date as the user's date-time text, a bool as "-1" or "0"; NULL as the empty text.
+QString VariantText(const Value& value);
+QString NumberText(double number);  // the double's rule alone
+
+} // namespace mirel

@@ -1,0 +1,49 @@
+#pragma once
+
+#include "resources/string_table.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <functional>
+#include <memory>
+#include <optional>
+
+namespace mirel {
+
+// One of the system's texts with its arguments; what the user sees is Text().
+struct UserMessage {
+    Str id;
+    QStringList arguments;
+
+    QString Text() const { return StringText(id, arguments); }
+};
+
+// Long work in progress. Destroying it takes the display away.
+class Progress {
+public:
+    virtual ~Progress() = default;
+
+    // `done` counts from 0 to the total that StartProgress was given. Returns false once the user has asked to
+    // stop: the work then ends at the next point where everything done so far is whole. Cheap enough to call
+    // for every thousand records, not for every one.
+    [[nodiscard]] virtual bool Advance(qint64 done) = 0;
+};
+
+// How core asks and tells: the window shows message boxes, the command line answers from its options, a test
+// answers from a script. Core never waits for the user in any other way.
+class UserPrompt {
+public:
+    virtual ~UserPrompt() = default;
+
+    virtual bool AskYesNo(const UserMessage& question) = 0;
+    virtual void Show(const UserMessage& message) = 0;
+    // A text whose words are not one row of the string table: a failure of the provider, with its context.
+    virtual void ShowError(const QString& text) = 0;
+    // Empty optional: the user cancelled.
+    virtual std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,
+                                           const QString& preset) = 0;
+    virtual std::unique_ptr<Progress> StartProgress(const UserMessage& what, qint64 total) = 0;
+};
+
+} // namespace mirel

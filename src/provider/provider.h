@@ -1,0 +1,163 @@
+#pragma once
+
+#include "platform/cell.h"
+#include "platform/field_type.h"
+#include "platform/hr.h"
+#include "platform/value.h"
+
+#include <QString>
+
+#include <functional>
+#include <memory>
+#include <span>
+#include <vector>
+
+namespace mirel {
+
+// What a data access provider is to the rest of the system. Everything above this folder works through these
+// interfaces and knows no engine; src/provider/sqlite/ is the provider "cedb" over the SQLite library.
+//
+// One thread uses a connection and all that comes from it. No call throws; what fails returns a failed Hr, and
+// changes nothing unless it says so. After a failure ErrorContext() adds what only the provider knows (the
+// place in a statement, the path and the reason), empty when there is nothing to add.
+
+enum class CursorType : int { ForwardOnly = 0, Static = 3 };
+enum class LockType : int { ReadOnly = 1, Optimistic = 3 };
+
+// A column of an open result.
+struct ResultField {
+    QString name;    // as the result shows it
+    FieldType type = FieldType::None;
+    int size = 0;    // characters of a Text, bytes of every other type; -1 where there is no limit
+    QString table;   // the table that the column comes from; empty for an expression
+    QString column;  // its name in that table; empty for an expression
+};
+
+// A value for a column of an open result, by its index there.
+struct FieldChange {
+    int field;
+    Value value;
+};
+
+// Takes one record: its cells in the order of the requested fields, borrowed for the call. False ends the walk.
+using CellSink = std::function<bool(std::span<const Cell> cells)>;
+
+// Told how many records a bulk run has done; false asks it to stop there.
+using BulkProgress = std::function<bool(qint64 done)>;
+
+// Which records Read walks, and which columns of them it hands over.
+struct ReadRange {
+    enum class Order { Result, Any };
+
+    qint64 first = 0;         // position in the result, from 0
+    qint64 count = -1;        // -1: to the end
+    std::vector<int> fields;  // indexes in the result; empty: all
+    Order order = Order::Result;  // Any: whatever is fastest, for sums over the whole result
+};
+
+// One result: the records of a table or a SELECT, and a current position in them; or a statement that was run
+// and yields no records.
+//
+// Positions count from 0. A static cursor knows every position: own additions go to the end, own deletions
+// leave, changed values are seen as they are now, changes by other programs are taken up before the next page
+// is read. A forward-only cursor moves on and knows no count.
+class ProviderRecordset {
+public:
+    virtual ~ProviderRecordset() = default;
+
+    // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
+    // whose full path is `database`; CREATE and DROP DATABASE take an empty path. On success the first record
+    // is current, or the result is at its end. On failure nothing is open.
+    [[nodiscard]] virtual Hr Open(const QString& source, const QString& database, CursorType cursor,
+                                  LockType lock) = 0;
+    virtual void Close() = 0;
+
+    virtual QString Source() const = 0;
+    // ReadOnly also where a static, optimistic cursor was asked for and the result cannot be updated.
+    virtual LockType Lock() const = 0;
+    virtual QString ErrorContext() const = 0;
+    // Empty for a statement that yields no records.
+    virtual std::span<const ResultField> Fields() const = 0;
+
+    // Finishes counting. -1 for a forward-only cursor.
+    virtual qint64 RecordCount() = 0;
+    // Counts on for about `budgetMs`; true once the count is known. Calls that need positions count by
+    // themselves: this is for a window that shows its first page before it knows how many there are.
+    virtual bool CountStep(int budgetMs) = 0;
+    // Grows whenever the records may be others, or stand elsewhere, than before: own changes, and changes of
+    // other programs once the cursor has taken them up.
+    virtual quint64 Generation() const = 0;
+
+    virtual bool AtBegin() const = 0;  // before the first record
+    virtual bool AtEnd() const = 0;    // behind the last record; also when there is none
+    virtual qint64 Position() const = 0;  // of the current record; -1 at either end
+
+    [[nodiscard]] virtual Hr MoveFirst() = 0;
+    [[nodiscard]] virtual Hr MoveLast() = 0;
+    [[nodiscard]] virtual Hr MoveNext() = 0;
+    [[nodiscard]] virtual Hr MovePrevious() = 0;
+    // To a position from 0. Past the last record it stands at the end, below 0 before the first; both are Ok.
+    [[nodiscard]] virtual Hr MoveTo(qint64 position) = 0;
+
+    // The current record's value. NoCurrentRecord at either end.
+    [[nodiscard]] virtual Hr GetValue(int field, Value& value) = 0;
+
+    // Hands records over without moving the current one: a page, an export, a sum. One read transaction; the
+    // sink must not use this recordset. A forward-only cursor starts at the current record and uses it up.
+    [[nodiscard]] virtual Hr Read(const ReadRange& range, const CellSink& sink) = 0;
+
+    // Each is one transaction, on disk when the call returns (inside a bulk run: when that ends). Values are
+    // checked and converted for their column: what does not read is BadLiteral, what does not fit Overflow.
+    [[nodiscard]] virtual Hr AddNew(std::span<const FieldChange> values) = 0;  // the new record becomes current
+    [[nodiscard]] virtual Hr Update(std::span<const FieldChange> values) = 0;
+    [[nodiscard]] virtual Hr Delete() = 0;  // the record behind it becomes current, or the end
+
+    // All records of the result, as one transaction. A refused record or a stop commits the records before it.
+    [[nodiscard]] virtual Hr UpdateAll(int field, const Value& value, const BulkProgress& progress) = 0;
+    [[nodiscard]] virtual Hr DeleteAll(const BulkProgress& progress) = 0;
+};
+
+// Appends records to one table at the speed of the store: what the CSV import feeds. Records are one
+// transaction from creation to Commit(); destroying it without Commit() leaves nothing of the run.
+class RecordAppender {
+public:
+    virtual ~RecordAppender() = default;
+
+    // The columns that Append expects, in that order.
+    virtual std::span<const ResultField> Fields() const = 0;
+
+    // One record, a cell a column. Cells are checked against the columns' types and sizes as everywhere (a Text
+    // cell for a date column is a stored date); a refused record is not added, and the appender goes on working.
+    [[nodiscard]] virtual Hr Append(std::span<const Cell> cells) = 0;
+    // Which column, from 0, the last failing Append refused; -1 when it was no single one.
+    virtual int RefusedField() const = 0;
+    virtual QString ErrorContext() const = 0;
+
+    [[nodiscard]] virtual Hr Commit() = 0;
+};
+
+// A provider with the database files that are open in it: one handle a file, opened by the first result that
+// names its path and kept until CloseDatabase. Results and appenders must be gone before their connection.
+class ProviderConnection {
+public:
+    virtual ~ProviderConnection() = default;
+
+    virtual std::unique_ptr<ProviderRecordset> CreateRecordset() = 0;
+
+    // `columns` empty: all columns of the table. On failure null; `result` and `context` say why.
+    virtual std::unique_ptr<RecordAppender> CreateAppender(const QString& database, const QString& table,
+                                                           const QStringList& columns, Hr& result,
+                                                           QString& context) = 0;
+
+    // Changes between the two are one transaction, on disk when EndBulk returns; they nest.
+    [[nodiscard]] virtual Hr BeginBulk(const QString& database) = 0;
+    [[nodiscard]] virtual Hr EndBulk(const QString& database) = 0;
+
+    // Gives the file up. Results still open on it are closed: their calls fail with NotOpen from then on.
+    virtual void CloseDatabase(const QString& database) = 0;
+};
+
+// The provider of that name ("cedb"), null when there is none.
+std::unique_ptr<ProviderConnection> CreateProvider(QStringView name);
+
+} // namespace mirel

@@ -1,0 +1,20 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+namespace mirel {
+
+// The system's texts by name. The table itself is strings.def, one row a text (name, number, text): the names
+// here and the texts in the program come from that one file. Numbers below 60000 are the ones that people and
+// documents know; later texts take theirs from 60000.
+enum class Str : int {
+#define MIREL_STRING(name, number, text) name = number,
+#include "resources/strings.def"
+#undef MIREL_STRING
+};
+
+// The text with %1, %2, … replaced by `arguments`, all at once: an argument that holds "%2" stays as it is.
+QString StringText(Str id, const QStringList& arguments = {});
+
+} // namespace mirel
