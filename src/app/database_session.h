@@ -36,8 +36,8 @@ public:
 
     bool IsOpen() const { return !path_.isEmpty(); }
     QString Path() const { return path_; }
-    QString Stamp() const { return stamp_; }        // empty: the database could not be written
-    QString SideFile() const { return sideFile_; }  // empty likewise
+    QString Stamp() const { return stamp_; }       // empty: the database could not be written
+    QString SideFile() const { return sideFile_; } // empty likewise
     FormStore& Store() { return *store_; }
     QStringList Favorites() const { return favorites_; }
 

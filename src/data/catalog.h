@@ -16,7 +16,11 @@ namespace mirel {
 class Catalog {
 public:
     // Both must outlive the catalog.
-    Catalog(DbConnection& connection, UserPrompt& prompt) : connection_(connection), prompt_(prompt) {}
+    Catalog(DbConnection& connection, UserPrompt& prompt)
+        : connection_(connection)
+        , prompt_(prompt)
+    {
+    }
 
     // The user's tables by name; the catalog's own tables and the stamp table are left out.
     bool ListTables(const QString& database, QStringList& tables);

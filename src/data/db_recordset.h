@@ -30,15 +30,15 @@ public:
     bool IsOpen() const { return open_; }
 
     Hr LastResult() const { return lastResult_; }
-    QString ErrorContext() const;  // what the provider adds to the last failure
+    QString ErrorContext() const; // what the provider adds to the last failure
     QString Source() const;
-    LockType Lock() const;  // ReadOnly also for a result that cannot be updated
+    LockType Lock() const; // ReadOnly also for a result that cannot be updated
 
-    int FieldCount() const;                    // 0 when not open
-    QString FieldName(int index) const;        // empty: no such column
-    int FieldIndex(QStringView name) const;    // exact, case counts; -1: no such column
-    FieldType TypeOfField(int index) const;    // None: no such column
-    int FieldSize(int index) const;            // -1: no such column, or no limit
+    int FieldCount() const;                 // 0 when not open
+    QString FieldName(int index) const;     // empty: no such column
+    int FieldIndex(QStringView name) const; // exact, case counts; -1: no such column
+    FieldType TypeOfField(int index) const; // None: no such column
+    int FieldSize(int index) const;         // -1: no such column, or no limit
     std::span<const ResultField> Fields() const;
 
     // Moves past either end stop there and are no failure.
@@ -49,11 +49,11 @@ public:
     [[nodiscard]] bool MoveTo(qint64 position);
     bool IsEof() const;
     bool IsBof() const;
-    qint64 Position() const;  // -1 at either end
+    qint64 Position() const; // -1 at either end
 
-    qint64 RecordCount();             // finishes counting; -1 when not open or forward-only
-    bool CountStep(int budgetMs);     // true once the count is known
-    quint64 Generation() const;       // grows when records may have changed or moved
+    qint64 RecordCount();         // finishes counting; -1 when not open or forward-only
+    bool CountStep(int budgetMs); // true once the count is known
+    quint64 Generation() const;   // grows when records may have changed or moved
 
     // The current record's value; integer 0 when there is no such column, null at either end.
     Value FieldValue(int index) const;
@@ -71,7 +71,7 @@ public:
     [[nodiscard]] bool DeleteAll(const BulkProgress& progress);
 
 private:
-    bool Keep(Hr result) const;  // remembers the result; true when it is no failure
+    bool Keep(Hr result) const; // remembers the result; true when it is no failure
 
     std::unique_ptr<ProviderRecordset> cursor_;
     bool open_ = false;

@@ -7,10 +7,13 @@ namespace mirel {
 namespace {
 
 constexpr qint64 kMillisecondsPerDay = 86400000;
-constexpr qint64 kOleEpoch = 693899;  // 1899-12-30 counted from 0001-01-01
-constexpr qint64 kLastDay = 3652058;  // 9999-12-31 counted so
+constexpr qint64 kOleEpoch = 693593; // 1899-12-30 counted from 0001-01-01
+constexpr qint64 kLastDay = 3652058; // 9999-12-31 counted so
 
-constexpr bool IsLeap(int year) { return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0); }
+constexpr bool IsLeap(int year)
+{
+    return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0);
+}
 
 constexpr int DaysInMonth(int year, int month)
 {
@@ -29,8 +32,8 @@ constexpr qint64 DayNumber(int year, int month, int day)
     const qint64 dayOfEra = yearOfEra * 365 + yearOfEra / 4 - yearOfEra / 100 + dayOfYear;
     return era * 146097 + dayOfEra - 306;
 }
-static_assert(DayNumber(1, 1, 1) == 0 && DayNumber(1899, 12, 30) == kOleEpoch
-              && DayNumber(9999, 12, 31) == kLastDay);
+static_assert(DayNumber(1, 1, 1) == 0 && DayNumber(1899, 12, 30) == kOleEpoch &&
+              DayNumber(9999, 12, 31) == kLastDay);
 
 void SetDay(DateParts& parts, qint64 dayNumber)
 {
@@ -47,10 +50,10 @@ void SetDay(DateParts& parts, qint64 dayNumber)
 
 bool Exists(const DateParts& parts)
 {
-    return parts.year >= 1 && parts.year <= 9999 && parts.month >= 1 && parts.month <= 12 && parts.day >= 1
-           && parts.day <= DaysInMonth(parts.year, parts.month) && parts.hour >= 0 && parts.hour <= 23
-           && parts.minute >= 0 && parts.minute <= 59 && parts.second >= 0 && parts.second <= 59
-           && parts.millisecond >= 0 && parts.millisecond <= 999;
+    return parts.year >= 1 && parts.year <= 9999 && parts.month >= 1 && parts.month <= 12 && parts.day >= 1 &&
+           parts.day <= DaysInMonth(parts.year, parts.month) && parts.hour >= 0 && parts.hour <= 23 &&
+           parts.minute >= 0 && parts.minute <= 59 && parts.second >= 0 && parts.second <= 59 &&
+           parts.millisecond >= 0 && parts.millisecond <= 999;
 }
 
 double OleDays(qint64 dayNumber, qint64 millisecondOfDay)
@@ -63,7 +66,10 @@ double OleDays(qint64 dayNumber, qint64 millisecondOfDay)
 // Reads digits off the front of a text.
 class DigitReader {
 public:
-    explicit DigitReader(std::string_view text) : rest_(text) {}
+    explicit DigitReader(std::string_view text)
+        : rest_(text)
+    {
+    }
 
     bool Number(size_t minDigits, size_t maxDigits, int& number)
     {
@@ -142,12 +148,12 @@ std::optional<double> OleDate(const DateParts& parts)
 
 std::optional<DateParts> PartsOfOleDate(double oleDays)
 {
-    if (!(std::abs(oleDays) < 4e6))  // no number, or far outside the calendar
+    if (!(std::abs(oleDays) < 4e6)) // no number, or far outside the calendar
         return {};
     double wholeDays = std::trunc(oleDays);
     const double fraction = std::abs(oleDays - wholeDays);
     auto milliseconds = qint64(std::llround(fraction * double(kMillisecondsPerDay)));
-    if (milliseconds == kMillisecondsPerDay) {  // a fraction that rounds up to the next day
+    if (milliseconds == kMillisecondsPerDay) { // a fraction that rounds up to the next day
         milliseconds = 0;
         wholeDays += 1;
     }
@@ -167,8 +173,8 @@ std::optional<double> OleDate(const QDateTime& local)
 {
     const QDate date = local.date();
     const QTime time = local.time();
-    return OleDate(DateParts{date.year(), date.month(), date.day(), time.hour(), time.minute(), time.second(),
-                             time.msec()});
+    return OleDate(
+        DateParts{date.year(), date.month(), date.day(), time.hour(), time.minute(), time.second(), time.msec()});
 }
 
 std::optional<StoredDate> StoredDateOf(double oleDays)
@@ -195,8 +201,8 @@ std::optional<double> OleDateFromStored(std::string_view text)
 {
     DigitReader reader(text);
     DateParts parts;
-    if (!reader.Number(4, 4, parts.year) || !reader.Take('-') || !reader.Number(1, 2, parts.month)
-        || !reader.Take('-') || !reader.Number(1, 2, parts.day)) {
+    if (!reader.Number(4, 4, parts.year) || !reader.Take('-') || !reader.Number(1, 2, parts.month) ||
+        !reader.Take('-') || !reader.Number(1, 2, parts.day)) {
         return {};
     }
     int minutesEast = 0;
@@ -211,8 +217,8 @@ std::optional<double> OleDateFromStored(std::string_view text)
         return {};
     const qint64 milliseconds =
         ((parts.hour * 60LL + parts.minute) * 60 + parts.second) * 1000 + parts.millisecond;
-    const qint64 all = DayNumber(parts.year, parts.month, parts.day) * kMillisecondsPerDay + milliseconds
-                       - minutesEast * 60000LL;
+    const qint64 all =
+        DayNumber(parts.year, parts.month, parts.day) * kMillisecondsPerDay + milliseconds - minutesEast * 60000LL;
     if (all < 0 || all >= (kLastDay + 1) * kMillisecondsPerDay)
         return {};
     return OleDays(all / kMillisecondsPerDay, all % kMillisecondsPerDay);

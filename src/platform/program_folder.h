@@ -12,9 +12,9 @@ struct ProgramFolder {
     // "Mirel". Nothing is created.
     static ProgramFolder Find(const QString& home);
 
-    QString FormsFolder() const;     // the side files of the databases
-    QString FavoritesFile() const;   // Mirel.fvs
-    QString ProfileFile() const;     // Mirel.ini
+    QString FormsFolder() const;   // the side files of the databases
+    QString FavoritesFile() const; // Mirel.fvs
+    QString ProfileFile() const;   // Mirel.ini
 };
 
 } // namespace mirel

@@ -35,13 +35,13 @@ public:
 
 private:
     QLocale locale_;
-    QString dateFormat_;  // for QLocale::toString
+    QString dateFormat_; // for QLocale::toString
     QString timeFormat_;
 };
 
 // A value as text where nobody says otherwise: integers in decimal, a double with up to 15 significant digits
 // and "." as its point, a date as the user's date-time text, a bool as "-1" or "0"; NULL as the empty text.
 QString VariantText(const Value& value);
-QString NumberText(double number);  // the double's rule alone
+QString NumberText(double number); // the double's rule alone
 
 } // namespace mirel

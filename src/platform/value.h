@@ -26,7 +26,7 @@ enum class ValueTag : int {
 // Empty is "nothing was ever read", Null is the database's NULL; both show as an empty text.
 class Value {
 public:
-    Value() = default;  // Empty
+    Value() = default; // Empty
     static Value Null() { return Value(NullContent{}); }
     static Value SmallInt(qint16 number) { return Value(number); }
     static Value Integer(qint32 number) { return Value(number); }
@@ -42,7 +42,7 @@ public:
     // Each reads a value of its own tag; of any other tag it gives 0, false or empty. Number() reads both
     // integer tags, Double, Date (the day number) and Bool (1 or 0).
     double Number() const;
-    qint32 ToInt() const;  // SmallInt, Integer and Bool
+    qint32 ToInt() const; // SmallInt, Integer and Bool
     bool ToBool() const;
     QString ToText() const;
     QByteArray ToBinary() const;
@@ -57,10 +57,13 @@ private:
         double oleDays;
         friend bool operator==(const DateContent&, const DateContent&) = default;
     };
-    using Content = std::variant<std::monostate, NullContent, qint16, qint32, double, DateContent, QString, bool,
-                                 QByteArray>;
+    using Content =
+        std::variant<std::monostate, NullContent, qint16, qint32, double, DateContent, QString, bool, QByteArray>;
 
-    explicit Value(Content content) : content_(std::move(content)) {}
+    explicit Value(Content content)
+        : content_(std::move(content))
+    {
+    }
 
     Content content_;
 };

@@ -26,11 +26,11 @@ enum class LockType : int { ReadOnly = 1, Optimistic = 3 };
 
 // A column of an open result.
 struct ResultField {
-    QString name;    // as the result shows it
+    QString name; // as the result shows it
     FieldType type = FieldType::None;
-    int size = 0;    // characters of a Text, bytes of every other type; -1 where there is no limit
-    QString table;   // the table that the column comes from; empty for an expression
-    QString column;  // its name in that table; empty for an expression
+    int size = 0;   // characters of a Text, bytes of every other type; -1 where there is no limit
+    QString table;  // the table that the column comes from; empty for an expression
+    QString column; // its name in that table; empty for an expression
 };
 
 // A value for a column of an open result, by its index there.
@@ -49,10 +49,10 @@ using BulkProgress = std::function<bool(qint64 done)>;
 struct ReadRange {
     enum class Order { Result, Any };
 
-    qint64 first = 0;         // position in the result, from 0
-    qint64 count = -1;        // -1: to the end
-    std::vector<int> fields;  // indexes in the result; empty: all
-    Order order = Order::Result;  // Any: whatever is fastest, for sums over the whole result
+    qint64 first = 0;            // position in the result, from 0
+    qint64 count = -1;           // -1: to the end
+    std::vector<int> fields;     // indexes in the result; empty: all
+    Order order = Order::Result; // Any: whatever is fastest, for sums over the whole result
 };
 
 // One result: the records of a table or a SELECT, and a current position in them; or a statement that was run
@@ -88,9 +88,9 @@ public:
     // other programs once the cursor has taken them up.
     virtual quint64 Generation() const = 0;
 
-    virtual bool AtBegin() const = 0;  // before the first record
-    virtual bool AtEnd() const = 0;    // behind the last record; also when there is none
-    virtual qint64 Position() const = 0;  // of the current record; -1 at either end
+    virtual bool AtBegin() const = 0;    // before the first record
+    virtual bool AtEnd() const = 0;      // behind the last record; also when there is none
+    virtual qint64 Position() const = 0; // of the current record; -1 at either end
 
     [[nodiscard]] virtual Hr MoveFirst() = 0;
     [[nodiscard]] virtual Hr MoveLast() = 0;
@@ -108,9 +108,9 @@ public:
 
     // Each is one transaction, on disk when the call returns (inside a bulk run: when that ends). Values are
     // checked and converted for their column: what does not read is BadLiteral, what does not fit Overflow.
-    [[nodiscard]] virtual Hr AddNew(std::span<const FieldChange> values) = 0;  // the new record becomes current
+    [[nodiscard]] virtual Hr AddNew(std::span<const FieldChange> values) = 0; // the new record becomes current
     [[nodiscard]] virtual Hr Update(std::span<const FieldChange> values) = 0;
-    [[nodiscard]] virtual Hr Delete() = 0;  // the record behind it becomes current, or the end
+    [[nodiscard]] virtual Hr Delete() = 0; // the record behind it becomes current, or the end
 
     // All records of the result, as one transaction. A refused record or a stop commits the records before it.
     [[nodiscard]] virtual Hr UpdateAll(int field, const Value& value, const BulkProgress& progress) = 0;

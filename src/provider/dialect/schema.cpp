@@ -8,18 +8,31 @@ namespace {
 template <typename Record>
 const Record* FindByName(const std::vector<Record>& records, QStringView name)
 {
-    const auto found = std::ranges::find_if(records, [&](const Record& record) { return SameName(record.name, name); });
+    const auto found =
+        std::ranges::find_if(records, [&](const Record& record) { return SameName(record.name, name); });
     return found == records.end() ? nullptr : &*found;
 }
 
 } // namespace
 
-const Column* Table::FindColumn(QStringView columnName) const { return FindByName(columns, columnName); }
+const Column* Table::FindColumn(QStringView columnName) const
+{
+    return FindByName(columns, columnName);
+}
 
-const Index* Table::FindIndex(QStringView indexName) const { return FindByName(indexes, indexName); }
+const Index* Table::FindIndex(QStringView indexName) const
+{
+    return FindByName(indexes, indexName);
+}
 
-const Table* Schema::FindTable(QStringView tableName) const { return FindByName(tables, tableName); }
+const Table* Schema::FindTable(QStringView tableName) const
+{
+    return FindByName(tables, tableName);
+}
 
-bool SameName(QStringView a, QStringView b) { return a.compare(b, Qt::CaseInsensitive) == 0; }
+bool SameName(QStringView a, QStringView b)
+{
+    return a.compare(b, Qt::CaseInsensitive) == 0;
+}
 
 } // namespace mirel::dialect

@@ -16,17 +16,17 @@ namespace mirel::dialect {
 struct Column {
     QString name;
     FieldType type = FieldType::None;
-    int size = 0;      // characters of a Text, bytes of a VarBinary; -1: no limit
-    int id = 0;        // FieldID: stable within a session
-    bool foreignDates = false;  // a date column whose values may be in forms other than ours: compared and
-                                // sorted through a normalising function
+    int size = 0;              // characters of a Text, bytes of a VarBinary; -1: no limit
+    int id = 0;                // FieldID: stable within a session
+    bool foreignDates = false; // a date column whose values may be in forms other than ours: compared and
+                               // sorted through a normalising function
 };
 
 struct Index {
-    QString name;        // as people see it
-    QString storedName;  // as the engine knows it
+    QString name;       // as people see it
+    QString storedName; // as the engine knows it
     struct Part {
-        int column;      // position in the table
+        int column; // position in the table
         bool descending;
     };
     std::vector<Part> parts;
@@ -35,23 +35,23 @@ struct Index {
 
 struct Table {
     QString name;
-    QString storedName;  // as the engine knows it: another name for the catalog's own tables
-    int id = 0;          // TableID: stable within a session
+    QString storedName; // as the engine knows it: another name for the catalog's own tables
+    int id = 0;         // TableID: stable within a session
     std::vector<Column> columns;
     std::vector<Index> indexes;
-    QByteArray rowId;    // the alias under which rows are addressed (rowid, _rowid_, oid); empty: there is none
-    bool writable = true;   // false for views, the catalog's tables and tables without an addressable row id
-    bool isSystem = false;  // the catalog's own tables
+    QByteArray rowId;      // the alias under which rows are addressed (rowid, _rowid_, oid); empty: there is none
+    bool writable = true;  // false for views, the catalog's tables and tables without an addressable row id
+    bool isSystem = false; // the catalog's own tables
 
-    const Column* FindColumn(QStringView columnName) const;  // null: none
-    const Index* FindIndex(QStringView indexName) const;     // null: none
+    const Column* FindColumn(QStringView columnName) const; // null: none
+    const Index* FindIndex(QStringView indexName) const;    // null: none
 };
 
 class Schema {
 public:
     std::vector<Table> tables;
 
-    const Table* FindTable(QStringView tableName) const;  // null: none
+    const Table* FindTable(QStringView tableName) const; // null: none
 };
 
 // The one rule by which names are the same.

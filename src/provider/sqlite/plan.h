@@ -18,29 +18,29 @@ namespace mirel::sqlite {
 
 // One table of a FROM clause.
 struct PlannedSource {
-    QString table;     // its name in the schema
-    QByteArray alias;  // how the SQL below calls it, ready to use: "[T]", "[t0]"
-    QByteArray rowId;  // its row id, ready to use: "[t0].rowid"; empty when the table has none
+    QString table;    // its name in the schema
+    QByteArray alias; // how the SQL below calls it, ready to use: "[T]", "[t0]"
+    QByteArray rowId; // its row id, ready to use: "[t0].rowid"; empty when the table has none
 };
 
 struct PlannedOrder {
-    QByteArray expression;  // without the sort key function
-    bool isText = false;    // by the user's language, case ignored, ties by exact text; else as SQLite compares
+    QByteArray expression; // without the sort key function
+    bool isText = false;   // by the user's language, case ignored, ties by exact text; else as SQLite compares
     bool descending = false;
 };
 
 // A SELECT in pieces, so that a cursor can ask for keys, for one record, for a range of row ids.
 struct SelectPlan {
     std::vector<ResultField> fields;
-    std::vector<QByteArray> columns;     // an SQL expression a field
+    std::vector<QByteArray> columns; // an SQL expression a field
     std::vector<PlannedSource> sources;
-    QByteArray from;                     // behind FROM, joins included
-    QByteArray where;                    // behind WHERE; empty: none
-    QByteArray group;                    // "GROUP BY … HAVING …" or empty
+    QByteArray from;  // behind FROM, joins included
+    QByteArray where; // behind WHERE; empty: none
+    QByteArray group; // "GROUP BY … HAVING …" or empty
     std::vector<PlannedOrder> order;
     bool distinct = false;
-    bool keyed = true;       // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
-    int updatableSource = -1;  // the one source that all columns come from and that can be written; -1: none
+    bool keyed = true;        // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
+    int updatableSource = -1; // the one source that all columns come from and that can be written; -1: none
 };
 
 // INSERT, UPDATE … SET, DELETE FROM: complete SQL.
@@ -52,28 +52,54 @@ struct ChangePlan {
 struct ColumnDefinition {
     QString name;
     FieldType type = FieldType::None;
-    int size = 0;  // Text and VarBinary
+    int size = 0; // Text and VarBinary
 };
 
-struct CreateDatabase { QString path; };
-struct DropDatabase { QString path; };
+struct CreateDatabase {
+    QString path;
+};
+struct DropDatabase {
+    QString path;
+};
 struct CreateTable {
     QString table;
     std::vector<ColumnDefinition> columns;
 };
-struct DropTable { QString table; };
-struct RenameTable { QString table; QString newName; };
-struct AddColumn { QString table; ColumnDefinition column; };
-struct DropColumn { QString table; QString column; };
-struct RenameColumn { QString table; QString column; QString newName; };
-struct MoveColumn { QString table; QString column; QString before; };
+struct DropTable {
+    QString table;
+};
+struct RenameTable {
+    QString table;
+    QString newName;
+};
+struct AddColumn {
+    QString table;
+    ColumnDefinition column;
+};
+struct DropColumn {
+    QString table;
+    QString column;
+};
+struct RenameColumn {
+    QString table;
+    QString column;
+    QString newName;
+};
+struct MoveColumn {
+    QString table;
+    QString column;
+    QString before;
+};
 struct CreateIndex {
     QString table;
     QString index;
-    std::vector<std::pair<QString, bool>> columns;  // name, descending
+    std::vector<std::pair<QString, bool>> columns; // name, descending
     bool unique = false;
 };
-struct DropIndex { QString table; QString index; };
+struct DropIndex {
+    QString table;
+    QString index;
+};
 
 using StructurePlan = std::variant<CreateTable, DropTable, RenameTable, AddColumn, DropColumn, RenameColumn,
                                    MoveColumn, CreateIndex, DropIndex>;
@@ -81,7 +107,7 @@ using Plan = std::variant<SelectPlan, ChangePlan, StructurePlan, CreateDatabase,
 
 struct PlanFailure {
     Hr code = Hr::SyntaxError;
-    QString context;  // for people: the place and what stands there; empty where the code says all
+    QString context; // for people: the place and what stands there; empty where the code says all
 };
 
 using PlanResult = std::variant<Plan, PlanFailure>;
@@ -97,9 +123,9 @@ PlanResult PlanDatabaseStatement(QStringView statement);
 QByteArray OrderClause(const std::vector<PlannedOrder>& order);
 
 // Functions of ours that written SQL uses; the engine registers them on every handle (functions.h).
-inline constexpr const char* kSortKeyFunction = "mirel_sortkey";     // (text) -> blob; NULL stays NULL
-inline constexpr const char* kDateFunction = "mirel_date";           // (any) -> our stored date text, or NULL
-inline constexpr const char* kLikeFunction = "mirel_like";           // (text, pattern) -> 0, 1 or NULL: "%" alone
-                                                                     // is a wildcard, case ignored
+inline constexpr const char* kSortKeyFunction = "mirel_sortkey"; // (text) -> blob; NULL stays NULL
+inline constexpr const char* kDateFunction = "mirel_date";       // (any) -> our stored date text, or NULL
+inline constexpr const char* kLikeFunction = "mirel_like";       // (text, pattern) -> 0, 1 or NULL: "%" alone
+                                                                 // is a wildcard, case ignored
 
 } // namespace mirel::sqlite

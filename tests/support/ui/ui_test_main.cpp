@@ -1,0 +1,19 @@
+// As test_main.cpp, with an application object for widgets on the offscreen platform.
+#include "platform/user_locale.h"
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QLocale>
+#include <QTemporaryDir>
+
+int main(int argc, char** argv)
+{
+    ::testing::InitGoogleTest(&argc, argv);
+    const QTemporaryDir home;
+    qputenv("MIREL_HOME", home.path().toUtf8());
+    const QApplication application(argc, argv);
+    QApplication::setStyle(QStringLiteral("Fusion"));
+    mirel::UserLocale::SetCurrent(QLocale(QLocale::English, QLocale::UnitedStates));
+    return RUN_ALL_TESTS();
+}
