@@ -1,0 +1,67 @@
+#pragma once
+
+#include <QString>
+#include <QTime>
+
+#include <array>
+#include <optional>
+#include <string_view>
+
+namespace mirel {
+
+// The order of the three date fields in a text. The numbers are what settings and scripts hold.
+enum class DateOrder : int {
+    MonthDayYear = 0,
+    MonthYearDay = 1,
+    YearDayMonth = 2,
+    YearMonthDay = 3,
+    DayMonthYear = 4,
+    DayYearMonth = 5,
+    Locale = 6, // the user's own form, read and written by UserLocale; separators play no part
+};
+
+// How CSV files write their dates. A separator of 0 is none: nothing is written for it, and no text that needs
+// it can be read.
+struct DateFormat {
+    DateOrder order = DateOrder::Locale;
+    char16_t dateSeparator = u'-';
+    char16_t timeSeparator = u':';
+
+    friend bool operator==(const DateFormat&, const DateFormat&) = default;
+};
+
+// Reads a date with an optional time after a blank: the day number, or empty when the text is no date. A field is
+// its leading number, the rest of it is ignored; years 0 to 29 are 2000 to 2029, other years below 100 are of the
+// 20th century. A time needs both of its separators; an hour that no separator follows is ignored.
+//
+// This is the one for bulk work: in the orders 0 to 5 it makes no QString of the UTF-8 it is given.
+std::optional<double> ParseDateFields(const DateFormat& format, std::string_view utf8);
+
+// The same for one text: `out` becomes the date as the user's locale writes it. On false `out` is as it was.
+[[nodiscard]] bool ParseDateText(DateOrder order, QChar dateSeparator, QChar timeSeparator, QStringView text,
+                                 QString& out);
+
+// A date in one of the orders 0 to 5, as UTF-8 in its own small buffer.
+struct DateFieldsText {
+    std::array<char, 40> characters{};
+    size_t length = 0;
+
+    std::string_view Text() const { return {characters.data(), length}; }
+};
+
+// Midnight is left out; a time on the base date 1899-12-30 stands alone. Empty text for what is no date. Not for
+// DateOrder::Locale, which has no fields of its own.
+DateFieldsText FormatDateFields(const DateFormat& format, double oleDays);
+
+// The same for every order.
+QString FormatDateText(const DateFormat& format, double oleDays);
+
+// Fills a pattern of pieces in parentheses, "(DD).(MM).(YYYY)"; docs/expressions.md lists the pieces. What
+// stands outside of them, and a "(" that is never closed, is copied. Empty for what is no date.
+QString FormatDatePattern(double oleDays, QStringView pattern);
+
+QString CurrentTimeText(QTime now = QTime::currentTime()); // "09:05:00"
+QString DateText(double oleDays);                          // "2001-07-04"; empty for what is no date
+QString CompactDateText(QStringView text);                 // "20010704" of a text that the user's locale reads
+
+} // namespace mirel
