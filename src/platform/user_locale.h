@@ -28,19 +28,23 @@ public:
     QString DateText(double oleDays) const;
     QString TimeText(double oleDays) const;
     // Takes the locale's form and always ISO "2001-07-04", each with an optional time after a blank or "T", and
-    // a time alone (on the base date).
+    // a time alone (on the base date). A year of two digits is one of 1930 to 2029.
     std::optional<double> ParseDateTime(QStringView text) const;
 
     const QLocale& Locale() const { return locale_; }
+    // The locale's forms in the letters of QLocale::toString: "M/d/yyyy", "h:mm:ss AP".
+    const QString& DateFormat() const { return dateFormat_; }
+    const QString& TimeFormat() const { return timeFormat_; }
 
 private:
     QLocale locale_;
-    QString dateFormat_; // for QLocale::toString
+    QString dateFormat_;
     QString timeFormat_;
 };
 
 // A value as text where nobody says otherwise: integers in decimal, a double with up to 15 significant digits
-// and "." as its point, a date as the user's date-time text, a bool as "-1" or "0"; NULL as the empty text.
+// and "." as its point, a date as the user's date-time text, a bool as "-1" or "0"; the empty text for NULL
+// and for binary values.
 QString VariantText(const Value& value);
 QString NumberText(double number); // the double's rule alone
 
