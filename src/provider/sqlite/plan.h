@@ -1,6 +1,8 @@
 #pragma once
 
+#include "provider/dialect/failure.h"
 #include "provider/dialect/schema.h"
+#include "provider/dialect/structure.h"
 #include "provider/provider.h"
 
 #include <QByteArray>
@@ -13,14 +15,15 @@
 namespace mirel::sqlite {
 
 // A statement of the dialect, parsed, checked against the schema and written for SQLite: what the planner
-// (planner.h) hands to the cursors and to the structure changes. All SQL here is UTF-8, names in brackets,
+// hands to the cursors and to the structure changes. All SQL here is UTF-8, names in brackets,
 // literals quoted; where a text has a place for parameters it says so.
 
 // One table of a FROM clause.
 struct PlannedSource {
-    QString table;    // its name in the schema
-    QByteArray alias; // how the SQL below calls it, ready to use: "[T]", "[t0]"
-    QByteArray rowId; // its row id, ready to use: "[t0].rowid"; empty when the table has none
+    QString table;         // its name in the schema
+    QByteArray alias;      // how the SQL below calls it, ready to use: "[T]", "[t0]"
+    QByteArray rowId;      // its row id, ready to use: "[t0].rowid"; empty when the table has none
+    bool optional = false; // the right side of a LEFT JOIN: without a matching row all of it is NULL, row id too
 };
 
 struct PlannedOrder {
@@ -39,8 +42,10 @@ struct SelectPlan {
     QByteArray group; // "GROUP BY … HAVING …" or empty
     std::vector<PlannedOrder> order;
     bool distinct = false;
-    bool keyed = true;        // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
-    int updatableSource = -1; // the one source that all columns come from and that can be written; -1: none
+    bool keyed = true; // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
+    // The one source that all columns come from and that can be written; -1: none. Fields without a `column`
+    // (expressions over that source) cannot be written even so.
+    int updatableSource = -1;
 };
 
 // INSERT, UPDATE … SET, DELETE FROM: complete SQL.
@@ -49,67 +54,23 @@ struct ChangePlan {
     QString table;
 };
 
-struct ColumnDefinition {
-    QString name;
-    FieldType type = FieldType::None;
-    int size = 0; // Text and VarBinary
-};
+// Checked: names that exist are spelled as the schema spells them, new names are free and writable.
+using dialect::AddColumn;
+using dialect::ColumnDefinition;
+using dialect::CreateDatabase;
+using dialect::CreateIndex;
+using dialect::CreateTable;
+using dialect::DropColumn;
+using dialect::DropDatabase;
+using dialect::DropIndex;
+using dialect::DropTable;
+using dialect::MoveColumn;
+using dialect::RenameColumn;
+using dialect::RenameTable;
+using StructurePlan = dialect::StructureChange;
 
-struct CreateDatabase {
-    QString path;
-};
-struct DropDatabase {
-    QString path;
-};
-struct CreateTable {
-    QString table;
-    std::vector<ColumnDefinition> columns;
-};
-struct DropTable {
-    QString table;
-};
-struct RenameTable {
-    QString table;
-    QString newName;
-};
-struct AddColumn {
-    QString table;
-    ColumnDefinition column;
-};
-struct DropColumn {
-    QString table;
-    QString column;
-};
-struct RenameColumn {
-    QString table;
-    QString column;
-    QString newName;
-};
-struct MoveColumn {
-    QString table;
-    QString column;
-    QString before;
-};
-struct CreateIndex {
-    QString table;
-    QString index;
-    std::vector<std::pair<QString, bool>> columns; // name, descending
-    bool unique = false;
-};
-struct DropIndex {
-    QString table;
-    QString index;
-};
-
-using StructurePlan = std::variant<CreateTable, DropTable, RenameTable, AddColumn, DropColumn, RenameColumn,
-                                   MoveColumn, CreateIndex, DropIndex>;
 using Plan = std::variant<SelectPlan, ChangePlan, StructurePlan, CreateDatabase, DropDatabase>;
-
-struct PlanFailure {
-    Hr code = Hr::SyntaxError;
-    QString context; // for people: the place and what stands there; empty where the code says all
-};
-
+using PlanFailure = dialect::Failure;
 using PlanResult = std::variant<Plan, PlanFailure>;
 
 // Parses, checks and writes one statement, or the bare name of a table. Never longer than the text asks for:

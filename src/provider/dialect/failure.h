@@ -1,0 +1,15 @@
+#pragma once
+
+#include "platform/hr.h"
+
+#include <QString>
+
+namespace mirel::dialect {
+
+// Why a statement was refused.
+struct Failure {
+    Hr code = Hr::SyntaxError;
+    QString context; // for people: the place and what stands there; empty where the code says all
+};
+
+} // namespace mirel::dialect
