@@ -10,6 +10,9 @@
 int main(int argc, char** argv)
 {
     ::testing::InitGoogleTest(&argc, argv);
+    // Also when the build asks for the list of tests, without the tests' environment.
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
     const QTemporaryDir home;
     qputenv("MIREL_HOME", home.path().toUtf8());
     const QApplication application(argc, argv);
