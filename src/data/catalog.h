@@ -42,6 +42,9 @@ private:
     UserPrompt& prompt_;
 };
 
+// The side file of a database: where its forms and saved queries lie, "<folder>/Mirel_<stamp>.RAF".
+QString SideFilePath(const QString& folder, const QString& stamp);
+
 // A name as it stands in a statement: bare when it is empty, begins with "[", is "*", or is a letter followed
 // by letters, digits and "_", and no reserved word of the dialect; in brackets otherwise.
 QString FieldReference(QStringView name);

@@ -1,0 +1,193 @@
+#include "data/catalog.h"
+
+#include "data/db_recordset.h"
+#include "data/provider_error.h"
+#include "provider/dialect/keywords.h"
+
+#include <QDateTime>
+#include <QFileInfo>
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr QStringView kSystemTablePrefix = u"MirelSys";
+constexpr qsizetype kStampDigits = 14;
+
+// The digits behind the prefix; empty for every other table, also for one that merely begins so.
+QString StampOfTable(const QString& table)
+{
+    if (!table.startsWith(kSystemTablePrefix) || table.size() != kSystemTablePrefix.size() + kStampDigits)
+        return {};
+    const QStringView stamp = QStringView(table).sliced(kSystemTablePrefix.size());
+    const bool digits = std::ranges::all_of(stamp, [](QChar each) { return each >= u'0' && each <= u'9'; });
+    return digits ? stamp.toString() : QString();
+}
+
+bool IsCatalogTable(const QString& table)
+{
+    return table == "MSysFields"_L1 || table == "MSysTables"_L1 || table == "MSysIndexes"_L1 ||
+           table == "MSysProcs"_L1;
+}
+
+bool Run(DbRecordset& recordset, const QString& source, const QString& database)
+{
+    return recordset.Open(source, database, CursorType::ForwardOnly, LockType::ReadOnly);
+}
+
+bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& source, const QString& database)
+{
+    if (Run(recordset, source, database))
+        return true;
+    ReportProviderError(prompt, &recordset, recordset.LastResult());
+    return false;
+}
+
+// The first column of every row, as text.
+bool ListFirstColumn(DbConnection& connection, UserPrompt& prompt, const QString& source, const QString& database,
+                     QStringList& texts)
+{
+    DbRecordset rows(connection);
+    if (!RunOrReport(prompt, rows, source, database))
+        return false;
+    while (!rows.IsEof()) {
+        texts += rows.ValueText(0);
+        if (!rows.MoveNext()) {
+            ReportProviderError(prompt, &rows, rows.LastResult());
+            return false;
+        }
+    }
+    return true;
+}
+
+// The wall clock's reading, on which seconds can be counted up without meeting the end of summer time.
+QDateTime WallClockNow()
+{
+    const QDateTime now = QDateTime::currentDateTime();
+    return {now.date(), now.time(), Qt::UTC};
+}
+
+} // namespace
+
+bool Catalog::ListTables(const QString& database, QStringList& tables)
+{
+    tables.clear();
+    QStringList names;
+    if (!ListFirstColumn(connection_, prompt_, u"SELECT TableName FROM MSYSTABLES ORDER BY TableName"_s, database,
+                         names))
+        return false;
+    std::ranges::copy_if(names, std::back_inserter(tables), [](const QString& name) {
+        return !IsCatalogTable(name) && StampOfTable(name).isEmpty();
+    });
+    return true;
+}
+
+bool Catalog::FindDatabaseStamp(const QString& database, QString& stamp)
+{
+    stamp.clear();
+    QStringList names;
+    if (!ListFirstColumn(connection_, prompt_,
+                         u"SELECT TableName FROM MSYSTABLES WHERE TableName LIKE "_s + QuoteText(u"MirelSys%"),
+                         database, names))
+        return false;
+    names.sort(); // the oldest stamp, should there be several
+    for (const QString& name : std::as_const(names)) {
+        stamp = StampOfTable(name);
+        if (!stamp.isEmpty())
+            break;
+    }
+    return true;
+}
+
+bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp)
+{
+    stamp.clear();
+    QString wanted;
+    QDateTime moment = WallClockNow();
+    do {
+        wanted = moment.toString(u"yyyyMMddHHmmss"_s);
+        moment = moment.addSecs(1);
+    } while (QFileInfo::exists(SideFilePath(folderOfSideFiles, wanted)));
+    DbRecordset statement(connection_);
+    if (!Run(statement, u"CREATE TABLE MirelSys%1 (SysParam Varchar(255))"_s.arg(wanted), database))
+        return false;
+    stamp = wanted;
+    return true;
+}
+
+bool Catalog::ListFields(const QString& table, const QString& database, QStringList& fields)
+{
+    fields.clear();
+    DbRecordset rows(connection_);
+    if (!RunOrReport(prompt_, rows, table.startsWith(u'[') ? table : u'[' + table + u']', database))
+        return false;
+    for (const ResultField& field : rows.Fields())
+        fields += field.name;
+    return true;
+}
+
+bool Catalog::FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
+                             int& flags)
+{
+    index.clear();
+    flags = 0;
+    DbRecordset rows(connection_);
+    if (!RunOrReport(prompt_, rows, u"SELECT TableID FROM MSysTables WHERE TableName="_s + QuoteText(table),
+                     database))
+        return false;
+    if (rows.IsEof())
+        return true;
+    const QString tableId = rows.ValueText(0);
+    if (!RunOrReport(
+            prompt_, rows,
+            u"SELECT FieldID FROM MSysFields WHERE TableID=%1 AND FieldName=%2"_s.arg(tableId, QuoteText(field)),
+            database))
+        return false;
+    if (rows.IsEof())
+        return true;
+    const QString fieldId = rows.ValueText(0);
+    if (!Run(rows,
+             u"SELECT IndexName,IndexFlags FROM MSysIndexes WHERE TableID=%1 AND FieldID=%2"_s.arg(tableId,
+                                                                                                   fieldId),
+             database))
+        return false;
+    if (!rows.IsEof()) {
+        index = rows.ValueText(0);
+        flags = rows.ValueText(1).toInt();
+    }
+    return true;
+}
+
+bool Catalog::ExecuteStatement(const QString& database, const QString& statement)
+{
+    DbRecordset recordset(connection_);
+    return RunOrReport(prompt_, recordset, statement, database);
+}
+
+QString SideFilePath(const QString& folder, const QString& stamp)
+{
+    return u"%1/Mirel_%2.RAF"_s.arg(folder, stamp);
+}
+
+QString FieldReference(QStringView name)
+{
+    const bool asItStands = name.isEmpty() || name.startsWith(u'[') || name == u"*";
+    const bool plain = !name.isEmpty() && name.front().isLetter() && std::ranges::all_of(name, [](QChar each) {
+        return each.isLetter() || each.isDigit() || each == u'_';
+    });
+    if (asItStands || (plain && !dialect::IsReservedWord(name)))
+        return name.toString();
+    return u'[' + name.toString() + u']';
+}
+
+QString QuoteText(QStringView text)
+{
+    return u'\'' + text.toString().replace(u'\'', "''"_L1) + u'\'';
+}
+
+} // namespace mirel

@@ -1,0 +1,197 @@
+#include "data/db_recordset.h"
+
+#include "platform/user_locale.h"
+
+#include <algorithm>
+
+namespace mirel {
+
+DbRecordset::DbRecordset(DbConnection& connection)
+    : cursor_(connection.Provider() ? connection.Provider()->CreateRecordset() : nullptr)
+{
+}
+
+DbRecordset::~DbRecordset()
+{
+    Close();
+}
+
+bool DbRecordset::Keep(Hr result) const
+{
+    lastResult_ = result;
+    return !Failed(result);
+}
+
+bool DbRecordset::Open(const QString& source, const QString& database, CursorType cursor, LockType lock)
+{
+    Close();
+    if (!cursor_)
+        return Keep(Hr::NotOpen);
+    open_ = Keep(cursor_->Open(source, database, cursor, lock));
+    return open_;
+}
+
+void DbRecordset::Close()
+{
+    if (open_)
+        cursor_->Close();
+    open_ = false;
+}
+
+QString DbRecordset::ErrorContext() const
+{
+    return cursor_ ? cursor_->ErrorContext() : QString();
+}
+
+QString DbRecordset::Source() const
+{
+    return cursor_ ? cursor_->Source() : QString();
+}
+
+LockType DbRecordset::Lock() const
+{
+    return cursor_ ? cursor_->Lock() : LockType::ReadOnly;
+}
+
+std::span<const ResultField> DbRecordset::Fields() const
+{
+    return open_ ? cursor_->Fields() : std::span<const ResultField>();
+}
+
+int DbRecordset::FieldCount() const
+{
+    return int(Fields().size());
+}
+
+QString DbRecordset::FieldName(int index) const
+{
+    return index >= 0 && index < FieldCount() ? Fields()[size_t(index)].name : QString();
+}
+
+int DbRecordset::FieldIndex(QStringView name) const
+{
+    const std::span<const ResultField> fields = Fields();
+    const auto at = std::ranges::find_if(fields, [name](const ResultField& field) { return field.name == name; });
+    return at == fields.end() ? -1 : int(at - fields.begin());
+}
+
+FieldType DbRecordset::TypeOfField(int index) const
+{
+    return index >= 0 && index < FieldCount() ? Fields()[size_t(index)].type : FieldType::None;
+}
+
+int DbRecordset::FieldSize(int index) const
+{
+    return index >= 0 && index < FieldCount() ? Fields()[size_t(index)].size : -1;
+}
+
+bool DbRecordset::MoveFirst()
+{
+    return Keep(open_ ? cursor_->MoveFirst() : Hr::NotOpen);
+}
+
+bool DbRecordset::MoveLast()
+{
+    return Keep(open_ ? cursor_->MoveLast() : Hr::NotOpen);
+}
+
+bool DbRecordset::MoveNext()
+{
+    return Keep(open_ ? cursor_->MoveNext() : Hr::NotOpen);
+}
+
+bool DbRecordset::MovePrevious()
+{
+    return Keep(open_ ? cursor_->MovePrevious() : Hr::NotOpen);
+}
+
+bool DbRecordset::MoveTo(qint64 position)
+{
+    return Keep(open_ ? cursor_->MoveTo(position) : Hr::NotOpen);
+}
+
+bool DbRecordset::IsEof() const
+{
+    return !open_ || cursor_->AtEnd();
+}
+
+bool DbRecordset::IsBof() const
+{
+    return !open_ || cursor_->AtBegin();
+}
+
+qint64 DbRecordset::Position() const
+{
+    return open_ ? cursor_->Position() : -1;
+}
+
+qint64 DbRecordset::RecordCount()
+{
+    return open_ ? cursor_->RecordCount() : -1;
+}
+
+bool DbRecordset::CountStep(int budgetMs)
+{
+    return !open_ || cursor_->CountStep(budgetMs);
+}
+
+quint64 DbRecordset::Generation() const
+{
+    return open_ ? cursor_->Generation() : 0;
+}
+
+Value DbRecordset::FieldValue(int index) const
+{
+    if (index < 0 || index >= FieldCount())
+        return Value::Integer(0);
+    Value value = Value::Null();
+    return Keep(cursor_->GetValue(index, value)) ? value : Value::Null();
+}
+
+Value DbRecordset::FieldValue(QStringView name) const
+{
+    return FieldValue(FieldIndex(name));
+}
+
+QString DbRecordset::ValueText(int index) const
+{
+    return VariantText(FieldValue(index));
+}
+
+bool DbRecordset::Read(const ReadRange& range, const CellSink& sink)
+{
+    return Keep(open_ ? cursor_->Read(range, sink) : Hr::NotOpen);
+}
+
+bool DbRecordset::AddNew(std::span<const FieldChange> values)
+{
+    return Keep(open_ ? cursor_->AddNew(values) : Hr::NotOpen);
+}
+
+bool DbRecordset::Update(std::span<const FieldChange> values)
+{
+    return Keep(open_ ? cursor_->Update(values) : Hr::NotOpen);
+}
+
+bool DbRecordset::Update(int index, const Value& value)
+{
+    const FieldChange change{index, value};
+    return Update(std::span(&change, 1));
+}
+
+bool DbRecordset::Delete()
+{
+    return Keep(open_ ? cursor_->Delete() : Hr::NotOpen);
+}
+
+bool DbRecordset::UpdateAll(int field, const Value& value, const BulkProgress& progress)
+{
+    return Keep(open_ ? cursor_->UpdateAll(field, value, progress) : Hr::NotOpen);
+}
+
+bool DbRecordset::DeleteAll(const BulkProgress& progress)
+{
+    return Keep(open_ ? cursor_->DeleteAll(progress) : Hr::NotOpen);
+}
+
+} // namespace mirel
