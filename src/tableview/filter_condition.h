@@ -1,0 +1,56 @@
+#pragma once
+
+#include "platform/field_type.h"
+#include "platform/value.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <span>
+
+namespace mirel {
+
+// The words of the two values of a Yes/No field, as the user set them.
+struct YesNoWords {
+    QString yes = QStringLiteral("Yes");
+    QString no = QStringLiteral("No");
+
+    friend bool operator==(const YesNoWords&, const YesNoWords&) = default;
+};
+
+enum class CellFilter { BySelection, ExcludingSelection };
+
+// The condition that keeps, or leaves out, the records whose field equals this cell. `reference` is the field as
+// it stands in a statement, `displayText` what the cell shows, uncut.
+QString ConditionFromCell(CellFilter filter, const QString& reference, FieldType type, const Value& value,
+                          const QString& displayText, const YesNoWords& words);
+
+// The operators that a filter offers for a type, in the order in which it offers them; none for a type that
+// cannot be compared. `range`: those of a From-To filter.
+enum class FilterKind { Single, Range };
+std::span<const std::u16string_view> FilterOperators(FieldType type, FilterKind kind = FilterKind::Single);
+
+// What a person puts together in the filter dialog: a field, an operator and a value, or two of them.
+struct FilterDraft {
+    QString table;
+    QString field;
+    FieldType type = FieldType::None;
+    bool fromTo = false;
+    QString operatorText; // one of FilterOperators; also the From operator
+    QString valueText;    // also the From value
+    QString toOperatorText;
+    QString toValueText;
+
+    // The operator that a Yes/No filter begins with for a cell that shows `displayText`.
+    static QString PresetYesNo(QStringView displayText);
+
+    // Empty when no table or field is chosen, or the operator fits no condition: the dialog then acts as Cancel.
+    QString Condition() const;
+};
+
+// What is typed into a sort box when a person picks a field or a direction there: the text in front of it
+// decides about the comma and the blank.
+QString SortFieldInsertion(const QString& box, const QString& table, const QString& field);
+QString WordInsertion(const QString& box, const QString& word);
+
+} // namespace mirel

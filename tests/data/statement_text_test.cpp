@@ -1,0 +1,78 @@
+#include "data/statement_text.h"
+
+#include "support/printing.h"
+
+#include <gtest/gtest.h>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+struct KeywordRow {
+    const char* what;
+    QStringView statement;
+    qsizetype position;
+};
+
+void ExpectWhere(std::initializer_list<KeywordRow> rows)
+{
+    for (const KeywordRow& row : rows)
+        EXPECT_EQ(KeywordPosition(row.statement, u"WHERE"), row.position) << row.what;
+}
+
+TEST(KeywordPosition, StandsAsAWholeWord)
+{
+    ExpectWhere({{"between blanks", u"SELECT * FROM T WHERE A=1", 16},
+                 {"at the start, any case", u"where A=1", 0},
+                 {"at the end", u"FROM T WHERE", 7},
+                 {"after a tab, before a bracket", u"FROM T\tWHERE(A=1)", 7},
+                 {"inside longer names", u"FROM NOWHERE WHEREVER", -1},
+                 {"behind a comma", u"A,WHERE B", -1}});
+}
+
+TEST(KeywordPosition, IsNotFoundInsideQuotesAndBrackets)
+{
+    ExpectWhere({{"single quotes", u"A='x WHERE y'", -1},
+                 {"the other quote inside", u"A='\" WHERE' WHERE B=2", 12},
+                 {"a doubled quote ends and reopens", u"A='it''s WHERE ' WHERE B", 17},
+                 {"a name in brackets", u"SELECT [No WHERE here] FROM T WHERE A", 30},
+                 {"quote never closed", u"A='x WHERE y", -1},
+                 {"bracket never closed", u"[x WHERE y", -1}});
+}
+
+TEST(WithCondition, KeepsWhatIsThere)
+{
+    struct Row {
+        QString statement;
+        QString expected;
+    };
+    const Row rows[] = {
+        {u"SELECT * FROM T"_s, u"SELECT * FROM T WHERE b=2"_s},
+        {u"SELECT * FROM T ORDER BY c"_s, u"SELECT * FROM T  WHERE b=2 ORDER BY c"_s},
+        {u"SELECT * FROM T WHERE a=1"_s, u"SELECT * FROM T WHERE ( a=1) AND (b=2)"_s},
+        {u"SELECT * FROM T WHERE a=1 ORDER BY c"_s, u"SELECT * FROM T WHERE ( a=1 ) AND (b=2) ORDER BY c"_s},
+        {u"SELECT a FROM T GROUP BY a ORDER BY a"_s, u"SELECT a FROM T  WHERE b=2 GROUP BY a ORDER BY a"_s},
+        {u"SELECT * FROM T WHERE a='ORDER BY %1'"_s, u"SELECT * FROM T WHERE ( a='ORDER BY %1') AND (b=2)"_s},
+        {u"SELECT * FROM T ORDER BY c WHERE a=1"_s, u"SELECT * FROM T ORDER BY c WHERE a=1"_s},
+    };
+    for (const Row& row : rows)
+        EXPECT_EQ(WithCondition(row.statement, u"b=2"_s), row.expected);
+}
+
+TEST(WithOrder, ReplacesTheOrderBefore)
+{
+    EXPECT_EQ(WithOrder(u"SELECT * FROM T  "_s, u"a ASC"_s), u"SELECT * FROM T ORDER BY a ASC"_s);
+    EXPECT_EQ(WithOrder(u"SELECT * FROM T ORDER BY a,b"_s, u"c DESC"_s), u"SELECT * FROM T  ORDER BY c DESC"_s);
+    EXPECT_EQ(WithOrder(u"SELECT [ORDER BY] FROM T"_s, u"c"_s), u"SELECT [ORDER BY] FROM T ORDER BY c"_s);
+}
+
+TEST(WithFields, ReplacesTheSelectListAlone)
+{
+    EXPECT_EQ(WithFields(u"SELECT * FROM T WHERE a=1"_s, {u"A"_s, u"Unit Price"_s}),
+              u"SELECT A,[Unit Price] FROM T WHERE a=1"_s);
+    EXPECT_EQ(WithFields(u"SELECT 'x FROM y', b FROM T"_s, {u"b"_s}), u"SELECT b FROM T"_s);
+}
+
+} // namespace
+} // namespace mirel
