@@ -1,6 +1,7 @@
 #include "platform/user_locale.h"
 
 #include "platform/date_text_reader.h"
+#include "platform/number_text.h"
 #include "platform/ole_date.h"
 
 #include <QDate>
@@ -169,7 +170,8 @@ QString VariantText(const Value& value)
 
 QString NumberText(double number)
 {
-    return QString::number(number == 0 ? 0.0 : number, 'G', 15); // the negative zero is a zero to people
+    const NumberBuffer buffer(number);
+    return QString::fromLatin1(buffer.Text());
 }
 
 } // namespace mirel
