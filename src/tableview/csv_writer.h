@@ -1,0 +1,63 @@
+#pragma once
+
+#include "expr/date_format.h"
+#include "platform/cell.h"
+#include "provider/provider.h"
+
+#include <QByteArray>
+#include <QStringEncoder>
+
+#include <span>
+#include <vector>
+
+class QIODevice;
+
+namespace mirel {
+
+// How an exported file is written. The defaults are those of the export dialog.
+struct CsvExportOptions {
+    QChar separator = u',';
+    bool header = false; // the field names in the first line
+    QChar quote = u'"';  // around every text; null: none
+    DateFormat dates = {DateOrder::Locale, 0, 0};
+    bool doubledQuotes = false;    // a quotation mark inside a text is doubled; else it is written as it is, and
+                                   // a reader of the file must cope with it
+    QByteArray encoding = "UTF-8"; // what it lacks is written as "?"
+};
+
+// Writes records as lines of a CSV file: a text in quotation marks, numbers bare, Yes/No as 1 and 0, NULL and
+// what is no text (binary fields) as nothing, each line ended by CR LF.
+//
+// Collects what it writes and hands it to the device by the megabyte. A failing device makes the writer fail for
+// good; Finish says so. Neither owns the device nor the fields, which must outlive it.
+class CsvWriter {
+public:
+    CsvWriter(QIODevice& device, const CsvExportOptions& options, std::span<const ResultField> fields);
+
+    static bool KnowsEncoding(const QByteArray& name);
+
+    void WriteHeader();
+    // The record's cells in the order of the fields. False once the device has failed.
+    bool WriteRecord(std::span<const Cell> cells);
+    // Writes what is still held back. False when anything could not be written.
+    [[nodiscard]] bool Finish();
+
+private:
+    void AppendText(std::string_view utf8);
+    void AppendDate(std::string_view stored);
+    void AppendCell(const Cell& cell, FieldType type);
+    void EndLine();
+    bool Flush();
+
+    QIODevice& device_;
+    CsvExportOptions options_;
+    std::span<const ResultField> fields_;
+    QByteArray separator_; // in UTF-8
+    QByteArray quote_;     // in UTF-8; empty: none
+    bool plainUtf8_;       // nothing to convert
+    QStringEncoder encoder_;
+    QByteArray pending_;
+    bool ok_ = true;
+};
+
+} // namespace mirel
