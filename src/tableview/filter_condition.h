@@ -2,6 +2,7 @@
 
 #include "platform/field_type.h"
 #include "platform/value.h"
+#include "platform/yes_no_words.h"
 
 #include <QString>
 #include <QStringList>
@@ -9,14 +10,6 @@
 #include <span>
 
 namespace mirel {
-
-// The words of the two values of a Yes/No field, as the user set them.
-struct YesNoWords {
-    QString yes = QStringLiteral("Yes");
-    QString no = QStringLiteral("No");
-
-    friend bool operator==(const YesNoWords&, const YesNoWords&) = default;
-};
 
 enum class CellFilter { BySelection, ExcludingSelection };
 
