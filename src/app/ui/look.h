@@ -1,0 +1,32 @@
+#pragma once
+
+#include <QPalette>
+#include <QProxyStyle>
+#include <QStringView>
+
+namespace mirel {
+
+// The program's own palettes, for those who ask for one; otherwise the desktop's is used.
+QPalette LightPalette();
+QPalette DarkPalette();
+
+// Puts the program into one of them ("light", "dark") on the Fusion style, with our own icons. False, and nothing
+// changed, for any other name.
+bool UsePalette(QStringView name);
+
+// The user's style, with what a finger or a stylus is to hit made large enough for it: 24 pixels, 32 where there
+// is a touch screen.
+class TouchTargetStyle : public QProxyStyle {
+    Q_OBJECT
+public:
+    // Takes the style of that name; empty: the platform's.
+    explicit TouchTargetStyle(const QString& baseStyle);
+
+    QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& contentsSize,
+                           const QWidget* widget) const override;
+
+private:
+    int target_;
+};
+
+} // namespace mirel
