@@ -1,0 +1,34 @@
+#pragma once
+
+#include "data/db_recordset.h"
+#include "platform/user_prompt.h"
+#include "tableview/csv_writer.h"
+
+#include <QStringList>
+
+class QIODevice;
+
+namespace mirel {
+
+struct CsvExportResult {
+    enum class Ending {
+        Complete,
+        Stopped,     // by the user: the records before that are written
+        ReadFailed,  // the recordset's last result says why
+        WriteFailed, // the device's error says why
+    };
+
+    Ending ending = Ending::Complete;
+    qint64 records = 0; // written, the header line not counted
+};
+
+// Writes all records of an open result, in its order, to an open device. The current record stays where it is.
+// `progress` may be null; it counts records.
+CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
+                          Progress* progress);
+
+// The first lines of the file that ExportCsv would write, at most `maxLines`, and a line "....." when there are
+// more records than that.
+QStringList PreviewCsv(DbRecordset& source, const CsvExportOptions& options, int maxLines = 10);
+
+} // namespace mirel
