@@ -39,7 +39,10 @@ public:
     QString Stamp() const { return stamp_; }       // empty: the database could not be written
     QString SideFile() const { return sideFile_; } // empty likewise
     FormStore& Store() { return *store_; }
-    QStringList Favorites() const { return favorites_; }
+    QStringList Favorites() const { return favorites_; } // "table:Birds", "form:…", "query:…"
+    // Written to the favorites file at once. False, and nothing changed, when that fails or the database has no
+    // stamp.
+    bool SetFavorites(const QStringList& favorites);
 
     bool ListTables(QStringList& tables) { return catalog_.ListTables(path_, tables); }
     Catalog& GetCatalog() { return catalog_; }
