@@ -22,7 +22,8 @@ QString FullPath(const QString& path)
 
 bool SameFile(const QString& a, const QString& b)
 {
-    return a == b || (QFileInfo::exists(a) && QFileInfo(a).canonicalFilePath() == QFileInfo(b).canonicalFilePath());
+    return a == b ||
+           (QFileInfo::exists(a) && QFileInfo(a).canonicalFilePath() == QFileInfo(b).canonicalFilePath());
 }
 
 } // namespace
@@ -128,8 +129,10 @@ bool DatabaseSession::Drop(const QString& path)
     if (stamp.isEmpty() || HasKnownCopy(full, stamp))
         return true;
     QFile::remove(SideFilePath(folder_.FormsFolder(), stamp));
-    return ChangeFile(folder_.FavoritesFile(),
-                      [&](const QByteArray& old) { return WithFavorites(old, stamp, {}); });
+    // The database is gone; favourites that stay behind for a while name a stamp that nobody bears.
+    (void)ChangeFile(folder_.FavoritesFile(),
+                     [&](const QByteArray& old) { return WithFavorites(old, stamp, {}); });
+    return true;
 }
 
 bool DatabaseSession::HasKnownCopy(const QString& path, const QString& stamp)
