@@ -83,6 +83,9 @@ PlanResult PlanDatabaseStatement(QStringView statement);
 // The order of `order` as an SQL clause, sort keys by the function kSortKeyFunction; empty without terms.
 QByteArray OrderClause(const std::vector<PlannedOrder>& order);
 
+// How a column appears in a result.
+ResultField ResultFieldOf(const dialect::Table& table, const dialect::Column& column);
+
 // Functions of ours that written SQL uses; the engine registers them on every handle (functions.h).
 inline constexpr const char* kSortKeyFunction = "mirel_sortkey"; // (text) -> blob; NULL stays NULL
 inline constexpr const char* kDateFunction = "mirel_date";       // (any) -> our stored date text, or NULL
