@@ -1,5 +1,6 @@
 #pragma once
 
+#include "app/settings.h"
 #include "data/catalog.h"
 #include "data/db_connection.h"
 #include "forms/form_store.h"
@@ -27,17 +28,20 @@ public:
     // gets one with its first opening; one that cannot be written is opened without stamp and store. False,
     // with nothing open and the reason reported, when the file is no database.
     bool Open(const QString& path);
+    // Results that are open on the database end with it.
     void Close();
-    // CREATE DATABASE, then Open.
+    // CREATE DATABASE, then Open. On failure the current database stays open.
     bool Create(const QString& path);
-    // Removes the database, its side file (unless another known database bears the same stamp) and its
-    // favourites; asks nothing.
+    // Removes the database and with it its side file and its favourites, unless one of the databases opened of
+    // late is a copy and bears the same stamp; asks nothing. On failure all is as it was.
     bool Drop(const QString& path);
 
     bool IsOpen() const { return !path_.isEmpty(); }
     QString Path() const { return path_; }
     QString Stamp() const { return stamp_; }       // empty: the database could not be written
     QString SideFile() const { return sideFile_; } // empty likewise
+    // Forms and queries. Without a path, so that nothing can be saved in it, when there is no side file or it
+    // cannot be read.
     FormStore& Store() { return *store_; }
     QStringList Favorites() const { return favorites_; } // "table:Birds", "form:…", "query:…"
     // Written to the favorites file at once. False, and nothing changed, when that fails or the database has no
@@ -50,8 +54,13 @@ public:
     UserPrompt& Prompt() { return prompt_; }
 
 private:
+    bool FindOrMakeStamp();
+    void LoadStore();
+    bool HasKnownCopy(const QString& path, const QString& stamp);
+
     DbConnection& connection_;
     ProgramFolder folder_;
+    Settings settings_;
     UserPrompt& prompt_;
     Catalog catalog_;
     QString path_;

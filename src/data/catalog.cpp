@@ -49,18 +49,29 @@ bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& sour
 }
 
 // The first column of every row, as text.
-bool ListFirstColumn(DbConnection& connection, UserPrompt& prompt, const QString& source, const QString& database,
-                     QStringList& texts)
+bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& database, QStringList& texts)
 {
-    DbRecordset rows(connection);
-    if (!RunOrReport(prompt, rows, source, database))
+    if (!Run(rows, source, database))
         return false;
     while (!rows.IsEof()) {
         texts += rows.ValueText(0);
-        if (!rows.MoveNext()) {
-            ReportProviderError(prompt, &rows, rows.LastResult());
+        if (!rows.MoveNext())
             return false;
-        }
+    }
+    return true;
+}
+
+bool ReadStamp(DbRecordset& rows, const QString& database, QString& stamp)
+{
+    QStringList names;
+    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSYSTABLES WHERE TableName LIKE 'MirelSys%'"_s, database,
+                         names))
+        return false;
+    names.sort(); // the oldest stamp, should there be several
+    for (const QString& name : std::as_const(names)) {
+        stamp = StampOfTable(name);
+        if (!stamp.isEmpty())
+            break;
     }
     return true;
 }
@@ -77,10 +88,12 @@ QDateTime WallClockNow()
 bool Catalog::ListTables(const QString& database, QStringList& tables)
 {
     tables.clear();
+    DbRecordset rows(connection_);
     QStringList names;
-    if (!ListFirstColumn(connection_, prompt_, u"SELECT TableName FROM MSYSTABLES ORDER BY TableName"_s, database,
-                         names))
+    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSYSTABLES ORDER BY TableName"_s, database, names)) {
+        ReportProviderError(prompt_, &rows, rows.LastResult());
         return false;
+    }
     std::ranges::copy_if(names, std::back_inserter(tables), [](const QString& name) {
         return !IsCatalogTable(name) && StampOfTable(name).isEmpty();
     });
@@ -90,18 +103,18 @@ bool Catalog::ListTables(const QString& database, QStringList& tables)
 bool Catalog::FindDatabaseStamp(const QString& database, QString& stamp)
 {
     stamp.clear();
-    QStringList names;
-    if (!ListFirstColumn(connection_, prompt_,
-                         u"SELECT TableName FROM MSYSTABLES WHERE TableName LIKE "_s + QuoteText(u"MirelSys%"),
-                         database, names))
-        return false;
-    names.sort(); // the oldest stamp, should there be several
-    for (const QString& name : std::as_const(names)) {
-        stamp = StampOfTable(name);
-        if (!stamp.isEmpty())
-            break;
-    }
-    return true;
+    DbRecordset rows(connection_);
+    if (ReadStamp(rows, database, stamp))
+        return true;
+    ReportProviderError(prompt_, &rows, rows.LastResult());
+    return false;
+}
+
+bool Catalog::BearsStamp(const QString& database, const QString& stamp)
+{
+    DbRecordset rows(connection_);
+    QString found;
+    return ReadStamp(rows, database, found) && found == stamp;
 }
 
 bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp)

@@ -26,6 +26,8 @@ public:
     bool ListTables(const QString& database, QStringList& tables);
     // The stamp, empty when the database bears none. False when the statement failed.
     bool FindDatabaseStamp(const QString& database, QString& stamp);
+    // Whether that database bears the stamp. Says nothing when it cannot be read; it then bears none.
+    bool BearsStamp(const QString& database, const QString& stamp);
     // Gives the database a stamp that no file in `folderOfSideFiles` bears yet. Says nothing when it fails:
     // a database that cannot be written is opened without a stamp.
     bool EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp);
