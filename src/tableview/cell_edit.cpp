@@ -1,0 +1,59 @@
+#include "tableview/cell_edit.h"
+
+#include "platform/user_locale.h"
+#include "tableview/cell_text.h"
+
+namespace mirel {
+
+void CellEdit::Load(const Value& value, FieldType type, int size)
+{
+    Unload();
+    type_ = type;
+    size_ = size;
+    if (type == FieldType::YesNo) {
+        kind_ = EditorKind::Check;
+        checked_ = loadedChecked_ = value.Number() != 0;
+        return;
+    }
+    kind_ = type == FieldType::Date ? EditorKind::Date : EditorKind::Text;
+    text_ = loadedText_ = VariantText(value);
+}
+
+bool CellEdit::IsKeptWhole() const
+{
+    return kind_ == EditorKind::Check || mirel::IsKeptWhole(text_, type_, size_);
+}
+
+void CellEdit::SetText(const QString& text)
+{
+    text_ = text;
+    pending_ = true;
+}
+
+void CellEdit::SetChecked(bool checked)
+{
+    checked_ = checked;
+    pending_ = true;
+}
+
+void CellEdit::Clear()
+{
+    if (kind_ == EditorKind::Check)
+        SetChecked(false);
+    else
+        SetText(QString());
+}
+
+void CellEdit::Revert()
+{
+    text_ = loadedText_;
+    checked_ = loadedChecked_;
+    pending_ = false;
+}
+
+Value CellEdit::Stored() const
+{
+    return kind_ == EditorKind::Check ? Value::Bool(checked_) : TypedValue(text_, type_);
+}
+
+} // namespace mirel

@@ -1,0 +1,212 @@
+#pragma once
+
+#include "data/db_recordset.h"
+#include "platform/user_prompt.h"
+#include "tableview/cell_edit.h"
+#include "tableview/record_page.h"
+#include "tableview/table_view_settings.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <optional>
+#include <vector>
+
+namespace mirel {
+
+// The list shows a page of records, a row each; the detail shows one record, a row for each of its fields.
+enum class Presentation { List, Detail };
+
+// One open result as the user walks through it: the page that the grid shows, the selected cell, the editor of
+// its value, the record counter; all that the table view does, without a window.
+//
+// Records and fields count from 0; rows count from 0 within the page. Hidden columns stay in the result.
+//
+// An edit is pending until it is written: by every call that moves, adds, deletes or runs a statement. When that
+// write is refused, the call does nothing and returns false, the edit stays as the user left it, and
+// WriteFailed() holds until ShowWriteError() has told the user why. All other failures are reported through the
+// prompt at once.
+//
+// Connection and prompt must outlive the browser.
+class RecordBrowser {
+public:
+    RecordBrowser(DbConnection& connection, QString database, UserPrompt& prompt, TableViewSettings settings);
+    Q_DISABLE_COPY_MOVE(RecordBrowser)
+
+    // The statement that shows a whole table. Never the bare name: filters are appended to it.
+    static QString StatementOfTable(QStringView table);
+
+    // --- the result -------------------------------------------------------------------------------------
+
+    // Runs `statement`, which becomes the base and the current statement, and shows its first page as a list.
+    // False, with nothing open, when the provider refuses it.
+    bool Open(const QString& statement);
+    // Makes `statement`, a filter or sort put onto the current one, current. When it is refused, the one before
+    // is run again.
+    bool Rewrite(const QString& statement);
+    bool RunAgain(); // the current statement; the selection stays on its position
+    void Close();
+    bool IsOpen() const { return recordset_.IsOpen(); }
+    bool CanUpdate() const { return IsOpen() && recordset_.Lock() != LockType::ReadOnly; }
+    const QString& Statement() const { return statement_; }
+    const QString& BaseStatement() const { return baseStatement_; }
+    const QString& Database() const { return database_; }
+
+    const TableViewSettings& Settings() const { return settings_; }
+    bool ChangeSettings(const TableViewSettings& settings);
+
+    int FieldCount() const { return recordset_.FieldCount(); }
+    QString FieldName(int field) const { return recordset_.FieldName(field); }
+    FieldType TypeOfField(int field) const { return recordset_.TypeOfField(field); }
+
+    // The count, where it is known; CountOn counts on for a while and returns true once it is.
+    std::optional<qint64> KnownCount() const { return count_; }
+    bool CountOn(int budgetMs);
+    bool IsEmpty() const { return count_ == 0; }
+
+    // --- the page ---------------------------------------------------------------------------------------
+
+    const RecordPage& Page() const { return page_; }
+    // Grow whenever the page holds other texts; whenever it has other columns.
+    quint64 PageRevision() const { return pageRevision_; }
+    quint64 ColumnsRevision() const { return columnsRevision_; }
+
+    void SetRowsPerPage(int wholeRows);
+    int RowsPerPage() const { return rowsPerPage_; }
+    // What the vertical scroll bar counts: records in the list, fields in the detail.
+    qint64 ScrollPosition() const;
+    qint64 HighestScrollPosition() const;
+    bool ScrollTo(qint64 position); // out of range positions stop at the end
+    bool ScrollBy(qint64 rows) { return ScrollTo(ScrollPosition() + rows); }
+    // Reads the page again where another program has changed the records since.
+    void TakeUpChanges();
+
+    // --- moving -----------------------------------------------------------------------------------------
+
+    Presentation CurrentPresentation() const { return presentation_; }
+    bool TogglePresentation();
+
+    int SelectedRow() const; // -1: none
+    int SelectedColumn() const;
+    qint64 SelectedRecord() const; // -1: none
+    int SelectedField() const { return selectedField_; }
+    bool SelectCell(int row, int column);
+
+    bool GoToFirst();
+    bool GoToLast();
+    bool GoToNext();
+    bool GoToPrevious();
+    bool GoToRecord(qint64 number); // counts from 1; does nothing when there is no such record
+
+    // The arrow keys and their kin: rows are records in the list, fields in the detail.
+    bool MoveRows(qint64 rows);
+    bool PageDown() { return MovePages(1); }
+    bool PageUp() { return MovePages(-1); }
+    bool MoveColumns(int columns);
+    bool MoveToFirstColumn();
+    bool MoveToLastColumn();
+    // Tab and Shift+Tab: the next cell, and behind the last of a record the first of the next one.
+    bool MoveToNextCell();
+    bool MoveToPreviousCell();
+
+    // "2/10000"; "2/…" while the count is unknown. The second: while the scroll bar is dragged to `position`.
+    QString CounterText() const;
+    QString CounterTextAt(qint64 position) const;
+
+    // --- columns ----------------------------------------------------------------------------------------
+
+    bool CanHideColumn() const;
+    bool CanShowAllColumns() const;
+    bool HideColumn(); // the selected one
+    bool ShowAllColumns();
+    bool IsVisible(int field) const { return visible_[size_t(field)]; }
+
+    // --- the editor of the selected cell ------------------------------------------------------------------
+
+    QString FieldLabel() const; // "Name:"; empty without a selection
+    const CellEdit& Edit() const { return edit_; }
+    bool CanEdit() const;
+    bool HasPendingEdit() const { return edit_.IsPending(); }
+    // Each makes a pending edit; on a cell that cannot be edited it does nothing.
+    void EditText(const QString& text);
+    void EditChecked(bool checked);
+    void ClearCell(); // NULL
+    void InsertCurrentDateTime();
+    void RepeatAbove(); // the value of the same field in the record before
+    void RevertEdit();
+    QString SelectedText() const; // what the cell holds, or would with the pending edit; whole
+
+    [[nodiscard]] bool WriteEdit();
+    bool WriteFailed() const { return writeFailed_; }
+    void ShowWriteError();
+
+    // --- records ------------------------------------------------------------------------------------------
+
+    bool AddRecord();
+    bool DeleteRecord();
+
+private:
+    struct ListState {
+        qint64 topRow = 0;
+        int row = -1;
+    };
+
+    // The result.
+    bool Execute(const QString& statement);
+    void Clear();
+    void TakeUpFields();
+    void RebuildColumns();
+    qint64 Count();
+    void Recount();
+    void ReportFailure();
+
+    // The page.
+    void FillPage();
+    void FillList();
+    void FillDetail();
+    bool ReadRows(qint64 first, int count);
+    void RefreshCell();
+    qint64 HighestTopRow() const;
+    int HighestFieldRow() const;
+    void KeepSelectionInPage();
+
+    // The selection. The recordset stands on the selected record at all times.
+    void LoadEditor();
+    void ShowRecord(qint64 record);
+    bool MoveToRecord(qint64 record); // stops at either end
+    int SelectedFieldOrFirstVisible() const;
+    bool MovePages(int direction);
+    std::vector<int> VisibleFields() const;
+
+    bool IsWritable(int field) const;
+    std::vector<FieldChange> NewRecordValues() const;
+
+    DbRecordset recordset_;
+    UserPrompt& prompt_;
+    QString database_;
+    TableViewSettings settings_;
+    QString baseStatement_;
+    QString statement_;
+    std::optional<qint64> count_;
+    quint64 generation_ = 0; // of the recordset, when count_ was taken
+    QStringList fieldNames_;
+    std::vector<bool> visible_; // a flag a field
+
+    Presentation presentation_ = Presentation::List;
+    RecordPage page_;
+    quint64 pageRevision_ = 0;
+    quint64 columnsRevision_ = 0;
+    int rowsPerPage_ = 1;
+    qint64 topRow_ = 0;
+    int selectedRow_ = -1; // in the list
+    int selectedField_ = -1;
+    qint64 detailRecord_ = -1;
+    int topFieldRow_ = 0;
+    ListState listState_; // while the detail is shown
+
+    CellEdit edit_;
+    bool writeFailed_ = false;
+    QString writeError_;
+};
+
+} // namespace mirel

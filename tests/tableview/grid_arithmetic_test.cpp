@@ -1,0 +1,67 @@
+#include "tableview/column_layout.h"
+#include "tableview/scroll_scale.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace mirel {
+namespace {
+
+TEST(ScrollScale, MeetsBothEndsAtEveryLength)
+{
+    for (const qint64 highest : {qint64(0), qint64(9), qint64(10'000'000), qint64(ScrollScale::kHighestValue),
+                                 qint64(ScrollScale::kHighestValue) + 1, qint64(3'000'000'000'000)}) {
+        const ScrollScale scale(highest);
+        EXPECT_EQ(scale.ValueOf(0), 0) << highest;
+        EXPECT_EQ(scale.ValueOf(highest), scale.HighestValue()) << highest;
+        EXPECT_EQ(scale.PositionOf(scale.HighestValue()), highest) << highest;
+        EXPECT_EQ(scale.PositionOf(0), 0) << highest;
+        EXPECT_LT(scale.HighestValue(), std::numeric_limits<int>::max() - 10'000) << highest;
+    }
+}
+
+TEST(ScrollScale, StaysNearEachPositionOfALongResult)
+{
+    const qint64 highest = 3'000'000'000'000;
+    const ScrollScale scale(highest);
+    for (const qint64 position : {qint64(1), highest / 3, highest / 2, highest - 1})
+        EXPECT_NEAR(double(scale.PositionOf(scale.ValueOf(position))), double(position), 3000) << position;
+}
+
+class Columns : public ::testing::Test {
+protected:
+    Columns()
+    {
+        layout_.Reset(3);
+        for (const int column : {0, 1, 2})
+            layout_.Fit(column, 100 * (column + 1));
+    }
+    ColumnLayout layout_; // edges at 100, 300 and 600
+};
+
+TEST_F(Columns, AreFoundByPlace)
+{
+    EXPECT_EQ(layout_.TotalPx(), 600);
+    EXPECT_EQ(layout_.LeftPx(2), 300);
+    EXPECT_EQ(layout_.ColumnAt(99), 0);
+    EXPECT_EQ(layout_.ColumnAt(100), 1);
+    EXPECT_EQ(layout_.ColumnAt(599), 2);
+    EXPECT_EQ(layout_.ColumnAt(600), -1);
+}
+
+TEST_F(Columns, AreResizedByTheNearestEdgeWithinReach)
+{
+    EXPECT_EQ(layout_.EdgeNear(97, 5), 0);
+    EXPECT_EQ(layout_.EdgeNear(305, 5), 1);
+    EXPECT_EQ(layout_.EdgeNear(306, 5), -1);
+    layout_.SetByHand(0, -50);
+    EXPECT_EQ(layout_.WidthPx(0), ColumnLayout::kNarrowestPx);
+    EXPECT_TRUE(layout_.IsByHand(0));
+    layout_.Fit(0, 80);
+    EXPECT_FALSE(layout_.IsByHand(0));
+    EXPECT_EQ(layout_.LeftPx(1), 80);
+}
+
+} // namespace
+} // namespace mirel
