@@ -1,0 +1,98 @@
+#include "tableview/ui/options_dialog.h"
+
+#include "resources/string_table.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QDialogButtonBox>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QSpinBox>
+#include <QVBoxLayout>
+
+namespace mirel {
+namespace {
+
+constexpr int kMostCharacters = 9999;
+constexpr int kLongestHoldMs = 5000;
+
+} // namespace
+
+COptionsDialog::COptionsDialog(const TableViewSettings& settings, QWidget* parent)
+    : QDialog(parent)
+    , settings_(settings)
+    , confirmDelete_(new QCheckBox(StringText(Str::OptionConfirmDelete), this))
+    , limit_(new QCheckBox(StringText(Str::OptionMaximum), this))
+    , characters_(new QSpinBox(this))
+    , words_(new QComboBox(this))
+    , popup_(new QCheckBox(StringText(Str::OptionHoldPopup), this))
+    , holdMs_(new QSpinBox(this))
+    , sortByHeader_(new QCheckBox(StringText(Str::OptionSortByHeader), this))
+{
+    setWindowTitle(StringText(Str::OptionsTitle));
+    const TableViewSettings defaults;
+    const bool limited = settings.maxColumnChars >= 0;
+    confirmDelete_->setChecked(settings.confirmDelete);
+    limit_->setChecked(limited);
+    characters_->setRange(1, kMostCharacters);
+    characters_->setValue(limited ? settings.maxColumnChars : defaults.maxColumnChars);
+    characters_->setEnabled(limited);
+    words_->setEditable(true);
+    words_->addItems({defaults.words.Setting(), QStringLiteral("True/False"), QStringLiteral("On/Off")});
+    words_->setEditText(settings.words.Setting());
+    popup_->setChecked(settings.holdTimeMs > 0);
+    holdMs_->setRange(1, kLongestHoldMs);
+    holdMs_->setValue(settings.holdTimeMs > 0 ? settings.holdTimeMs : defaults.holdTimeMs);
+    holdMs_->setEnabled(settings.holdTimeMs > 0);
+    sortByHeader_->setChecked(settings.sortByHeader);
+    connect(limit_, &QCheckBox::toggled, characters_, &QWidget::setEnabled);
+    connect(popup_, &QCheckBox::toggled, holdMs_, &QWidget::setEnabled);
+    LayOut();
+}
+
+void COptionsDialog::LayOut()
+{
+    auto* column = new QVBoxLayout(this);
+    column->addWidget(confirmDelete_);
+
+    auto* limitBox = new QGroupBox(StringText(Str::OptionColumnGroup), this);
+    auto* limitRow = new QHBoxLayout(limitBox);
+    limitRow->addWidget(limit_);
+    limitRow->addWidget(characters_);
+    limitRow->addWidget(new QLabel(StringText(Str::OptionCharacters), limitBox), 1);
+    column->addWidget(limitBox);
+
+    auto* wordsLabel = new QLabel(StringText(Str::OptionYesNoWords), this);
+    wordsLabel->setBuddy(words_);
+    column->addWidget(wordsLabel);
+    column->addWidget(words_);
+
+    auto* holdRow = new QHBoxLayout;
+    holdRow->addWidget(popup_);
+    holdRow->addWidget(holdMs_);
+    holdRow->addWidget(new QLabel(StringText(Str::OptionMilliseconds), this), 1);
+    column->addLayout(holdRow);
+    column->addWidget(sortByHeader_);
+
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    column->addStretch(1);
+    column->addWidget(buttons);
+    characters_->setAccessibleName(StringText(Str::OptionColumnGroup));
+    holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup));
+}
+
+TableViewSettings COptionsDialog::Chosen() const
+{
+    TableViewSettings chosen = settings_;
+    chosen.confirmDelete = confirmDelete_->isChecked();
+    chosen.maxColumnChars = limit_->isChecked() ? characters_->value() : TableViewSettings::kNoColumnLimit;
+    chosen.words = YesNoWords::FromSetting(words_->currentText(), settings_.words);
+    chosen.holdTimeMs = popup_->isChecked() ? holdMs_->value() : 0;
+    chosen.sortByHeader = sortByHeader_->isChecked();
+    return chosen;
+}
+
+} // namespace mirel

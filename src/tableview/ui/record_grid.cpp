@@ -1,0 +1,414 @@
+#include "tableview/ui/record_grid.h"
+
+#include "tableview/scroll_scale.h"
+#include "tableview/ui/grid_header.h"
+
+#include <QApplication>
+#include <QGuiApplication>
+#include <QInputDevice>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QScrollBar>
+#include <QScrollPrepareEvent>
+#include <QScroller>
+#include <QStyle>
+#include <QStyleOption>
+
+#include <algorithm>
+
+namespace mirel {
+namespace {
+
+constexpr int kTouchRowPx = 32;
+constexpr int kRowPx = 24; // the smallest row that a stylus hits
+
+bool HasTouchScreen()
+{
+    return std::ranges::any_of(QInputDevice::devices(), [](const QInputDevice* device) {
+        return device->type() == QInputDevice::DeviceType::TouchScreen;
+    });
+}
+
+QColor Blend(const QColor& over, const QColor& under, qreal strength)
+{
+    const auto mix = [strength](float a, float b) { return a * float(strength) + b * float(1 - strength); };
+    return QColor::fromRgbF(mix(over.redF(), under.redF()), mix(over.greenF(), under.greenF()),
+                            mix(over.blueF(), under.blueF()));
+}
+
+bool IsTyped(const QKeyEvent& event)
+{
+    const bool command = event.modifiers() & (Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier);
+    // AltGr comes as both modifiers, and types.
+    const bool altGr = (event.modifiers() & Qt::ControlModifier) && (event.modifiers() & Qt::AltModifier);
+    return (!command || altGr) && !event.text().isEmpty() && event.text().front().isPrint();
+}
+
+} // namespace
+
+RecordGrid::RecordGrid(const RecordBrowser& browser, QWidget* parent)
+    : QAbstractScrollArea(parent)
+    , browser_(browser)
+    , header_(new GridHeader(layout_, browser.Page(), this))
+{
+    setFocusPolicy(Qt::StrongFocus);
+    viewport()->setBackgroundRole(QPalette::Base);
+    verticalScrollBar()->setTracking(false); // a drag shows where it is; only its end reads the page
+    connect(verticalScrollBar(), &QScrollBar::sliderMoved, this, [this](int value) {
+        Q_EMIT thumbDragged(ScrollScale(browser_.HighestScrollPosition()).PositionOf(value));
+    });
+    connect(header_, &GridHeader::columnTapped, this, &RecordGrid::headerTapped);
+    connect(header_, &GridHeader::edgeDoubleTapped, this, &RecordGrid::FitColumn);
+    connect(header_, &GridHeader::widthsChanged, this, [this] {
+        UpdateScrollBars();
+        header_->update();
+        viewport()->update();
+    });
+    QScroller::grabGesture(viewport(), QScroller::TouchGesture);
+    TakeUpFont();
+}
+
+RecordGrid::~RecordGrid() = default;
+
+void RecordGrid::TakeUpFont()
+{
+    text_.emplace(font());
+    marginPx_ = style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, this) + 2;
+    header_->SetMargin(marginPx_);
+    rowHeightPx_ = std::max(text_->LineHeight() + 4, HasTouchScreen() ? kTouchRowPx : kRowPx);
+    PlaceHeader();
+}
+
+void RecordGrid::PlaceHeader()
+{
+    const int height = std::max(header_->sizeHint().height(), kRowPx);
+    setViewportMargins(0, height, 0, 0);
+    header_->setGeometry(viewport()->x(), viewport()->y() - height, viewport()->width(), height);
+}
+
+QSize RecordGrid::minimumSizeHint() const
+{
+    return {rowHeightPx_ * 4, rowHeightPx_ * 4};
+}
+
+QSize RecordGrid::sizeHint() const
+{
+    return {rowHeightPx_ * 30, rowHeightPx_ * 20};
+}
+
+QRect RecordGrid::CellRect(int row, int column) const
+{
+    const int left = layout_.LeftPx(column) - horizontalScrollBar()->value();
+    return {left, row * rowHeightPx_, layout_.WidthPx(column), rowHeightPx_};
+}
+
+// --- what the browser shows ---------------------------------------------------------------------------------
+
+void RecordGrid::ShowState()
+{
+    const bool otherColumns = shownColumns_ != browser_.ColumnsRevision();
+    const int widthBefore = layout_.TotalPx();
+    if (otherColumns) {
+        shownColumns_ = browser_.ColumnsRevision();
+        layout_.Reset(browser_.Page().ColumnCount());
+        shownColumn_ = -1;
+    }
+    if (shownPage_ != browser_.PageRevision() || otherColumns) {
+        shownPage_ = browser_.PageRevision();
+        if (browser_.Settings().autoSizing || otherColumns)
+            FitToContent(otherColumns);
+    }
+    UpdateScrollBars();
+    if (shownColumn_ != browser_.SelectedColumn() || layout_.TotalPx() != widthBefore)
+        ScrollToSelectedColumn();
+    header_->update();
+    viewport()->update();
+}
+
+void RecordGrid::FitAllColumns()
+{
+    FitToContent(true);
+    UpdateScrollBars();
+    header_->update();
+    viewport()->update();
+}
+
+void RecordGrid::FitColumn(int column)
+{
+    if (column < 0 || column >= layout_.Count())
+        return;
+    layout_.Fit(column, ContentWidth(column));
+    UpdateScrollBars();
+    header_->update();
+    viewport()->update();
+}
+
+void RecordGrid::FitToContent(bool alsoByHand)
+{
+    for (int column = 0; column < layout_.Count(); ++column) {
+        if (alsoByHand || !layout_.IsByHand(column))
+            layout_.Fit(column, ContentWidth(column));
+    }
+    StretchLastColumn();
+}
+
+// No wider than the view, so that a whole column can always be seen at once.
+int RecordGrid::ContentWidth(int column) const
+{
+    const RecordPage& page = browser_.Page();
+    int width = header_->WidthFor(page.columns[size_t(column)].title);
+    for (int row = 0; row < page.RowCount(); ++row)
+        width = std::max(width, text_->WidthOf(page.At(row, column).text) + 2 * marginPx_ + 1);
+    return std::min(width, std::max(viewport()->width(), ColumnLayout::kNarrowestPx));
+}
+
+// The values of a single record take the room that the names leave.
+void RecordGrid::StretchLastColumn()
+{
+    const int last = layout_.Count() - 1;
+    if (browser_.CurrentPresentation() == Presentation::Detail && last > 0)
+        layout_.Fit(last, std::max(layout_.WidthPx(last), viewport()->width() - layout_.LeftPx(last)));
+}
+
+void RecordGrid::UpdateScrollBars()
+{
+    syncing_ = true;
+    const ScrollScale scale(browser_.HighestScrollPosition());
+    QScrollBar* bar = verticalScrollBar();
+    bar->setRange(0, scale.HighestValue());
+    bar->setPageStep(browser_.RowsPerPage());
+    if (!bar->isSliderDown())
+        bar->setValue(scale.ValueOf(browser_.ScrollPosition()));
+    horizontalScrollBar()->setRange(0, std::max(layout_.TotalPx() - viewport()->width(), 0));
+    horizontalScrollBar()->setPageStep(viewport()->width());
+    horizontalScrollBar()->setSingleStep(rowHeightPx_);
+    header_->SetOffset(horizontalScrollBar()->value());
+    syncing_ = false;
+}
+
+void RecordGrid::ScrollToSelectedColumn()
+{
+    shownColumn_ = browser_.SelectedColumn();
+    if (shownColumn_ < 0)
+        return;
+    QScrollBar* bar = horizontalScrollBar();
+    const int left = layout_.LeftPx(shownColumn_);
+    const int right = left + layout_.WidthPx(shownColumn_);
+    if (right > bar->value() + viewport()->width())
+        bar->setValue(right - viewport()->width());
+    if (left < bar->value())
+        bar->setValue(left);
+}
+
+// --- painting -----------------------------------------------------------------------------------------------
+
+void RecordGrid::paintEvent(QPaintEvent* event)
+{
+    QPainter painter(viewport());
+    painter.setFont(font());
+    const RecordPage& page = browser_.Page();
+    for (int row = 0; row < page.RowCount(); ++row)
+        PaintRow(painter, row, event->rect());
+    PaintGridLines(painter, event->rect());
+    PaintSelection(painter);
+}
+
+void RecordGrid::PaintRow(QPainter& painter, int row, const QRect& dirty)
+{
+    const QRect band(0, row * rowHeightPx_, viewport()->width(), rowHeightPx_);
+    if (!band.intersects(dirty))
+        return;
+    if (row == browser_.SelectedRow()) {
+        const QRect filled = band.intersected(QRect(0, 0, CellRect(row, layout_.Count() - 1).right(), height()));
+        painter.fillRect(filled,
+                         Blend(palette().color(QPalette::Highlight), palette().color(QPalette::Base), 0.2));
+    }
+    for (int column = 0; column < layout_.Count(); ++column) {
+        const QRect rect = CellRect(row, column);
+        if (rect.intersects(dirty))
+            PaintCell(painter, row, column, rect);
+    }
+}
+
+void RecordGrid::PaintCell(QPainter& painter, int row, int column, const QRect& rect)
+{
+    const bool edited =
+        browser_.HasPendingEdit() && row == browser_.SelectedRow() && column == browser_.SelectedColumn();
+    const PageCell& cell = browser_.Page().At(row, column);
+    const bool right = browser_.Page().columns[size_t(column)].rightAligned;
+    const QRect inner = rect.adjusted(marginPx_, 0, -marginPx_ - 1, 0);
+    if (cell.isNull && !edited) {
+        const int dash = text_->LineHeight() / 2;
+        painter.setPen(palette().color(QPalette::PlaceholderText));
+        painter.drawLine(right ? inner.right() - dash : inner.left(), inner.center().y(),
+                         right ? inner.right() : inner.left() + dash, inner.center().y());
+        return;
+    }
+    const bool isName = browser_.Page().columns[size_t(column)].field < 0 && column == 0 &&
+                        browser_.CurrentPresentation() == Presentation::Detail;
+    painter.setPen(palette().color(isName ? QPalette::PlaceholderText : QPalette::Text));
+    text_->Draw(painter, inner, LinePainter::SingleLine(edited ? browser_.SelectedText() : cell.text),
+                right ? Qt::AlignRight : Qt::AlignLeft);
+}
+
+void RecordGrid::PaintGridLines(QPainter& painter, const QRect& dirty) const
+{
+    QStyleOption option;
+    option.initFrom(this);
+    const int hint = style()->styleHint(QStyle::SH_Table_GridLineColor, &option, this);
+    painter.setPen(QColor::fromRgb(QRgb(hint)));
+    const int bottom = browser_.Page().RowCount() * rowHeightPx_ - 1;
+    const int right = layout_.TotalPx() - horizontalScrollBar()->value() - 1;
+    for (int y = rowHeightPx_ - 1; y <= std::min(bottom, dirty.bottom()); y += rowHeightPx_)
+        painter.drawLine(0, y, right, y);
+    if (bottom < 0)
+        return;
+    int x = -horizontalScrollBar()->value() - 1;
+    for (int column = 0; column < layout_.Count(); ++column) {
+        x += layout_.WidthPx(column);
+        if (x >= dirty.left() && x <= dirty.right())
+            painter.drawLine(x, 0, x, bottom);
+    }
+}
+
+void RecordGrid::PaintSelection(QPainter& painter) const
+{
+    const int row = browser_.SelectedRow();
+    const int column = browser_.SelectedColumn();
+    if (row < 0 || column < 0)
+        return;
+    QPen pen(palette().color(QPalette::Highlight), 2);
+    pen.setJoinStyle(Qt::MiterJoin);
+    painter.setPen(pen);
+    painter.setBrush(Qt::NoBrush);
+    painter.drawRect(CellRect(row, column).adjusted(1, 1, -2, -2));
+}
+
+// --- the user -----------------------------------------------------------------------------------------------
+
+void RecordGrid::resizeEvent(QResizeEvent*)
+{
+    PlaceHeader();
+    const int rows = std::max(viewport()->height() / rowHeightPx_, 1);
+    if (rows != browser_.RowsPerPage())
+        Q_EMIT rowsPerPageChanged(rows);
+    if (browser_.Settings().autoSizing)
+        FitToContent(false);
+    UpdateScrollBars();
+}
+
+void RecordGrid::changeEvent(QEvent* event)
+{
+    QAbstractScrollArea::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
+        TakeUpFont();
+        resizeEvent(nullptr);
+    }
+}
+
+void RecordGrid::keyPressEvent(QKeyEvent* event)
+{
+    if (const std::optional<TableCommand> command = CommandOfKey(KeyPlace::Grid, event->keyCombination()))
+        Q_EMIT commandRequested(*command);
+    else if (IsTyped(*event))
+        Q_EMIT textTyped(event->text());
+    else
+        event->ignore();
+}
+
+bool RecordGrid::PressCell(const QPoint& position)
+{
+    const int row = RowAt(position.y());
+    const int column = layout_.ColumnAt(position.x() + horizontalScrollBar()->value());
+    if (row < 0 || row >= browser_.Page().RowCount() || column < 0)
+        return false;
+    Q_EMIT cellPressed(row, column);
+    return true;
+}
+
+void RecordGrid::mousePressEvent(QMouseEvent* event)
+{
+    const QPoint at = event->position().toPoint();
+    if (!PressCell(at) || event->button() != Qt::LeftButton || browser_.Settings().holdTimeMs <= 0)
+        return;
+    holdAt_ = at;
+    hold_.start(browser_.Settings().holdTimeMs, this);
+}
+
+void RecordGrid::mouseMoveEvent(QMouseEvent* event)
+{
+    if ((event->position().toPoint() - holdAt_).manhattanLength() >= QApplication::startDragDistance())
+        hold_.stop();
+}
+
+void RecordGrid::mouseReleaseEvent(QMouseEvent*)
+{
+    hold_.stop();
+}
+
+void RecordGrid::mouseDoubleClickEvent(QMouseEvent* event)
+{
+    hold_.stop();
+    const QPoint at = event->position().toPoint();
+    if (event->button() == Qt::LeftButton && PressCell(at))
+        Q_EMIT cellDoubleTapped();
+}
+
+void RecordGrid::contextMenuEvent(QContextMenuEvent* event)
+{
+    QPoint at = event->globalPos();
+    if (event->reason() == QContextMenuEvent::Keyboard && browser_.SelectedRow() >= 0) {
+        const QRect cell = CellRect(browser_.SelectedRow(), std::max(browser_.SelectedColumn(), 0));
+        at = viewport()->mapToGlobal(cell.intersected(viewport()->rect()).bottomLeft());
+    }
+    Q_EMIT popupRequested(at);
+}
+
+void RecordGrid::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != hold_.timerId()) {
+        QAbstractScrollArea::timerEvent(event);
+        return;
+    }
+    hold_.stop();
+    Q_EMIT popupRequested(viewport()->mapToGlobal(holdAt_));
+}
+
+void RecordGrid::scrollContentsBy(int dx, int)
+{
+    if (syncing_)
+        return;
+    if (dx != 0) {
+        header_->SetOffset(horizontalScrollBar()->value());
+        viewport()->update();
+    }
+    const qint64 position = ScrollScale(browser_.HighestScrollPosition()).PositionOf(verticalScrollBar()->value());
+    if (position != browser_.ScrollPosition())
+        Q_EMIT scrollRequested(position);
+}
+
+// A finger moves the rows with it: its pixels are rows of the result, not steps of the bar.
+bool RecordGrid::viewportEvent(QEvent* event)
+{
+    if (event->type() == QEvent::ScrollPrepare) {
+        auto* prepare = static_cast<QScrollPrepareEvent*>(event);
+        prepare->setViewportSize(viewport()->size());
+        prepare->setContentPosRange(QRectF(0, 0, horizontalScrollBar()->maximum(),
+                                           double(browser_.HighestScrollPosition()) * rowHeightPx_));
+        prepare->setContentPos(
+            QPointF(horizontalScrollBar()->value(), double(browser_.ScrollPosition()) * rowHeightPx_));
+        prepare->accept();
+        return true;
+    }
+    if (event->type() == QEvent::Scroll) {
+        hold_.stop();
+        const auto* scroll = static_cast<QScrollEvent*>(event);
+        horizontalScrollBar()->setValue(int(scroll->contentPos().x()));
+        Q_EMIT scrollRequested(qint64(scroll->contentPos().y() / rowHeightPx_));
+        return true;
+    }
+    return QAbstractScrollArea::viewportEvent(event);
+}
+
+} // namespace mirel

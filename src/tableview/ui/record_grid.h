@@ -1,0 +1,93 @@
+#pragma once
+
+#include "tableview/column_layout.h"
+#include "tableview/record_browser.h"
+#include "tableview/ui/line_painter.h"
+#include "tableview/ui/table_command.h"
+
+#include <QAbstractScrollArea>
+#include <QBasicTimer>
+
+#include <optional>
+
+namespace mirel {
+
+class GridHeader;
+
+// Draws the browser's page with its selection, and turns keys, taps, the wheel and its scroll bars into
+// requests. It changes nothing by itself: whoever answers the requests calls ShowState afterwards.
+//
+// The vertical scroll bar counts the whole result, in rows. The browser must outlive the grid.
+class RecordGrid : public QAbstractScrollArea {
+    Q_OBJECT
+
+public:
+    RecordGrid(const RecordBrowser& browser, QWidget* parent);
+    ~RecordGrid() override;
+
+    // Takes up page, columns and selection as they are now.
+    void ShowState();
+    void FitAllColumns();
+    void FitColumn(int column);
+    QRect CellRect(int row, int column) const; // in the viewport
+
+    QSize minimumSizeHint() const override;
+    QSize sizeHint() const override;
+
+Q_SIGNALS:
+    void commandRequested(TableCommand command);
+    void textTyped(const QString& text);
+    void cellPressed(int row, int column);
+    void cellDoubleTapped();
+    void popupRequested(const QPoint& globalPosition);
+    void headerTapped(int column);
+    void scrollRequested(qint64 position);
+    void thumbDragged(qint64 position);
+    void rowsPerPageChanged(int wholeRows);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+    void scrollContentsBy(int dx, int dy) override;
+    bool viewportEvent(QEvent* event) override;
+    bool focusNextPrevChild(bool) override { return false; } // Tab walks through the cells
+
+private:
+    void TakeUpFont();
+    void PlaceHeader();
+    void FitToContent(bool alsoByHand);
+    int ContentWidth(int column) const;
+    void StretchLastColumn();
+    void UpdateScrollBars();
+    void ScrollToSelectedColumn();
+    int RowAt(int y) const { return rowHeightPx_ > 0 ? y / rowHeightPx_ : -1; }
+    bool PressCell(const QPoint& position); // false: there is none
+
+    void PaintRow(QPainter& painter, int row, const QRect& dirty);
+    void PaintCell(QPainter& painter, int row, int column, const QRect& rect);
+    void PaintGridLines(QPainter& painter, const QRect& dirty) const;
+    void PaintSelection(QPainter& painter) const;
+
+    const RecordBrowser& browser_;
+    ColumnLayout layout_;
+    GridHeader* header_;
+    std::optional<LinePainter> text_; // for the widget's font
+    int rowHeightPx_ = 0;
+    int marginPx_ = 4;
+    quint64 shownPage_ = 0;
+    quint64 shownColumns_ = 0;
+    int shownColumn_ = -1;
+    bool syncing_ = false;
+    QBasicTimer hold_;
+    QPoint holdAt_;
+};
+
+} // namespace mirel

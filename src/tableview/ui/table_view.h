@@ -1,0 +1,89 @@
+#pragma once
+
+#include "tableview/record_browser.h"
+#include "tableview/ui/table_command.h"
+
+#include <QHash>
+#include <QMainWindow>
+#include <QTimer>
+
+class QAction;
+class QMenu;
+class QPlainTextEdit;
+class QStackedWidget;
+
+namespace mirel {
+
+class CellStrip;
+class NavigationRow;
+class RecordGrid;
+
+// The window over one open result: the grid, the editor of the selected cell under it, the buttons that walk
+// through the records. It shows what its record browser holds and hands it what the user does.
+//
+// Connection and prompt must outlive the window.
+class CTableView : public QMainWindow {
+    Q_OBJECT
+
+public:
+    CTableView(DbConnection& connection, const QString& database, UserPrompt& prompt,
+               const TableViewSettings& settings, QWidget* parent = nullptr);
+    ~CTableView() override;
+
+    // Each shows its result from the first record on; false when the provider refuses it, which the prompt has
+    // then told.
+    bool OpenTable(const QString& table);
+    bool OpenStatement(const QString& title, const QString& statement);
+
+    const RecordBrowser& Browser() const { return browser_; }
+
+Q_SIGNALS:
+    // The user has confirmed other options; they are in force already.
+    void settingsChanged(const TableViewSettings& settings);
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    void LayOut();
+    void CreateActions();
+    void CreateMenus();
+    void FillMenu(QMenu* menu, std::span<const TableCommand> commands);
+    void ConnectParts();
+
+    void Do(TableCommand command);
+    bool Run(bool (*call)(RecordBrowser&)) { return Settle(call(browser_)); }
+    // After every call of the browser: shows what it holds now. When a write was refused, the user is told why
+    // once the event that led here is over, and stays in the editor. Gives `done` back.
+    bool Settle(bool done);
+    void ShowState();
+    void ShowZoom();
+    void ShowActions();
+
+    void Edit(const QString* typed); // null: as the cell is
+    void Revert();
+    void Copy();
+    void Paste();
+    void GoTo();
+    void ChooseOptions();
+    void FocusNextPane();
+    void ToggleZoom();
+    void ShowPopup(const QPoint& globalPosition);
+    QAction* ActionOf(TableCommand command) const { return actions_.value(command); }
+
+    RecordBrowser browser_;
+    UserPrompt& prompt_;
+    QString title_;
+    QHash<TableCommand, QAction*> actions_;
+    QStackedWidget* stack_;
+    RecordGrid* grid_;
+    QPlainTextEdit* zoomEdit_;
+    CellStrip* strip_;
+    NavigationRow* navigation_ = nullptr;
+    QTimer countTimer_;
+    bool zoomed_ = false;
+    bool showing_ = false;
+};
+
+} // namespace mirel
