@@ -45,6 +45,12 @@ public:
     qint32 ToInt() const; // SmallInt, Integer and Bool
     bool ToBool() const;
     QString ToText() const;
+    // The text without taking a share in it; good as long as the value stays what it is.
+    QStringView TextView() const
+    {
+        const auto* text = std::get_if<QString>(&content_);
+        return text ? QStringView(*text) : QStringView();
+    }
     QByteArray ToBinary() const;
 
     friend bool operator==(const Value&, const Value&) = default;
