@@ -1,0 +1,79 @@
+#pragma once
+
+#include "expr/evaluator.h"
+
+#include <cmath>
+#include <optional>
+
+namespace mirel {
+
+// One run over a tree; for the operators and functions of the language only.
+//
+// The texts that a run makes are limited all together, so that no expression, however it nests REPLACE, can use
+// up the memory: what goes beyond is null.
+struct Evaluation {
+    EvalContext& context;
+    qint64 unitsLeft = qint64(1) << 26; // UTF-16 units
+
+    bool Afford(qsizetype units)
+    {
+        unitsLeft -= units;
+        return unitsLeft >= 0;
+    }
+};
+
+using Evaluator = void (*)(ExprNode& node, Evaluation& evaluation);
+
+inline void Evaluate(ExprNode& node, Evaluation& evaluation)
+{
+    if (node.evaluate)
+        node.evaluate(node, evaluation);
+}
+
+// Whether an evaluated node holds where a condition is wanted: a number other than 0.
+inline bool Holds(const ExprNode& node)
+{
+    if (node.null || node.isText)
+        return false;
+    const bool holds = node.valueNumber != 0;
+    return node.kind == NodeKind::Condition ? holds : holds != node.negated;
+}
+
+inline void SetNull(ExprNode& node)
+{
+    node.null = true;
+    node.fieldType = FieldType::None;
+}
+
+// What is no number, or beyond all numbers, is null.
+inline void SetNumber(ExprNode& node, double number)
+{
+    node.null = !std::isfinite(number);
+    node.isText = false;
+    node.fieldType = FieldType::None;
+    node.valueNumber = number + 0.0; // -0 becomes 0
+}
+
+// `text` must outlive the evaluation.
+inline void SetText(ExprNode& node, QStringView text)
+{
+    node.null = false;
+    node.isText = true;
+    node.dateTextDue = false;
+    node.fieldType = FieldType::None;
+    node.valueNumber = 0;
+    node.valueText = text;
+}
+
+// Null for days outside of the calendar.
+void SetDate(ExprNode& node, std::optional<double> oleDays);
+
+// Lends the node its buffer with `units` units of room to write to; null, and the node null, when the run cannot
+// afford it. KeepBuffer makes what was written the node's value.
+QString* StartBuffer(ExprNode& node, Evaluation& evaluation, qsizetype units);
+void KeepBuffer(ExprNode& node);
+
+// The same with the text of an evaluated child in the buffer: moved from there where the child made it itself.
+QString* TakeText(ExprNode& node, ExprNode& child, Evaluation& evaluation);
+
+} // namespace mirel

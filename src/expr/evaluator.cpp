@@ -1,0 +1,206 @@
+#include "expr/evaluator.h"
+
+#include "expr/evaluation.h"
+#include "expr/expr_number.h"
+#include "expr/operators.h"
+#include "platform/ole_date.h"
+#include "platform/user_locale.h"
+
+#include <atomic>
+
+namespace mirel {
+namespace {
+
+void ResolveColumn(ExprNode& node, EvalContext& context)
+{
+    node.column = context.FindColumn(node.text);
+    node.columnType = node.column < 0 ? FieldType::None : context.TypeOfColumn(node.column);
+    node.columnsId = context.ColumnsId();
+}
+
+// A column whose type nobody knows takes the type of what it holds.
+FieldType TypeToRead(FieldType columnType, const Value& value)
+{
+    if (columnType != FieldType::None)
+        return columnType;
+    switch (value.Tag()) {
+    case ValueTag::SmallInt:
+    case ValueTag::Integer:
+        return FieldType::Integer;
+    case ValueTag::Double:
+        return FieldType::Double;
+    case ValueTag::Date:
+        return FieldType::Date;
+    case ValueTag::Bool:
+        return FieldType::YesNo;
+    case ValueTag::Text:
+        return FieldType::Text;
+    case ValueTag::Binary:
+    case ValueTag::Empty:
+    case ValueTag::Null:
+        break;
+    }
+    return FieldType::None;
+}
+
+void ReadField(ExprNode& node, const Value& value, EvalContext& context)
+{
+    switch (TypeToRead(node.columnType, value)) {
+    case FieldType::SmallInt:
+    case FieldType::Integer:
+    case FieldType::Double:
+        SetNumber(node, value.Number());
+        return;
+    case FieldType::Date:
+        SetDate(node, value.Number());
+        return;
+    case FieldType::YesNo: {
+        const bool truth = value.Number() != 0;
+        SetText(node, context.YesNoWord(truth));
+        node.valueNumber = truth ? 1 : 0;
+        return;
+    }
+    case FieldType::Text:
+    case FieldType::Memo:
+        SetText(node, value.TextView());
+        return;
+    case FieldType::None:
+    case FieldType::VarBinary:
+    case FieldType::LongBinary:
+        node.buffer = VariantText(value);
+        KeepBuffer(node);
+        return;
+    }
+}
+
+// A control's text counts as a number when it is made of digits with at most one point and a leading minus.
+bool LooksLikeNumber(QStringView text)
+{
+    if (text.startsWith(u'-'))
+        text = text.sliced(1);
+    int digits = 0;
+    int points = 0;
+    for (const QChar c : text) {
+        if (c >= u'0' && c <= u'9')
+            ++digits;
+        else if (c != u'.' || ++points > 1)
+            return false;
+    }
+    return digits > 0;
+}
+
+QStringView WithoutQuotes(QStringView text)
+{
+    const bool quoted = text.size() >= 2 && (text.front() == u'\'' || text.front() == u'"');
+    return quoted && text.back() == text.front() ? text.sliced(1, text.size() - 2) : text;
+}
+
+} // namespace
+
+void EvalContext::ColumnsChanged()
+{
+    static std::atomic<quint64> last = 0;
+    columnsId_ = ++last;
+}
+
+void EvaluateField(ExprNode& node, Evaluation& evaluation)
+{
+    EvalContext& context = evaluation.context;
+    if (node.columnsId != context.ColumnsId())
+        ResolveColumn(node, context);
+    if (node.column < 0) {
+        SetText(node, {}); // an unknown name is an empty text, but with no record there is no value at all
+        node.null = context.Position() < 0 && context.RecordCount() == 0;
+        return;
+    }
+    const Value& value = context.FieldValue(node.column);
+    if (value.IsNull())
+        SetNull(node);
+    else
+        ReadField(node, value, context);
+    node.fieldType = node.columnType;
+}
+
+void EvaluateControl(ExprNode& node, Evaluation& evaluation)
+{
+    node.buffer = evaluation.context.ControlText(node.text);
+    const QStringView text = TrimmedSpaces(node.buffer);
+    if (LooksLikeNumber(text))
+        SetNumber(node, LeadingDecimal(text));
+    else
+        SetText(node, WithoutQuotes(text));
+}
+
+bool EvaluateExpression(EvalContext& context, ExprNode& root)
+{
+    context.BeginEvaluation();
+    Evaluation evaluation{context};
+    Evaluate(root, evaluation);
+    TextOf(root);
+    if (root.kind != NodeKind::Condition)
+        return false;
+    return root.code == OpCode::Where ? !root.suppressed : Holds(root);
+}
+
+QStringView TextOf(ExprNode& node)
+{
+    if (!node.isText || node.null)
+        return {};
+    if (node.dateTextDue) {
+        node.buffer = UserLocale::Current().DateTimeText(node.valueNumber);
+        node.valueText = node.buffer;
+        node.dateTextDue = false;
+    }
+    return node.valueText;
+}
+
+QString ShownText(ExprNode& node)
+{
+    if (node.null || node.suppressed)
+        return {};
+    return node.isText ? TextOf(node).toString() : ExprNumberText(node.valueNumber);
+}
+
+void SetDate(ExprNode& node, std::optional<double> oleDays)
+{
+    if (!oleDays || !PartsOfOleDate(*oleDays)) {
+        SetNull(node);
+        return;
+    }
+    SetText(node, {});
+    node.valueNumber = *oleDays;
+    node.fieldType = FieldType::Date;
+    node.dateTextDue = true; // most dates are only compared or counted: their text is slow to make
+}
+
+QString* StartBuffer(ExprNode& node, Evaluation& evaluation, qsizetype units)
+{
+    if (!evaluation.Afford(units)) {
+        SetNull(node);
+        return nullptr;
+    }
+    node.buffer.resize(0);
+    node.buffer.reserve(units);
+    return &node.buffer;
+}
+
+void KeepBuffer(ExprNode& node)
+{
+    SetText(node, node.buffer);
+}
+
+QString* TakeText(ExprNode& node, ExprNode& child, Evaluation& evaluation)
+{
+    const QStringView text = TextOf(child);
+    const bool ownsIt = text.data() == child.buffer.constData() && text.size() == child.buffer.size();
+    if (child.evaluate && ownsIt) {
+        node.buffer.swap(child.buffer);
+        return &node.buffer;
+    }
+    QString* buffer = StartBuffer(node, evaluation, text.size());
+    if (buffer)
+        buffer->append(text);
+    return buffer;
+}
+
+} // namespace mirel

@@ -1,0 +1,128 @@
+#include "expr/expr_number.h"
+
+#include <QVarLengthArray>
+
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdlib>
+#include <limits>
+
+#include <locale.h>
+
+namespace mirel {
+namespace {
+
+bool IsDigit(QChar c)
+{
+    return c >= u'0' && c <= u'9';
+}
+
+// Collects the characters of a decimal number off the front of a text.
+class DecimalCollector {
+public:
+    explicit DecimalCollector(QStringView text)
+        : rest_(text)
+    {
+    }
+
+    // Sign, digits with at most one point, exponent; false when there is no digit.
+    bool Collect()
+    {
+        while (!rest_.isEmpty() && rest_.front().isSpace())
+            rest_ = rest_.sliced(1);
+        if (!Take(u'-') && rest_.startsWith(u'+'))
+            rest_ = rest_.sliced(1);
+        qsizetype digits = Digits();
+        if (Take(u'.'))
+            digits += Digits();
+        if (digits > 0)
+            Exponent();
+        return digits > 0;
+    }
+
+    const char* Begin() const { return characters_.constData(); }
+    const char* End() const { return characters_.constData() + characters_.size(); }
+    const char* Terminated()
+    {
+        characters_.append('\0');
+        return Begin();
+    }
+
+private:
+    bool Take(QChar wanted)
+    {
+        if (!rest_.startsWith(wanted))
+            return false;
+        characters_.append(wanted.toLatin1());
+        rest_ = rest_.sliced(1);
+        return true;
+    }
+    qsizetype Digits()
+    {
+        const qsizetype before = characters_.size();
+        while (!rest_.isEmpty() && IsDigit(rest_.front()))
+            Take(rest_.front());
+        return characters_.size() - before;
+    }
+    // An "e" that no number follows is not part of the number.
+    void Exponent()
+    {
+        const qsizetype before = characters_.size();
+        if (!Take(u'e') && !Take(u'E'))
+            return;
+        if (!Take(u'-') && rest_.startsWith(u'+'))
+            rest_ = rest_.sliced(1);
+        if (Digits() == 0)
+            characters_.resize(before);
+    }
+
+    QStringView rest_;
+    QVarLengthArray<char, 64> characters_;
+};
+
+} // namespace
+
+void AppendExprNumber(QString& out, double number)
+{
+    std::array<char, 320> characters; // the largest double has 309 digits before the point
+    const bool whole = number == std::trunc(number);
+    const auto written =
+        std::to_chars(characters.begin(), characters.end(), number + 0.0, std::chars_format::fixed, whole ? 0 : 6);
+    const char* end = written.ptr;
+    while (!whole && end[-1] == '0')
+        --end;
+    out += QLatin1StringView(characters.data(), end - characters.data());
+}
+
+QString ExprNumberText(double number)
+{
+    QString text;
+    AppendExprNumber(text, number);
+    return text;
+}
+
+double LeadingDecimal(QStringView text)
+{
+    DecimalCollector decimal(text);
+    if (!decimal.Collect())
+        return 0;
+    double number = 0;
+    if (std::from_chars(decimal.Begin(), decimal.End(), number).ec == std::errc())
+        return number;
+    // Out of range; from_chars does not say on which side.
+    static const locale_t kPointAsPoint = newlocale(LC_NUMERIC_MASK, "C", nullptr);
+    return strtod_l(decimal.Terminated(), nullptr, kPointAsPoint);
+}
+
+qint32 ToInt32(double number)
+{
+    using Limits = std::numeric_limits<qint32>;
+    if (std::isnan(number))
+        return 0;
+    if (number <= Limits::min())
+        return Limits::min();
+    return number >= Limits::max() ? Limits::max() : qint32(number);
+}
+
+} // namespace mirel

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "expr/evaluation.h"
+
+#include <string_view>
+
+namespace mirel {
+
+// An operator, or a word of conditions. Words are in upper case.
+struct OperatorDef {
+    std::u16string_view text;
+    NodeKind kind;
+    OpCode code;
+    Evaluator evaluate;
+};
+
+// By the spelling in any case; null: there is none.
+const OperatorDef* FindArithmeticOperator(QStringView token);
+const OperatorDef* FindConditionWord(QStringView token);
+
+// How operands and functions are evaluated.
+void EvaluateField(ExprNode& node, Evaluation& evaluation);
+void EvaluateControl(ExprNode& node, Evaluation& evaluation);
+void EvaluateFunction(ExprNode& node, Evaluation& evaluation);
+
+// Whether `token` is `word`, which is in upper case, without regard to the case of ASCII letters.
+bool IsWord(QStringView token, std::u16string_view word);
+
+// Without the spaces at both ends; of all white space only they count as blanks in names and control texts.
+QStringView TrimmedSpaces(QStringView text);
+
+} // namespace mirel
