@@ -146,6 +146,8 @@ Token Lexer::Number(Token token)
 Token Lexer::SymbolToken(Token token)
 {
     const QStringView rest = statement_.sliced(position_);
+    if (rest.startsWith(u"--") || rest.startsWith(u"/*")) // comments: refused, and never taken for two signs
+        return Finish(token, TokenKind::Fault, position_ + 2);
     for (const SymbolRow& row : kSymbols) {
         if (rest.startsWith(row.spelling)) {
             token.symbol = row.symbol;

@@ -13,7 +13,7 @@ enum class TokenKind : quint8 {
     Text,          // 'O''Brien' or "so"
     Number,
     Symbol,
-    Fault, // a quote or bracket never closed, a character that begins nothing
+    Fault, // a quote or bracket never closed, a comment, a character that begins nothing
 };
 
 enum class Symbol : quint8 {

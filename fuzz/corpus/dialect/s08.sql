@@ -1,0 +1,1 @@
+SELECT Tablea FROM MSYSTABLES WHERE Tablea LIKE 'MirelSys%'

@@ -1,0 +1,1 @@
+SELECT * FROM T WHERE ( b=1) AND (a LIKE '%x%') ORDER BY T.a ,T.b DESC 

@@ -1,0 +1,1 @@
+SELECT a, Price*2 AS Twice, d FROM T WHERE d >= '7/4/2001' AND y IS TRUE

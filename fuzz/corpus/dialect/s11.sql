@@ -1,0 +1,1 @@
+SELECT * FROM T INNER JOIN U ON T.a = U.Item WHERE U.b > 3

@@ -1,0 +1,1 @@
+SELECT COUNT(DISTINCT a), SUM(b), AVG(Price), MAX(d) FROM T

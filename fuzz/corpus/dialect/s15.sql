@@ -1,0 +1,1 @@
+INSERT INTO T (a,b,d,y) VALUES('O''Brien',5,'2001-07-04 10:00',TRUE)

@@ -1,0 +1,1 @@
+INSERT INTO [U] [(U.Item,[Ship To])] VALUES('a',"b ""c""")

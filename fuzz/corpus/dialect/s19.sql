@@ -1,0 +1,1 @@
+INSERT INTO T (d) VALUES('abc')

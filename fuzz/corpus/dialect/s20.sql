@@ -1,0 +1,1 @@
+INSERT INTO T (a,name) VALUES('a','b')

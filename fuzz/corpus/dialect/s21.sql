@@ -1,0 +1,1 @@
+UPDATE T SET b = b + 1, d=NULL WHERE Price not = 5

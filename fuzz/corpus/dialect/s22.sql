@@ -1,0 +1,1 @@
+DELETE FROM T WHERE NOT (b BETWEEN 1 AND 5 OR a IN ('a','b'))

@@ -1,0 +1,1 @@
+CREATE TABLE [T] ([a] Varchar(40),[b] Integer,[x] Long Varbinary)

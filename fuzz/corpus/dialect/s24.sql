@@ -1,0 +1,1 @@
+CREATE INDEX [T_Q] ON [T] ([b] ASC)

@@ -1,0 +1,1 @@
+ALTER TABLE [T] MOVE [b] BEFORE [a]

@@ -1,0 +1,1 @@
+ALTER TABLE T RENAME a TO Title

@@ -1,0 +1,1 @@
+SELECT LEFT(a,3) & RIGHT(a, 2), d + 1, d - d, -b / 3 FROM T

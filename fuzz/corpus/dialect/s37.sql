@@ -1,0 +1,1 @@
+SELECT i.a FROM T AS i LEFT JOIN U o ON i.a = o.Item

@@ -1,0 +1,1 @@
+UPDATE MSysTables SET TableID = 3

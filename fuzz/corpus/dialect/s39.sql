@@ -1,0 +1,1 @@
+INSERT INTO Seen (a) VALUES('a')
