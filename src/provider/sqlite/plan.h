@@ -86,10 +86,19 @@ QByteArray OrderClause(const std::vector<PlannedOrder>& order);
 // How a column appears in a result.
 ResultField ResultFieldOf(const dialect::Table& table, const dialect::Column& column);
 
-// Functions of ours that written SQL uses; the engine registers them on every handle (functions.h).
+// Functions of ours that written SQL uses, registered on every handle: the first three by functions.h, the
+// others by dialect_functions.h.
 inline constexpr const char* kSortKeyFunction = "mirel_sortkey"; // (text) -> blob; NULL stays NULL
 inline constexpr const char* kDateFunction = "mirel_date";       // (any) -> our stored date text, or NULL
 inline constexpr const char* kLikeFunction = "mirel_like";       // (text, pattern) -> 0, 1 or NULL: "%" alone
                                                                  // is a wildcard, case ignored
+
+inline constexpr const char* kUpperFunction = "mirel_upper"; // (text) -> text, letters of every language
+inline constexpr const char* kLowerFunction = "mirel_lower";
+inline constexpr const char* kStoreFunction = "mirel_store"; // (any, type, size) -> what such a column stores,
+                                                             // or the statement fails: see StoreFailure
+
+// How deep the expressions of written SQL can be at most, for sqlite3_limit.
+inline constexpr int kMaxExpressionDepth = 500;
 
 } // namespace mirel::sqlite

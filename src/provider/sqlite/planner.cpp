@@ -65,6 +65,7 @@ private:
     {
         return where ? " WHERE " + writer_.Write(*where) : QByteArray();
     }
+    QByteArray Stored(const Expr& value, const QString& columnName);
     void PlanSources(const Select& select, SelectPlan& plan);
     void PlanColumns(const Select& select, SelectPlan& plan);
     void PlanGroup(const Select& select, SelectPlan& plan);
@@ -227,6 +228,18 @@ void Planner::PlanUse(const Select& select, SelectPlan& plan) const
         plan.updatableSource = int(only);
 }
 
+// A value that is only known as the statement runs is held against its column then: refused, never cut.
+QByteArray Planner::Stored(const Expr& value, const QString& columnName)
+{
+    const dialect::Column& column = *checker_.Sources().front().table->FindColumn(columnName);
+    QByteArray sql = writer_.Write(value);
+    const bool certain = IsLiteral(value.operation) || column.type == FieldType::None;
+    if (certain)
+        return sql;
+    return kStoreFunction + ('(' + sql) + ',' + QByteArray::number(int(column.type)) + ',' +
+           QByteArray::number(column.size) + ')';
+}
+
 PlanResult Planner::Plan(Insert& insert)
 {
     if (!checker_.Check(insert))
@@ -235,7 +248,7 @@ PlanResult Planner::Plan(Insert& insert)
     QByteArray values;
     for (size_t i = 0; i < insert.columns.size(); ++i) {
         names += (i > 0 ? "," : "") + QuoteName(insert.columns[i].name);
-        values += (i > 0 ? "," : "") + writer_.Write(insert.values[i]);
+        values += (i > 0 ? "," : "") + Stored(insert.values[i], insert.columns[i].name);
     }
     const QByteArray table = QuoteName(checker_.Sources().front().table->storedName);
     return FinishChange("INSERT INTO " + table + " (" + names + ") VALUES (" + values + ')');
@@ -248,7 +261,7 @@ PlanResult Planner::Plan(Update& update)
     QByteArray assignments;
     for (const Assignment& assignment : update.assignments) {
         assignments += (assignments.isEmpty() ? "" : ",") + QuoteName(assignment.column.name) + '=' +
-                       writer_.Write(assignment.value);
+                       Stored(assignment.value, assignment.column.name);
     }
     return FinishChange("UPDATE " + Target() + " SET " + assignments + Where(update.where));
 }

@@ -27,8 +27,8 @@ constexpr std::array kFunctions = {
     FunctionSql{Function::Average, "avg(%*)"},
     FunctionSql{Function::Minimum, "min(%*)"},
     FunctionSql{Function::Maximum, "max(%*)"},
-    FunctionSql{Function::Upper, "upper(%1)"},
-    FunctionSql{Function::Lower, "lower(%1)"},
+    FunctionSql{Function::Upper, "mirel_upper(%1)"},
+    FunctionSql{Function::Lower, "mirel_lower(%1)"},
     FunctionSql{Function::Length, "length(%1)"},
     FunctionSql{Function::Substring, "substr(%*)"},
     FunctionSql{Function::Left, "substr(%1,1,max(%2,0))"},
@@ -356,12 +356,15 @@ void SqlWriter::Call(const Expr& expression)
 
 void SqlWriter::Fill(const char* pattern, const Expr& expression)
 {
+    int nesting = 0;
     for (const char* at = pattern; *at; ++at) {
+        nesting += *at == '(' ? 1 : *at == ')' ? -1 : 0;
         const char next = *at == '%' ? at[1] : '\0';
+        const Deeper deeper(*this, 4 * (nesting - 1));
         if (next == '*') {
             List(expression.arguments.begin(), expression.arguments.end());
         } else if (next == '1' || next == '2') {
-            Operand(*std::next(expression.arguments.begin(), next - '1'), Binding::None, 6);
+            Operand(*std::next(expression.arguments.begin(), next - '1'), Binding::None, at[-1] == '(' ? 3 : 5);
         } else {
             sql_ += *at;
             continue;

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "platform/hr.h"
+
+#include <optional>
+#include <string_view>
+
+struct sqlite3;
+
+namespace mirel::sqlite {
+
+// The functions of ours that the dialect's own functions and assignments are written with. Each handle on which
+// planned SQL runs has them registered. False: out of memory.
+[[nodiscard]] bool RegisterDialectFunctions(sqlite3* database);
+
+// What a statement failed with when it was kStoreFunction that refused a value; empty for any other message.
+std::optional<Hr> StoreFailure(std::string_view errorMessage);
+
+} // namespace mirel::sqlite
