@@ -1,0 +1,207 @@
+#include "app/main_view_commands.h"
+
+#include "app/shell_commands.h"
+
+#include <QFileInfo>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+template <typename Record>
+std::vector<MainEntry> EntriesOf(const std::vector<Record>& records, EntryKind kind)
+{
+    std::vector<MainEntry> entries;
+    for (const Record& record : records)
+        entries.push_back({kind, record.name.Text(), record.tableName.Text(), false});
+    return entries;
+}
+
+// Where the selection of each tab stands in the profile, and the tab's name there.
+struct TabMemory {
+    MainTab tab;
+    Setting selection;
+    QStringView name;
+};
+const std::array kTabMemories = {
+    TabMemory{MainTab::Favorites, Setting::ActiveFavorites, u"Favorites"},
+    TabMemory{MainTab::Table, Setting::ActiveTable, u"Table"},
+    TabMemory{MainTab::Form, Setting::ActiveForm, u"Form"},
+    TabMemory{MainTab::Query, Setting::ActiveQuery, u"Query"},
+};
+
+} // namespace
+
+void MainViewCommands::RestoreLastRun(const QString& database)
+{
+    const QString tabName = settings_.Text(Setting::ActiveView);
+    for (const TabMemory& memory : kTabMemories) {
+        state_.Remember(memory.tab, settings_.Text(memory.selection));
+        if (memory.name == tabName)
+            state_.SetTab(memory.tab);
+    }
+    state_.SetOpensByDoubleTap(settings_.Flag(Setting::OpenByDoubleClick));
+    const QString path = database.isEmpty() ? settings_.Text(Setting::ActiveDb) : database;
+    if (!path.isEmpty())
+        OpenDatabase(path);
+}
+
+void MainViewCommands::KeepForNextRun()
+{
+    for (const TabMemory& memory : kTabMemories) {
+        settings_.SetText(memory.selection, state_.Remembered(memory.tab));
+        if (memory.tab == state_.Tab())
+            settings_.SetText(Setting::ActiveView, memory.name.toString());
+    }
+    settings_.SetInt(Setting::OpenByDoubleClick, state_.OpensByDoubleTap() ? 1 : 0);
+    settings_.SetText(Setting::ActiveDb, session_.Path());
+}
+
+void MainViewCommands::Refill()
+{
+    DatabaseContents contents;
+    contents.path = session_.Path();
+    if (session_.IsOpen()) {
+        QStringList tables;
+        session_.ListTables(tables);
+        for (const QString& table : std::as_const(tables))
+            contents.tables.push_back({EntryKind::Table, table, {}, false});
+        contents.forms = EntriesOf(session_.Store().Forms(), EntryKind::Form);
+        contents.queries = EntriesOf(session_.Store().Queries(), EntryKind::Query);
+        for (const QString& text : session_.Favorites()) {
+            if (const std::optional<MainEntry> favorite = FavoriteOfText(text))
+                contents.favorites.push_back(*favorite);
+        }
+    }
+    state_.Show(std::move(contents));
+}
+
+bool MainViewCommands::OpenDatabase(const QString& path)
+{
+    const bool opened = session_.Open(path);
+    if (!opened && !QFileInfo::exists(path))
+        settings_.ForgetDatabase(path);
+    Refill();
+    return opened;
+}
+
+bool MainViewCommands::NewDatabase(const QString& path)
+{
+    const QString file = QFileInfo(path).suffix().isEmpty() ? path + u".cdb"_s : path;
+    const bool created = session_.Create(file);
+    Refill();
+    return created;
+}
+
+bool MainViewCommands::DeleteDatabase(const QString& path)
+{
+    UserPrompt& prompt = session_.Prompt();
+    if (!prompt.AskYesNo({Str::DeleteDatabase, {path}}) || !prompt.AskYesNo({Str::DeleteDatabaseReally, {path}}))
+        return false;
+    const bool dropped = session_.Drop(path);
+    Refill();
+    return dropped;
+}
+
+bool MainViewCommands::OpenSample()
+{
+    const QString before = session_.Path();
+    if (sample_.EnsureExists(session_))
+        return OpenDatabase(sample_.Path());
+    OpenDatabase(before);
+    return false;
+}
+
+bool MainViewCommands::AddFavorite()
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry || state_.IsFavorite(*entry))
+        return false;
+    if (!session_.SetFavorites(session_.Favorites() << FavoriteText(*entry))) {
+        session_.Prompt().Show({Str::FavoritesReadOnly, {}});
+        return false;
+    }
+    Refill();
+    return true;
+}
+
+bool MainViewCommands::RemoveFavorite()
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    return entry && RemoveFavorite(*entry);
+}
+
+bool MainViewCommands::RemoveFavorite(const MainEntry& entry)
+{
+    QStringList favorites = session_.Favorites();
+    if (favorites.removeAll(FavoriteText(entry)) == 0)
+        return false;
+    if (!session_.SetFavorites(favorites)) {
+        session_.Prompt().Show({Str::FavoritesReadOnly, {}});
+        return false;
+    }
+    Refill();
+    return true;
+}
+
+bool MainViewCommands::DeleteSelected()
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry)
+        return false;
+    if (state_.Tab() == MainTab::Favorites)
+        return RemoveFavorite(*entry);
+    const bool deleted = entry->kind == EntryKind::Table ? DropTable(entry->name) : DeleteFromStore(*entry);
+    if (deleted) {
+        if (state_.IsFavorite(*entry))
+            RemoveFavorite(*entry);
+        Refill();
+    }
+    return deleted;
+}
+
+bool MainViewCommands::DropTable(const QString& name)
+{
+    return session_.Prompt().AskYesNo({Str::DropTable, {name}}) &&
+           session_.GetCatalog().ExecuteStatement(session_.Path(), u"DROP TABLE [%1]"_s.arg(name));
+}
+
+bool MainViewCommands::DeleteFromStore(const MainEntry& entry)
+{
+    const bool form = entry.kind == EntryKind::Form;
+    if (!session_.Prompt().AskYesNo({form ? Str::DeleteFormQuestion : Str::DeleteQueryQuestion, {entry.name}}))
+        return false;
+    const bool deleted = session_.Store().Apply(
+        [&](FormStore& store) { return form ? store.RemoveForm(entry.name) : store.RemoveQuery(entry.name); });
+    if (!deleted && !session_.Store().LastError().isEmpty())
+        session_.Prompt().ShowError(session_.Store().LastError());
+    return deleted;
+}
+
+void MainViewCommands::New()
+{
+    if (const std::optional<Str> message = OutcomeOfNew(state_).message)
+        session_.Prompt().Show({*message, {}});
+}
+
+std::optional<TableRequest> MainViewCommands::RequestOfSelected() const
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry || entry->missing)
+        return std::nullopt;
+    switch (entry->kind) {
+    // Never the bare name: a filter appends its WHERE to the statement.
+    case EntryKind::Table:
+        return TableRequest{entry->name, u"SELECT * FROM "_s + FieldReference(entry->name), entry->name};
+    case EntryKind::Query:
+        if (const QueryDef* query = session_.Store().FindQuery(entry->name))
+            return TableRequest{entry->name, query->text.Text(), entry->table};
+        break;
+    case EntryKind::Form:
+        break;
+    }
+    return std::nullopt;
+}
+
+} // namespace mirel

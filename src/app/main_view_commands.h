@@ -1,0 +1,70 @@
+#pragma once
+
+#include "app/database_session.h"
+#include "app/main_view_state.h"
+#include "app/sample_database.h"
+#include "app/settings.h"
+
+#include <optional>
+
+namespace mirel {
+
+// A result to be shown in the table view.
+struct TableRequest {
+    QString title;     // the table's or the query's name
+    QString statement; // a SELECT
+    QString table;     // what it shows the records of; for a query the table it was built on
+
+    friend bool operator==(const TableRequest&, const TableRequest&) = default;
+};
+
+// Carries out what the user asks of the main view: opens, makes and deletes databases, keeps the favorites,
+// deletes entries, remembers all that from one run to the next. Each call that changes something brings the state
+// up to date. Questions and failures go through the session's prompt. All must outlive this.
+class MainViewCommands {
+public:
+    MainViewCommands(DatabaseSession& session, MainViewState& state, Settings& settings, SampleDatabase sample)
+        : session_(session)
+        , state_(state)
+        , settings_(settings)
+        , sample_(std::move(sample))
+    {
+    }
+
+    // What the last run left behind: its selections, its tab, its database. A database that no longer opens is
+    // reported, and none is open then. `database` is opened instead when it is not empty.
+    void RestoreLastRun(const QString& database);
+    void KeepForNextRun();
+
+    // Reads the lists of the open database anew.
+    void Refill();
+
+    bool OpenDatabase(const QString& path);
+    bool NewDatabase(const QString& path);    // a name without an ending gets ".cdb"
+    bool DeleteDatabase(const QString& path); // asks twice; No leaves everything as it is
+
+    bool OpenSample(); // makes it first where it is not there
+
+    // These act on the entry selected on the tab in front, and do nothing when there is none.
+    bool AddFavorite();
+    bool RemoveFavorite();
+    bool DeleteSelected(); // asks; on the favorites it removes the favorite alone
+
+    // Says what must be chosen before there can be a new thing on the tab in front.
+    void New();
+
+    // What the table view is to show for the selected entry; empty for a form, or when there is nothing to show.
+    std::optional<TableRequest> RequestOfSelected() const;
+
+private:
+    bool RemoveFavorite(const MainEntry& entry);
+    bool DropTable(const QString& name);
+    bool DeleteFromStore(const MainEntry& entry);
+
+    DatabaseSession& session_;
+    MainViewState& state_;
+    Settings& settings_;
+    SampleDatabase sample_;
+};
+
+} // namespace mirel

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "app/database_session.h"
+#include "platform/program_folder.h"
+
+#include <QString>
+
+namespace mirel {
+
+// A small database to try things on: bird strikes, airports, and invented contacts and orders that have every type
+// of field. It is made in the program folder from the CSV files that come with the program, on the day it is first
+// wanted; from then on it is the user's.
+class SampleDatabase {
+public:
+    // `source` is the folder with the CSV files.
+    SampleDatabase(const ProgramFolder& folder, QString source);
+
+    QString Path() const { return path_; }
+    // Makes it where it is not there. False when that fails; why was told to the session's prompt, and nothing
+    // half-made is left. No database is open afterwards.
+    bool EnsureExists(DatabaseSession& session) const;
+
+private:
+    QString folder_;
+    QString path_;
+    QString source_;
+};
+
+} // namespace mirel

@@ -1,0 +1,118 @@
+#include "app/window_options.h"
+
+#include <QCommandLineParser>
+#include <QRegularExpression>
+
+#include <array>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+// One option: its name, what its value is called (empty: it has none), what it does, where it goes.
+struct OptionDef {
+    QStringView name;
+    QStringView value;
+    QStringView help;
+    QString WindowOptions::*text;
+    bool WindowOptions::*flag;
+};
+
+const std::array kOptions = {
+    OptionDef{u"home", u"DIR", u"the program folder: side files, favorites, profile, sample", &WindowOptions::home,
+              nullptr},
+    OptionDef{u"palette", u"light|dark", u"one of the program's own palettes instead of the desktop's",
+              &WindowOptions::palette, nullptr},
+    OptionDef{u"sample", u"", u"open the sample database, and make it first where it is not there", nullptr,
+              &WindowOptions::sample},
+    OptionDef{u"picture", u"FILE", u"write a picture of the window to a PNG file and end", &WindowOptions::picture,
+              nullptr},
+    OptionDef{u"size", u"WxH", u"size of that picture; 1100x700 unless given", nullptr, nullptr},
+    OptionDef{u"table", u"NAME", u"a picture of the table view of that table", &WindowOptions::table, nullptr},
+    OptionDef{u"print-sample-path", u"", u"print where the sample database is, making it where it is not there",
+              nullptr, &WindowOptions::printSamplePath},
+    OptionDef{u"help", u"", u"print this", nullptr, &WindowOptions::help},
+    OptionDef{u"version", u"", u"print the version", nullptr, &WindowOptions::version},
+};
+
+constexpr int kLargestSide = 20'000;
+
+std::optional<QSize> SizeOf(const QString& text)
+{
+    static const QRegularExpression form(u"^(\\d{1,5})x(\\d{1,5})$"_s);
+    const QRegularExpressionMatch match = form.match(text);
+    const QSize size(match.captured(1).toInt(), match.captured(2).toInt());
+    if (!match.hasMatch() || size.isEmpty() || size.width() > kLargestSide || size.height() > kLargestSide)
+        return std::nullopt;
+    return size;
+}
+
+void AddOptions(QCommandLineParser& parser)
+{
+    for (const OptionDef& option : kOptions)
+        parser.addOption({option.name.toString(), option.help.toString(), option.value.toString()});
+}
+
+bool ReadOptions(const QCommandLineParser& parser, WindowOptions& options, QString& complaint)
+{
+    for (const OptionDef& option : kOptions) {
+        const QString name = option.name.toString();
+        if (option.text)
+            options.*option.text = parser.value(name);
+        if (option.flag)
+            options.*option.flag = parser.isSet(name);
+    }
+    if (!options.palette.isEmpty() && options.palette != u"light" && options.palette != u"dark") {
+        complaint = u"--palette is light or dark, not \"%1\""_s.arg(options.palette);
+        return false;
+    }
+    if (parser.isSet(u"size"_s)) {
+        const std::optional<QSize> size = SizeOf(parser.value(u"size"_s));
+        if (!size) {
+            complaint = u"--size is WIDTHxHEIGHT, not \"%1\""_s.arg(parser.value(u"size"_s));
+            return false;
+        }
+        options.size = *size;
+    }
+    if (!options.table.isEmpty() && options.picture.isEmpty()) {
+        complaint = u"--table says what --picture shows, and needs it"_s;
+        return false;
+    }
+    return true;
+}
+
+} // namespace
+
+std::optional<WindowOptions> ParseWindowOptions(const QStringList& arguments, QString& complaint)
+{
+    QCommandLineParser parser;
+    AddOptions(parser);
+    WindowOptions options;
+    if (!parser.parse(QStringList(u"mirel"_s) + arguments)) {
+        complaint = parser.errorText();
+        return std::nullopt;
+    }
+    const QStringList positional = parser.positionalArguments();
+    if (positional.size() > 1) {
+        complaint = u"one database at a time, \"%1\" is too many"_s.arg(positional[1]);
+        return std::nullopt;
+    }
+    options.database = positional.value(0);
+    if (!ReadOptions(parser, options, complaint))
+        return std::nullopt;
+    return options;
+}
+
+QString WindowOptionsHelp()
+{
+    QString help = u"mirel [OPTIONS] [DATABASE]\n\n"_s;
+    for (const OptionDef& option : kOptions) {
+        const QString left =
+            option.value.isEmpty() ? option.name.toString() : u"%1 %2"_s.arg(option.name, option.value);
+        help += u"  --%1  %2\n"_s.arg(left.leftJustified(20), option.help);
+    }
+    return help;
+}
+
+} // namespace mirel
