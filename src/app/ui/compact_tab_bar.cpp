@@ -2,37 +2,33 @@
 
 #include <QResizeEvent>
 
-namespace mirel {
+#include <algorithm>
 
-QSize CompactTabBar::minimumSizeHint() const
+namespace mirel {
+namespace {
+
+constexpr int kLeastSpacePx = 6;
+
+} // namespace
+
+int CompactTabBar::TextsWidth() const
 {
     int width = 0;
     for (int i = 0; i < count(); ++i)
-        width += minimumTabSizeHint(i).width();
-    return {width, QTabBar::minimumSizeHint().height()};
+        width += fontMetrics().size(Qt::TextShowMnemonic, tabText(i)).width();
+    return width;
 }
 
-QSize CompactTabBar::tabSizeHint(int index) const
+int CompactTabBar::SpaceInTabPx(int roomyPx) const
 {
-    const QSize roomy = QTabBar::tabSizeHint(index);
-    int all = 0;
-    int least = 0;
-    for (int i = 0; i < count(); ++i) {
-        all += QTabBar::tabSizeHint(i).width();
-        least += minimumTabSizeHint(i).width();
-    }
-    const int window = parentWidget() ? parentWidget()->contentsRect().width() : all;
-    const int room = std::min(window, width() > least ? width() : window);
-    if (all <= room)
-        return roomy;
-    const int spare = std::max(0, room - least) / std::max(1, count());
-    return {std::min(roomy.width(), minimumTabSizeHint(index).width() + spare), roomy.height()};
+    if (count() == 0)
+        return roomyPx;
+    return std::clamp((width() - TextsWidth()) / count(), std::min(kLeastSpacePx, roomyPx), roomyPx);
 }
 
-QSize CompactTabBar::minimumTabSizeHint(int index) const
+QSize CompactTabBar::minimumSizeHint() const
 {
-    const int text = fontMetrics().size(Qt::TextShowMnemonic, tabText(index)).width();
-    return {text + fontMetrics().averageCharWidth(), QTabBar::minimumTabSizeHint(index).height()};
+    return {TextsWidth() + kLeastSpacePx * count(), QTabBar::minimumSizeHint().height()};
 }
 
 void CompactTabBar::resizeEvent(QResizeEvent* event)

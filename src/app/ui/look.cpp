@@ -1,5 +1,6 @@
 #include "app/ui/look.h"
 
+#include "app/ui/compact_tab_bar.h"
 #include "resources/ui/theme_icon.h"
 
 #include <QApplication>
@@ -119,6 +120,13 @@ QSize TouchTargetStyle::sizeFromContents(ContentsType type, const QStyleOption* 
     default:
         return size;
     }
+}
+
+int TouchTargetStyle::pixelMetric(PixelMetric metric, const QStyleOption* option, const QWidget* widget) const
+{
+    const int roomy = QProxyStyle::pixelMetric(metric, option, widget);
+    const auto* tabs = metric == PM_TabBarTabHSpace ? qobject_cast<const CompactTabBar*>(widget) : nullptr;
+    return tabs ? tabs->SpaceInTabPx(roomy) : roomy;
 }
 
 } // namespace mirel

@@ -70,6 +70,8 @@ CLumoView::CLumoView(MainViewState& state, ShellActions& actions, QWidget* paren
     , emptyText_(new QLabel(this))
     , welcome_(new WelcomePage(actions, this))
 {
+    list_->setObjectName(QStringLiteral("entries"));
+    search_->setObjectName(QStringLiteral("search"));
     for (int tab = 0; tab < kMainTabs; ++tab)
         tabs_->addTab(StringText(TabText(MainTab(tab))));
     tabs_->setExpanding(false);

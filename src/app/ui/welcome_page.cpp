@@ -23,11 +23,10 @@ QToolButton* WayIn(QAction* action, QWidget* parent)
     return button;
 }
 
-QLabel* Heading(Str text, qreal scale, QWidget* parent)
+QLabel* Heading(Str text, QWidget* parent)
 {
     auto* label = new QLabel(StringText(text), parent);
     QFont font = label->font();
-    font.setPointSizeF(font.pointSizeF() * scale);
     font.setBold(true);
     label->setFont(font);
     return label;
@@ -42,13 +41,13 @@ WelcomePage::WelcomePage(const ShellActions& actions, QWidget* parent)
     auto* column = new QWidget(page);
     column->setMaximumWidth(fontMetrics().averageCharWidth() * kWidthInCharacters);
     auto* lines = new QVBoxLayout(column);
-    lines->addWidget(Heading(Str::NoDatabase, 1.3, column));
     auto* hint = new QLabel(StringText(Str::WelcomeHint), column);
     hint->setWordWrap(true);
+    hint->setMinimumHeight(1); // or the page would have room for the hint at its narrowest
     lines->addWidget(hint);
     for (const ShellCommand id : {ShellCommand::OpenDatabase, ShellCommand::NewDatabase, ShellCommand::OpenSample})
         lines->addWidget(WayIn(actions.Of(id), column));
-    recentHeading_ = Heading(Str::RecentHeading, 1.0, column);
+    recentHeading_ = Heading(Str::RecentHeading, column);
     lines->addWidget(recentHeading_);
     recentList_ = new EntryList(column);
     recentList_->setAccessibleName(StringText(Str::RecentHeading));

@@ -1,0 +1,284 @@
+#include "app/ui/main_frame.h"
+
+#include "app/table_view_options.h"
+#include "app/ui/about_box.h"
+#include "app/ui/file_choice.h"
+#include "app/ui/keys_dialog.h"
+#include "app/ui/lumo_view.h"
+#include "app/ui/shell_actions.h"
+#include "app/ui/window_place.h"
+#include "tableview/ui/table_view.h"
+
+#include <QApplication>
+#include <QDir>
+#include <QDragEnterEvent>
+#include <QFileInfo>
+#include <QMenuBar>
+#include <QMimeData>
+#include <QUrl>
+
+#include <algorithm>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+const QString kFramePlace = u"frame"_s;
+const QString kTablePlace = u"table"_s;
+constexpr QSize kFrameFirstSize(760, 560);
+constexpr QSize kTableFirstSize(960, 620);
+constexpr const char* kRequestProperty = "mirelRequest"; // of a table view: the statement that it was opened for
+constexpr QSize kSmallestSize(160, 160);
+
+// The one database file that is dragged; empty when it is anything else.
+QString DraggedDatabase(const QMimeData* data)
+{
+    const QList<QUrl> urls = data->urls();
+    if (urls.size() != 1 || !urls.first().isLocalFile())
+        return {};
+    const QString path = urls.first().toLocalFile();
+    return path.endsWith(u".cdb"_s, Qt::CaseInsensitive) ? path : QString();
+}
+
+} // namespace
+
+CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewCommands& commands,
+                       Settings& settings, Profile& profile)
+    : session_(session)
+    , state_(state)
+    , commands_(commands)
+    , settings_(settings)
+    , profile_(profile)
+    , actions_(new ShellActions(this))
+    , view_(new CLumoView(state, *actions_, this))
+{
+    MakeMenus();
+    setCentralWidget(view_);
+    setAcceptDrops(true);
+    setMinimumSize(kSmallestSize);
+    setWindowIcon(QIcon(u":/icons/mirel.svg"_s));
+    connect(actions_, &ShellActions::Given, this, &CMainFrame::Run);
+    connect(view_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
+    RestorePlace(*this, profile, kFramePlace, kFrameFirstSize);
+    ShowState();
+}
+
+void CMainFrame::MakeMenus()
+{
+    menuBar()->setNativeMenuBar(false); // its place in a small window is the window
+    QMenu* file = menuBar()->addMenu(StringText(Str::MenuFile));
+    auto* layout = new QMenu(StringText(Str::MenuLayout), file);
+    QMenu* database = menuBar()->addMenu(StringText(Str::MenuDatabase));
+    QMenu* help = menuBar()->addMenu(StringText(Str::MenuHelp));
+    recentMenu_ = new QMenu(StringText(Str::MenuRecent), database);
+    const std::map<ShellMenu, QMenu*> menus = {{ShellMenu::File, file},
+                                               {ShellMenu::Layout, layout},
+                                               {ShellMenu::Database, database},
+                                               {ShellMenu::Help, help}};
+    for (const auto& [id, menu] : menus)
+        menu->setToolTipsVisible(true); // they say why an entry cannot be chosen
+    for (const ShellCommandDef& definition : ShellCommands()) {
+        const auto menu = menus.find(definition.menu);
+        if (menu == menus.end())
+            continue;
+        if (definition.id == ShellCommand::ImportCsv)
+            file->addMenu(layout);
+        if (definition.separated)
+            menu->second->addSeparator();
+        menu->second->addAction(actions_->Of(definition.id));
+    }
+    database->addMenu(recentMenu_);
+    connect(recentMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
+}
+
+void CMainFrame::FillRecentMenu()
+{
+    recentMenu_->clear();
+    int number = 0;
+    for (const QString& path : settings_.RecentDatabases()) {
+        const QString name = QFileInfo(path).fileName().replace(u'&', u"&&"_s);
+        QAction* action = recentMenu_->addAction(StringText(Str::RecentEntry, {QString::number(++number), name}));
+        action->setToolTip(QDir::toNativeSeparators(path));
+        connect(action, &QAction::triggered, this, [this, path] { OpenPath(path); });
+    }
+    recentMenu_->setToolTipsVisible(true);
+}
+
+void CMainFrame::ShowState()
+{
+    const QStringList recent = settings_.RecentDatabases();
+    recentMenu_->setEnabled(!recent.isEmpty());
+    view_->ShowRecent(recent);
+    view_->ShowState();
+    const QString application = QApplication::applicationDisplayName();
+    setWindowTitle(state_.HasDatabase() ? StringText(Str::WindowTitle, {state_.DatabaseName()}) : application);
+}
+
+void CMainFrame::Run(ShellCommand id)
+{
+    switch (id) {
+    case ShellCommand::AddFavorites:
+        commands_.AddFavorite();
+        break;
+    case ShellCommand::RemoveFavorites:
+        commands_.RemoveFavorite();
+        break;
+    case ShellCommand::OpenByDoubleClicking:
+        state_.SetOpensByDoubleTap(!state_.OpensByDoubleTap());
+        break;
+    case ShellCommand::Exit:
+        close();
+        return;
+    case ShellCommand::OpenDatabase:
+        ChooseAndOpenDatabase();
+        break;
+    case ShellCommand::NewDatabase:
+        ChooseAndCreateDatabase();
+        break;
+    case ShellCommand::DeleteDatabase:
+        ChooseAndDeleteDatabase();
+        break;
+    case ShellCommand::OpenSample:
+        commands_.OpenSample();
+        break;
+    case ShellCommand::Keys:
+        ShowKeys(*this);
+        return;
+    case ShellCommand::About:
+        ShowAbout(session_, *this);
+        return;
+    case ShellCommand::Open:
+        if (const std::optional<TableRequest> request = commands_.RequestOfSelected())
+            OpenTable(*request);
+        return;
+    case ShellCommand::New:
+        commands_.New();
+        return;
+    case ShellCommand::Delete:
+        commands_.DeleteSelected();
+        break;
+    case ShellCommand::Font:
+    case ShellCommand::BackgroundColor:
+    case ShellCommand::ListBackgroundColor:
+    case ShellCommand::ButtonBackgroundColor:
+    case ShellCommand::DatabaseTextColor:
+    case ShellCommand::ListTextColor:
+    case ShellCommand::ButtonTextColor:
+    case ShellCommand::ImportCsv:
+    case ShellCommand::ExportCsv:
+    case ShellCommand::Help:
+    case ShellCommand::Edit:
+        return; // disabled: not built yet
+    }
+    ShowState();
+}
+
+QWidget* CMainFrame::OpenTable(const TableRequest& request)
+{
+    for (CTableView* open : Tables()) {
+        if (open->property(kRequestProperty) != request.statement)
+            continue;
+        open->show();
+        open->raise();
+        open->activateWindow();
+        return open;
+    }
+    auto* table = new CTableView(session_.Connection(), session_.Path(), session_.Prompt(),
+                                 ReadTableViewSettings(settings_), this);
+    table->setAttribute(Qt::WA_DeleteOnClose);
+    table->setProperty(kRequestProperty, request.statement);
+    if (!table->OpenStatement(request.title, request.statement)) {
+        delete table;
+        return nullptr;
+    }
+    connect(table, &CTableView::settingsChanged, this,
+            [this](const TableViewSettings& options) { WriteTableViewSettings(settings_, options); });
+    if (IsHandheldSize(size())) {
+        table->setGeometry(geometry());
+        table->setWindowState(windowState());
+    } else {
+        RestorePlace(*table, profile_, kTablePlace, kTableFirstSize);
+    }
+    table->installEventFilter(this);
+    table->show();
+    return table;
+}
+
+bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
+{
+    if (event->type() == QEvent::Close) {
+        const auto* table = qobject_cast<CTableView*>(watched);
+        if (table && !IsHandheldSize(table->size()))
+            KeepPlace(*table, profile_, kTablePlace);
+    }
+    return QMainWindow::eventFilter(watched, event);
+}
+
+void CMainFrame::ChooseAndOpenDatabase()
+{
+    const QString path = ChooseDatabase(*this, Str::CommandOpenDatabase, FileUse::Open, state_.DatabasePath());
+    if (!path.isEmpty() && CloseTables())
+        commands_.OpenDatabase(path);
+}
+
+void CMainFrame::ChooseAndCreateDatabase()
+{
+    const QString path = ChooseDatabase(*this, Str::CommandNewDatabase, FileUse::Create, state_.DatabasePath());
+    if (!path.isEmpty() && CloseTables())
+        commands_.NewDatabase(path);
+}
+
+void CMainFrame::ChooseAndDeleteDatabase()
+{
+    const QString path = ChooseDatabase(*this, Str::CommandDeleteDatabase, FileUse::Open, state_.DatabasePath());
+    if (!path.isEmpty() && CloseTables())
+        commands_.DeleteDatabase(path);
+}
+
+void CMainFrame::OpenPath(const QString& path)
+{
+    if (!CloseTables())
+        return;
+    commands_.OpenDatabase(path);
+    ShowState();
+}
+
+bool CMainFrame::CloseTables()
+{
+    return std::ranges::all_of(Tables(), [](CTableView* table) { return table->close(); });
+}
+
+QList<CTableView*> CMainFrame::Tables() const
+{
+    return findChildren<CTableView*>(Qt::FindDirectChildrenOnly);
+}
+
+void CMainFrame::closeEvent(QCloseEvent* event)
+{
+    if (!CloseTables()) {
+        event->ignore();
+        return;
+    }
+    KeepPlace(*this, profile_, kFramePlace);
+    QMainWindow::closeEvent(event);
+}
+
+void CMainFrame::dragEnterEvent(QDragEnterEvent* event)
+{
+    if (!DraggedDatabase(event->mimeData()).isEmpty())
+        event->acceptProposedAction();
+}
+
+void CMainFrame::dropEvent(QDropEvent* event)
+{
+    const QString path = DraggedDatabase(event->mimeData());
+    if (path.isEmpty())
+        return;
+    // A move would have the file manager delete what was only opened.
+    event->setDropAction(Qt::CopyAction);
+    event->accept();
+    OpenPath(path);
+}
+
+} // namespace mirel

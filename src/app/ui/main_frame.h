@@ -1,0 +1,60 @@
+#pragma once
+
+#include "app/main_view_commands.h"
+#include "app/shell_commands.h"
+
+#include <QMainWindow>
+
+class QMenu;
+
+namespace mirel {
+
+class CLumoView;
+class CTableView;
+class ShellActions;
+
+// The program's window: the menus, and in its middle the main view. The running form and the form maker will take
+// the main view's place. Carries the commands of the menus to MainViewCommands; DatabaseSession is the document.
+//
+// All arguments must outlive the frame.
+class CMainFrame : public QMainWindow {
+    Q_OBJECT
+public:
+    CMainFrame(DatabaseSession& session, MainViewState& state, MainViewCommands& commands, Settings& settings,
+               Profile& profile);
+
+    // Shows the state as it is now, after somebody else changed it.
+    void ShowState();
+    // Opens the table view on a result, or brings forward the one that shows it already. Null when it does not
+    // open; why was told then. Table views close with the database.
+    QWidget* OpenTable(const TableRequest& request);
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    void MakeMenus();
+    void FillRecentMenu();
+    void Run(ShellCommand id);
+    void ChooseAndOpenDatabase();
+    void ChooseAndCreateDatabase();
+    void ChooseAndDeleteDatabase();
+    void OpenPath(const QString& path);
+    // False when one of them holds an edit that cannot be saved: the user stays in it.
+    bool CloseTables();
+    QList<CTableView*> Tables() const;
+
+    DatabaseSession& session_;
+    MainViewState& state_;
+    MainViewCommands& commands_;
+    Settings& settings_;
+    Profile& profile_;
+    ShellActions* actions_;
+    CLumoView* view_;
+    QMenu* recentMenu_ = nullptr;
+};
+
+} // namespace mirel
