@@ -1,0 +1,268 @@
+#include "provider/sqlite/database_file.h"
+
+#include "provider/sqlite/functions.h"
+#include "provider/sqlite/schema_reader.h"
+#include "provider/sqlite/system_tables.h"
+#include "resources/string_table.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+
+#include <array>
+
+namespace mirel::sqlite {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int kBusyTimeoutMs = 3000;
+
+// Once a process, before its first handle: one thread uses a handle, nobody reads memory statistics, and a
+// path is a path, never a URI.
+void ConfigureLibrary()
+{
+    static const bool configured = [] {
+        sqlite3_config(SQLITE_CONFIG_MEMSTATUS, 0);
+        sqlite3_config(SQLITE_CONFIG_URI, 0);
+        return sqlite3_initialize() == SQLITE_OK;
+    }();
+    Q_UNUSED(configured)
+}
+
+struct Limit {
+    int what;
+    int value;
+};
+// Above what any database of this system needs, below what takes the machine down.
+constexpr std::array kLimits = {
+    Limit{SQLITE_LIMIT_LENGTH, 512 << 20},    Limit{SQLITE_LIMIT_SQL_LENGTH, 64 << 20},
+    Limit{SQLITE_LIMIT_COMPOUND_SELECT, 100}, Limit{SQLITE_LIMIT_TRIGGER_DEPTH, 32},
+    Limit{SQLITE_LIMIT_ATTACHED, 1}, // compacting attaches its new file
+};
+
+struct Option {
+    int what;
+    int value;
+};
+constexpr std::array kOptions = {
+    Option{SQLITE_DBCONFIG_DEFENSIVE, 1},
+    Option{SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0},
+    Option{SQLITE_DBCONFIG_DQS_DML, 0},
+    Option{SQLITE_DBCONFIG_DQS_DDL, 0},
+    Option{SQLITE_DBCONFIG_ENABLE_LOAD_EXTENSION, 0},
+};
+
+// Results that are kept as rows lie in temporary tables; a view without an end must not fill the disk.
+constexpr const char* kSettings = "PRAGMA cell_size_check=ON;"
+                                  "PRAGMA temp.max_page_count=1048576;";
+// The page size holds from the first page that is written.
+const QByteArray kNewDatabase =
+    "PRAGMA page_size=16384; PRAGMA application_id=" + QByteArray::number(kApplicationId);
+
+Outcome CheckFile(const QString& path)
+{
+    if (path.isEmpty())
+        return {Hr::CannotOpen, StringText(Str::NoDatabaseNamed)};
+    const QFileInfo info(path);
+    if (!info.exists())
+        return {Hr::CannotOpen, StringText(Str::DatabaseNotFound, {path})};
+    if (!info.isFile()) // a folder, or a device that would never end
+        return {Hr::CannotOpen, StringText(Str::DatabaseIsNoFile, {path})};
+    if (info.size() == 0) // the engine would make a database of it
+        return {Hr::NotADatabase, StringText(Str::FileIsNoDatabase, {path})};
+    return {};
+}
+
+bool MayBeWritten(const QString& path)
+{
+    constexpr auto kWrite = QFile::WriteOwner | QFile::WriteGroup | QFile::WriteOther;
+    const QFileInfo info(path);
+    return (info.permissions() & kWrite) && info.isWritable();
+}
+
+} // namespace
+
+QString IdentityOfPath(const QString& path)
+{
+    const QFileInfo info(path);
+    const QString canonical = info.canonicalFilePath();
+    return canonical.isEmpty() ? QDir::cleanPath(info.absoluteFilePath()) : canonical;
+}
+
+std::shared_ptr<DatabaseFile> DatabaseFile::Open(const QString& path, Outcome& outcome)
+{
+    outcome = CheckFile(path);
+    if (!outcome.Ok())
+        return {};
+    std::shared_ptr<DatabaseFile> file(new DatabaseFile(IdentityOfPath(path)));
+    outcome = file->OpenHandle(!MayBeWritten(path));
+    if (outcome.Ok())
+        outcome = file->RefreshSchema();
+    return outcome.Ok() ? file : nullptr;
+}
+
+Outcome DatabaseFile::OpenHandle(bool readOnly)
+{
+    ConfigureLibrary();
+    const int flags = (readOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE) | SQLITE_OPEN_NOMUTEX;
+    sqlite3* raw = nullptr;
+    int result = sqlite3_open_v2(QFile::encodeName(path_).constData(), &raw, flags, nullptr);
+    handle_.reset(raw);
+    if (result != SQLITE_OK)
+        return OutcomeOf(result);
+    sqlite3_extended_result_codes(raw, 1);
+    sqlite3_busy_timeout(raw, kBusyTimeoutMs);
+    for (const Limit& limit : kLimits)
+        sqlite3_limit(raw, limit.what, limit.value);
+    for (const Option& option : kOptions)
+        sqlite3_db_config(raw, option.what, option.value, nullptr);
+    result = RegisterFunctions(raw);
+    if (result == SQLITE_OK)
+        result = RegisterSystemTables(raw, schema_);
+    if (result == SQLITE_OK)
+        result = sqlite3_exec(raw, kSettings, nullptr, nullptr, nullptr);
+    return OutcomeOf(result);
+}
+
+Outcome DatabaseFile::Create(const QString& path)
+{
+    if (path.isEmpty())
+        return {Hr::CannotOpen, StringText(Str::NoDatabaseNamed)};
+    QFile place(path);
+    if (!place.open(QIODevice::WriteOnly | QIODevice::NewOnly)) {
+        if (QFileInfo::exists(path))
+            return {Hr::CannotOpen, StringText(Str::DatabaseExists, {path})};
+        return {Hr::CannotOpen, StringText(Str::DatabaseFailure, {path, place.errorString()})};
+    }
+    place.close();
+    DatabaseFile file(IdentityOfPath(path));
+    Outcome outcome = file.OpenHandle(false);
+    if (outcome.Ok())
+        outcome = file.OutcomeOf(sqlite3_exec(file.Handle(), kNewDatabase.constData(), nullptr, nullptr, nullptr));
+    file.Close();
+    if (!outcome.Ok())
+        QFile::remove(path);
+    return outcome;
+}
+
+Outcome DatabaseFile::Remove(const QString& path)
+{
+    Outcome outcome;
+    const std::shared_ptr<DatabaseFile> file = Open(path, outcome);
+    if (!file)
+        return outcome;
+    if (file->IsReadOnly())
+        return {Hr::AccessDenied, StringText(Str::DatabaseIsReadOnly, {path})};
+    outcome = file->Execute("BEGIN EXCLUSIVE"); // busy while another program reads or writes
+    file->Close();
+    if (!outcome.Ok())
+        return outcome;
+    QFile whole(file->Path());
+    if (!whole.remove())
+        return {Hr::AccessDenied, StringText(Str::DatabaseFailure, {path, whole.errorString()})};
+    for (const QString& suffix : {u"-journal"_s, u"-wal"_s, u"-shm"_s})
+        QFile::remove(file->Path() + suffix);
+    return {};
+}
+
+DatabaseFile::~DatabaseFile()
+{
+    Close();
+}
+
+void DatabaseFile::Close()
+{
+    cache_->Clear();
+    cache_ = std::make_shared<StatementCache>(); // loans that are still out find theirs gone
+    handle_.reset();
+    bulkDepth_ = 0;
+}
+
+bool DatabaseFile::IsReadOnly() const
+{
+    return !handle_ || sqlite3_db_readonly(handle_.get(), "main") != 0;
+}
+
+Outcome DatabaseFile::OutcomeOf(int resultCode) const
+{
+    const QString reason = handle_ ? QString::fromUtf8(sqlite3_errmsg(handle_.get())) : QString();
+    return OutcomeOfSqlite(resultCode, path_, reason);
+}
+
+Statement DatabaseFile::Prepare(const QByteArray& sql, Outcome& outcome)
+{
+    Statement statement = cache_->Lend(handle_.get(), sql);
+    outcome = statement ? Outcome() : OutcomeOf(sqlite3_extended_errcode(handle_.get()));
+    return statement;
+}
+
+Outcome DatabaseFile::Execute(const QByteArray& sql)
+{
+    Outcome outcome;
+    Statement statement = Prepare(sql, outcome);
+    if (!statement)
+        return outcome;
+    int result = SQLITE_ROW;
+    while (result == SQLITE_ROW)
+        result = statement.Step();
+    return OutcomeOf(result);
+}
+
+qint64 DatabaseFile::Number(const QByteArray& sql)
+{
+    Outcome outcome;
+    Statement statement = Prepare(sql, outcome);
+    return statement && statement.Step() == SQLITE_ROW ? statement.Integer(0) : 0;
+}
+
+Outcome DatabaseFile::RefreshSchema()
+{
+    Outcome outcome;
+    qint64 version = 0;
+    {
+        Statement statement = Prepare("PRAGMA schema_version", outcome);
+        if (!statement)
+            return outcome;
+        const int result = statement.Step();
+        if (result != SQLITE_ROW)
+            return OutcomeOf(result);
+        version = statement.Integer(0);
+    }
+    if (version == schemaVersion_)
+        return {};
+    dialect::Schema fresh;
+    outcome = ReadSchema(*this, fresh);
+    if (outcome.Ok()) {
+        schema_ = std::move(fresh);
+        schemaVersion_ = version;
+    }
+    return outcome;
+}
+
+Outcome DatabaseFile::BeginBulk()
+{
+    if (bulkDepth_ == 0 && !InTransaction()) {
+        if (const Outcome outcome = Execute("BEGIN IMMEDIATE"); !outcome.Ok())
+            return outcome;
+    }
+    ++bulkDepth_;
+    return {};
+}
+
+Outcome DatabaseFile::EndBulk()
+{
+    if (bulkDepth_ == 0)
+        return {Hr::Unexpected, {}};
+    if (--bulkDepth_ > 0)
+        return {};
+    if (!InTransaction()) // a full disk or a failing device took the whole run back
+        return {Hr::Unexpected, StringText(Str::BulkRunUndone, {path_})};
+    Outcome outcome = Execute("COMMIT");
+    if (!outcome.Ok())
+        (void)Execute("ROLLBACK");
+    return outcome;
+}
+
+} // namespace mirel::sqlite

@@ -1,0 +1,75 @@
+#include "provider/sqlite/date_forms.h"
+
+#include <cmath>
+#include <string>
+
+namespace mirel::sqlite {
+namespace {
+
+constexpr double kJulianOfBaseDate = 2415018.5; // 1899-12-30, midnight
+constexpr double kFirstJulian = 1721425.5;      // 0001-01-01
+constexpr double kEndOfJulian = 5373484.5;      // the day after 9999-12-31
+constexpr double kUnixOfBaseDate = -2209161600;
+constexpr double kLastUnixSecond = 253402300799;
+constexpr double kSecondsPerDay = 86400;
+
+// In a day number the fraction counts forward also before the base date.
+double OleDaysOf(double daysSinceBaseDate)
+{
+    const double whole = std::floor(daysSinceBaseDate);
+    const double fraction = daysSinceBaseDate - whole;
+    return whole < 0 ? whole - fraction : whole + fraction;
+}
+
+// Characters of `text` against `form`, where "0" stands for any digit.
+bool HasForm(std::string_view text, std::string_view form)
+{
+    if (text.size() != form.size())
+        return false;
+    for (size_t i = 0; i < form.size(); ++i) {
+        const bool fits = form[i] == '0' ? text[i] >= '0' && text[i] <= '9' : text[i] == form[i];
+        if (!fits)
+            return false;
+    }
+    return true;
+}
+
+} // namespace
+
+bool IsStoredDateForm(std::string_view text)
+{
+    switch (text.size()) {
+    case 10:
+        return HasForm(text, "0000-00-00");
+    case 19:
+        return HasForm(text, "0000-00-00 00:00:00");
+    case 23:
+        return HasForm(text, "0000-00-00 00:00:00.000");
+    default:
+        return false;
+    }
+}
+
+std::optional<StoredDate> StoredDateOfText(std::string_view text)
+{
+    constexpr size_t kLongest = 64;
+    if (text.size() > kLongest)
+        return {};
+    std::optional<double> days = OleDateFromStored(text);
+    if (!days && text.find('-') == std::string_view::npos)
+        days = OleDateFromStored("1899-12-30 " + std::string(text));
+    return days ? StoredDateOf(*days) : std::nullopt;
+}
+
+std::optional<StoredDate> StoredDateOfNumber(double number)
+{
+    if (number >= kFirstJulian && number < kEndOfJulian)
+        return StoredDateOf(OleDaysOf(number - kJulianOfBaseDate));
+    if (std::abs(number) > kLastUnixSecond)
+        number /= 1000;
+    if (!(std::abs(number) <= kLastUnixSecond))
+        return {};
+    return StoredDateOf(OleDaysOf((number - kUnixOfBaseDate) / kSecondsPerDay));
+}
+
+} // namespace mirel::sqlite
