@@ -1,0 +1,36 @@
+#pragma once
+
+#include "provider/provider.h"
+#include "provider/sqlite/outcome.h"
+
+#include <QHash>
+
+#include <memory>
+
+namespace mirel::sqlite {
+
+class DatabaseFile;
+
+// The provider "cedb": databases in SQLite files, one handle a file.
+class CedbProvider : public ProviderConnection {
+public:
+    CedbProvider() = default;
+    ~CedbProvider() override;
+    Q_DISABLE_COPY_MOVE(CedbProvider)
+
+    std::unique_ptr<ProviderRecordset> CreateRecordset() override;
+    std::unique_ptr<RecordAppender> CreateAppender(const QString& database, const QString& table,
+                                                   const QStringList& columns, Hr& result,
+                                                   QString& context) override;
+    Hr BeginBulk(const QString& database) override;
+    Hr EndBulk(const QString& database) override;
+    void CloseDatabase(const QString& database) override;
+
+    // The file of that path, opened when it is not yet; null, and why, when it cannot be.
+    std::shared_ptr<DatabaseFile> FileOf(const QString& database, Outcome& outcome);
+
+private:
+    QHash<QString, std::shared_ptr<DatabaseFile>> files_; // by IdentityOfPath
+};
+
+} // namespace mirel::sqlite

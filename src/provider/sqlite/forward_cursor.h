@@ -1,0 +1,46 @@
+#pragma once
+
+#include "provider/sqlite/database_file.h"
+#include "provider/sqlite/plan.h"
+#include "provider/sqlite/result_cursor.h"
+
+#include <memory>
+#include <vector>
+
+namespace mirel::sqlite {
+
+// Walks a result once, from its first record to its end. Holds a block of records at a time, so that no
+// statement is left running between two calls.
+class ForwardCursor : public ResultCursor {
+public:
+    ForwardCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan);
+
+    Outcome Open() override { return FetchBlock(); }
+    std::span<const ResultField> Fields() const override { return plan_.fields; }
+
+    bool AtBegin() const override { return false; }
+    bool AtEnd() const override { return position_ >= blockStart_ + qint64(block_.size()); }
+    qint64 Position() const override { return AtEnd() ? -1 : position_; }
+    Outcome MoveFirst() override;
+    Outcome MoveLast() override;
+    Outcome MoveNext() override;
+    Outcome MovePrevious() override;
+    Outcome MoveTo(qint64 position) override;
+
+    Outcome GetValue(int field, Value& value) override;
+    Outcome Read(const ReadRange& range, const CellSink& sink) override;
+
+private:
+    Outcome FetchBlock();
+    Outcome Walk(const std::vector<int>& fields, const CellSink& sink);
+    void Keep(std::span<const Cell> cells);
+
+    std::shared_ptr<DatabaseFile> file_;
+    SelectPlan plan_;
+    std::vector<std::vector<Value>> block_;
+    qint64 blockStart_ = 0;
+    bool blockIsLast_ = false;
+    qint64 position_ = 0;
+};
+
+} // namespace mirel::sqlite

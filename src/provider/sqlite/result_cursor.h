@@ -1,0 +1,44 @@
+#pragma once
+
+#include "provider/provider.h"
+#include "provider/sqlite/outcome.h"
+
+#include <span>
+
+namespace mirel::sqlite {
+
+// The rows of one SELECT and a position in them, as the recordset of the provider sees them: see
+// ProviderRecordset for what the calls mean. The file is open whenever one is made.
+class ResultCursor {
+public:
+    virtual ~ResultCursor() = default;
+
+    // Runs the SELECT and stands on its first record.
+    virtual Outcome Open() = 0;
+    virtual std::span<const ResultField> Fields() const = 0;
+    virtual bool IsUpdatable() const { return false; }
+
+    virtual qint64 RecordCount() { return -1; }
+    virtual bool CountStep(int /*budgetMs*/) { return true; }
+    virtual quint64 Generation() const { return 0; }
+
+    virtual bool AtBegin() const = 0;
+    virtual bool AtEnd() const = 0;
+    virtual qint64 Position() const = 0;
+    virtual Outcome MoveFirst() = 0;
+    virtual Outcome MoveLast() = 0;
+    virtual Outcome MoveNext() = 0;
+    virtual Outcome MovePrevious() = 0;
+    virtual Outcome MoveTo(qint64 position) = 0;
+
+    virtual Outcome GetValue(int field, Value& value) = 0;
+    virtual Outcome Read(const ReadRange& range, const CellSink& sink) = 0;
+
+    virtual Outcome AddNew(std::span<const FieldChange>) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome Update(std::span<const FieldChange>) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome Delete() { return {Hr::ReadOnly, {}}; }
+    virtual Outcome UpdateAll(int, const Value&, const BulkProgress&) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome DeleteAll(const BulkProgress&) { return {Hr::ReadOnly, {}}; }
+};
+
+} // namespace mirel::sqlite
