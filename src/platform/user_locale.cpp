@@ -2,6 +2,7 @@
 
 #include "platform/date_text_reader.h"
 #include "platform/number_text.h"
+#include "platform/number_text.h"
 #include "platform/ole_date.h"
 
 #include <QDate>
@@ -122,7 +123,7 @@ QString UserLocale::DateTimeText(double oleDays) const
     const std::optional<DateParts> parts = PartsOfOleDate(oleDays);
     if (!parts)
         return {};
-    const QString time = locale_.toString(TimeOf(*parts), timeFormat_);
+    QString time = locale_.toString(TimeOf(*parts), timeFormat_);
     if (IsBaseDate(*parts))
         return time;
     const QString date = locale_.toString(DateOf(*parts), dateFormat_);
