@@ -1,0 +1,199 @@
+#include "cli/arguments.h"
+
+#include "cli/command.h"
+#include "resources/string_table.h"
+
+#include <algorithm>
+
+namespace mirel::cli {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+QString FromAscii(const char* text)
+{
+    return QString::fromLatin1(text);
+}
+
+bool IsTakenBy(const CommandDef* command, Opt option)
+{
+    constexpr std::array kEverywhere = {Opt::Home, Opt::Help, Opt::Timing};
+    if (std::ranges::find(kEverywhere, option) != kEverywhere.end())
+        return true;
+    return command ? std::ranges::find(command->options, option) != command->options.end()
+                   : option == Opt::Version;
+}
+
+// Takes words apart one after the other.
+class Parser {
+public:
+    Parser(const QStringList& words, QString& fault)
+        : words_(words)
+        , fault_(fault)
+    {
+    }
+
+    std::optional<Arguments> Parse()
+    {
+        while (at_ < words_.size()) {
+            const QString word = words_[at_++];
+            if (word == u"--"_s && !onlyArguments_)
+                onlyArguments_ = true;
+            else if (!onlyArguments_ && word.size() > 1 && word.startsWith(u'-') ? !TakeOption(word)
+                                                                                 : !TakeArgument(word))
+                return {};
+        }
+        return IsComplete() ? std::optional(arguments_) : std::nullopt;
+    }
+
+    const CommandDef* Command() const { return arguments_.command; }
+
+private:
+    bool Refuse(Str message, const QStringList& arguments = {})
+    {
+        fault_ = StringText(message, arguments);
+        return false;
+    }
+
+    bool TakeOption(const QString& word)
+    {
+        const qsizetype equals = word.indexOf(u'=');
+        const QString name = word.left(equals);
+        const OptionDef* option = FindOption(name);
+        if (!option)
+            return Refuse(Str::CliUnknownOption, {name});
+        QString value;
+        if (option->kind == ValueKind::Flag) {
+            if (equals >= 0)
+                return Refuse(Str::CliFlagTakesNoValue, {name});
+        } else if (equals >= 0) {
+            value = word.mid(equals + 1);
+        } else if (at_ < words_.size()) {
+            value = words_[at_++];
+        } else {
+            return Refuse(Str::CliValueMissing, {name, FromAscii(option->value)});
+        }
+        if (!IsValidValue(option->kind, value))
+            return Refuse(Str::CliValueWrong, {value, name, FromAscii(option->value)});
+        arguments_.options.push_back({option->id, value});
+        return true;
+    }
+
+    bool TakeArgument(const QString& word)
+    {
+        if (arguments_.command) {
+            arguments_.positional += word;
+            return true;
+        }
+        // The commands of a group are two words.
+        const QString two = at_ < words_.size() ? word + u' ' + words_[at_] : word;
+        if (const CommandDef* ofGroup = FindCommand(two); ofGroup && two != word) {
+            ++at_;
+            arguments_.command = ofGroup;
+            return true;
+        }
+        arguments_.command = FindCommand(word);
+        return arguments_.command ? true : Refuse(Str::CliUnknownCommand, {word});
+    }
+
+    bool IsComplete()
+    {
+        for (const Arguments::Given& given : arguments_.options) {
+            if (!IsTakenBy(arguments_.command, given.option))
+                return Refuse(Str::CliOptionNotHere, {FromAscii(DefinitionOf(given.option).name)});
+        }
+        if (arguments_.Has(Opt::Help) || arguments_.Has(Opt::Version))
+            return true;
+        if (!arguments_.command)
+            return Refuse(Str::CliCommandMissing);
+        const ArgumentCount allowed = ArgumentCountOf(*arguments_.command);
+        const qsizetype given = arguments_.positional.size();
+        if (given < allowed.least)
+            return Refuse(Str::CliArgumentsMissing, {FromAscii(arguments_.command->arguments)});
+        if (given > allowed.most)
+            return Refuse(Str::CliArgumentTooMany, {arguments_.positional[allowed.most]});
+        for (const Opt needed : arguments_.command->needed) {
+            if (!arguments_.Has(needed))
+                return Refuse(Str::CliOptionNeeded, {FromAscii(DefinitionOf(needed).name)});
+        }
+        return true;
+    }
+
+    const QStringList& words_;
+    QString& fault_;
+    qsizetype at_ = 0;
+    bool onlyArguments_ = false;
+    Arguments arguments_;
+};
+
+QString OptionLine(Opt id)
+{
+    const OptionDef& option = DefinitionOf(id);
+    const QString left = (FromAscii(option.name) + u' ' + FromAscii(option.value)).trimmed();
+    return u"  "_s + left.leftJustified(26) + u"  "_s + FromAscii(option.help) + u'\n';
+}
+
+QString CommandLine(const CommandDef& command)
+{
+    return (FromAscii(command.name) + u' ' + FromAscii(command.arguments)).trimmed();
+}
+
+} // namespace
+
+bool Arguments::Has(Opt option) const
+{
+    return std::ranges::find(options, option, &Given::option) != options.end();
+}
+
+QString Arguments::Text(Opt option, const QString& otherwise) const
+{
+    const auto last = std::find_if(options.rbegin(), options.rend(),
+                                   [option](const Given& given) { return given.option == option; });
+    return last == options.rend() ? otherwise : last->value;
+}
+
+qint64 Arguments::Count(Opt option, qint64 otherwise) const
+{
+    return Has(option) ? Text(option).toLongLong() : otherwise;
+}
+
+char16_t Arguments::Character(Opt option, char16_t otherwise) const
+{
+    return Has(option) ? CharacterOf(DefinitionOf(option).kind, Text(option)).value_or(otherwise) : otherwise;
+}
+
+std::optional<Arguments> ParseArguments(const QStringList& words, QString& fault, const CommandDef*& command)
+{
+    Parser parser(words, fault);
+    std::optional<Arguments> arguments = parser.Parse();
+    command = parser.Command();
+    return arguments;
+}
+
+QString ProgramHelp()
+{
+    QString help = StringText(Str::CliUsage) + u"\n\n"_s;
+    for (const CommandDef& command : Commands())
+        help += u"  "_s + CommandLine(command).leftJustified(34) + u"  "_s + FromAscii(command.help) + u'\n';
+    help += u'\n';
+    for (const Opt option : {Opt::Home, Opt::Timing, Opt::Help, Opt::Version})
+        help += OptionLine(option);
+    return help;
+}
+
+QString CommandHelp(const CommandDef& command)
+{
+    QString help = u"mirel-cli "_s + CommandLine(command);
+    for (const Opt needed : command.needed) {
+        const OptionDef& option = DefinitionOf(needed);
+        help += u' ' + (FromAscii(option.name) + u' ' + FromAscii(option.value)).trimmed();
+    }
+    help += u"\n\n"_s + FromAscii(command.help) + u"\n\n"_s;
+    for (const Opt option : command.options)
+        help += OptionLine(option);
+    for (const Opt option : {Opt::Home, Opt::Timing, Opt::Help})
+        help += OptionLine(option);
+    return help;
+}
+
+} // namespace mirel::cli

@@ -1,0 +1,58 @@
+#include "cli/command.h"
+
+#include "cli/commands.h"
+
+#include <algorithm>
+#include <array>
+
+namespace mirel::cli {
+namespace {
+
+constexpr std::array kDropOptions = {Opt::Yes};
+constexpr std::array kFormatOptions = {Opt::Format};
+constexpr std::array kSqlOptions = {Opt::Format, Opt::Offset, Opt::Limit};
+constexpr std::array kImportOptions = {
+    Opt::Table,         Opt::Create,    Opt::Columns,       Opt::Header,        Opt::Separator, Opt::Quote,
+    Opt::DoubledQuotes, Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator, Opt::Encoding,  Opt::WholeTexts,
+};
+constexpr std::array kImportNeeds = {Opt::Table};
+
+constexpr std::array kCommands = {
+    CommandDef{"new", "DB", "create a database", {}, {}, RunNew},
+    CommandDef{"drop", "DB", "delete a database with its forms, queries and favorites", kDropOptions, kDropOptions,
+               RunDrop},
+    CommandDef{"sql",
+               "DB STATEMENT",
+               "run a statement (-: statements from standard input), print its records",
+               kSqlOptions,
+               {},
+               RunSql},
+    CommandDef{"tables", "DB", "list the tables", {}, {}, RunTables},
+    CommandDef{"fields", "DB TABLE", "list the fields of a table", kFormatOptions, {}, RunFields},
+    CommandDef{"import", "DB FILE", "read a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
+    CommandDef{"config get", "SECTION KEY", "print a setting", {}, {}, RunConfigGet},
+    CommandDef{"config set", "SECTION KEY VALUE", "change a setting", {}, {}, RunConfigSet},
+};
+
+} // namespace
+
+std::span<const CommandDef> Commands()
+{
+    return kCommands;
+}
+
+const CommandDef* FindCommand(QStringView name)
+{
+    const auto command = std::ranges::find_if(
+        kCommands, [name](const CommandDef& each) { return name == QLatin1StringView(each.name); });
+    return command == kCommands.end() ? nullptr : &*command;
+}
+
+ArgumentCount ArgumentCountOf(const CommandDef& command)
+{
+    const QStringList words = QString::fromLatin1(command.arguments).split(u' ', Qt::SkipEmptyParts);
+    const auto optional = std::ranges::count_if(words, [](const QString& word) { return word.startsWith(u'['); });
+    return {words.size() - optional, words.size()};
+}
+
+} // namespace mirel::cli

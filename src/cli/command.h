@@ -1,0 +1,35 @@
+#pragma once
+
+#include "cli/arguments.h"
+#include "cli/output.h"
+
+#include <initializer_list>
+#include <span>
+
+namespace mirel::cli {
+
+class Run;
+
+enum class ExitStatus : int { Done = 0, Failed = 1, BadArguments = 2 };
+
+// One command: a row of the table in command.cpp, which parser, help and program read. A new command is one row
+// there and one function, declared in commands.h.
+struct CommandDef {
+    const char* name;      // one word, or the two of a group: "forms list"
+    const char* arguments; // as the help shows them, optional ones in brackets
+    const char* help;      // one line
+    std::span<const Opt> options;
+    std::span<const Opt> needed; // of these, the ones that must be given
+    ExitStatus (*run)(Run& run);
+};
+
+struct ArgumentCount {
+    qsizetype least;
+    qsizetype most;
+};
+
+std::span<const CommandDef> Commands();
+const CommandDef* FindCommand(QStringView name); // null: there is none
+ArgumentCount ArgumentCountOf(const CommandDef& command);
+
+} // namespace mirel::cli

@@ -1,0 +1,25 @@
+#pragma once
+
+#include "cli/command.h"
+
+namespace mirel::cli {
+
+// The functions behind the rows of the command table, by the file that holds them.
+
+// database_commands.cpp
+ExitStatus RunNew(Run& run);
+ExitStatus RunDrop(Run& run);
+ExitStatus RunTables(Run& run);
+ExitStatus RunFields(Run& run);
+
+// sql_command.cpp
+ExitStatus RunSql(Run& run);
+
+// import_command.cpp
+ExitStatus RunImport(Run& run);
+
+// config_commands.cpp
+ExitStatus RunConfigGet(Run& run);
+ExitStatus RunConfigSet(Run& run);
+
+} // namespace mirel::cli

@@ -1,0 +1,164 @@
+#include "cli/commands.h"
+#include "cli/run.h"
+#include "csvimport/csv_import.h"
+#include "csvimport/utf8_source.h"
+#include "data/provider_error.h"
+
+#include <QFile>
+
+#include <algorithm>
+
+namespace mirel::cli {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+// One import, from the options to the report.
+class ImportCommand {
+public:
+    explicit ImportCommand(Run& run)
+        : run_(run)
+        , path_(run.PathArgument(1))
+        , database_(run.Session().Path())
+    {
+        plan_.format = FormatOf(run.Args());
+        plan_.table = TableName(run.Args().Text(Opt::Table));
+        if (run.Args().Has(Opt::WholeTexts))
+            plan_.longTexts = CellReader::LongTexts::KeepWhole;
+    }
+
+    bool Execute()
+    {
+        if (!Utf8Source::IsKnownEncoding(plan_.format.encoding))
+            return Tell({Str::ImportUnknownEncoding, {plan_.format.encoding}});
+        const bool isPlanned = run_.Args().Has(Opt::Create) ? PlanNewTable() : PlanExistingTable();
+        if (!isPlanned)
+            return false;
+        if (run_.Args().Has(Opt::Create) && !run_.Session().GetCatalog().ExecuteStatement(
+                                                database_, CreateTableStatement(plan_.table, plan_.columns)))
+            return false;
+        return Import();
+    }
+
+private:
+    static CsvFormat FormatOf(const Arguments& arguments)
+    {
+        CsvFormat format;
+        format.separator = arguments.Character(Opt::Separator, format.separator);
+        format.quote = arguments.Character(Opt::Quote, format.quote);
+        format.doubledQuotes = arguments.Has(Opt::DoubledQuotes);
+        format.namesInFirstLine = arguments.Has(Opt::Header);
+        format.dates.order = DateOrder(arguments.Count(Opt::DateOrder, int(DateOrder::Locale)));
+        format.dates.dateSeparator = arguments.Character(Opt::DateSeparator, format.dates.dateSeparator);
+        format.dates.timeSeparator = arguments.Character(Opt::TimeSeparator, format.dates.timeSeparator);
+        format.encoding = arguments.Text(Opt::Encoding, format.encoding);
+        return format;
+    }
+
+    // A name in brackets is the name inside.
+    static QString TableName(const QString& given)
+    {
+        return given.startsWith(u'[') && given.endsWith(u']') ? given.mid(1, given.size() - 2) : given;
+    }
+
+    bool Tell(const UserMessage& message)
+    {
+        run_.Prompt().Show(message);
+        return false;
+    }
+
+    // The file is opened anew for each time that it is read from its beginning.
+    bool OpenFile(QFile& file)
+    {
+        file.setFileName(path_);
+        if (file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
+            return true;
+        return Tell({Str::ImportCannotOpen, {run_.Argument(1), file.errorString()}});
+    }
+
+    bool FirstLine(QStringList& texts)
+    {
+        QFile file;
+        return OpenFile(file) && ReadFirstLine(file, plan_.format, texts, run_.Prompt());
+    }
+
+    bool PlanNewTable()
+    {
+        const QString list = run_.Args().Text(Opt::Columns);
+        UserMessage fault;
+        if (list == u"auto") {
+            QFile file;
+            if (!OpenFile(file) || !GuessColumns(file, plan_.format, plan_.columns, run_.Prompt()))
+                return false;
+        } else if (run_.Args().Has(Opt::Columns)) {
+            if (!ParseColumnList(list, plan_.columns, fault))
+                return Tell(fault);
+        } else {
+            QStringList first;
+            if (!FirstLine(first))
+                return false;
+            plan_.columns =
+                plan_.format.namesInFirstLine ? ColumnsNamed(first) : NumberedColumns(int(first.size()));
+        }
+        return CheckNewColumns(plan_.columns, fault) || Tell(fault);
+    }
+
+    bool PlanExistingTable()
+    {
+        DbRecordset table(run_.Connection());
+        if (!table.Open(u'[' + plan_.table + u']', database_, CursorType::ForwardOnly, LockType::ReadOnly)) {
+            ReportProviderError(run_.Prompt(), &table, table.LastResult());
+            return false;
+        }
+        const std::span<const ResultField> fields = table.Fields();
+        const QString list = run_.Args().Text(Opt::Columns, u"auto"_s);
+        UserMessage fault;
+        if (list != u"auto") {
+            return (ParseColumnList(list, plan_.columns, fault) &&
+                    MatchByName(plan_.table, fields, plan_.columns, fault)) ||
+                   Tell(fault);
+        }
+        QStringList first;
+        if (!FirstLine(first))
+            return false;
+        if (!plan_.format.namesInFirstLine)
+            return MatchInOrder(plan_.table, fields, int(first.size()), plan_.columns, fault) || Tell(fault);
+        for (const QString& name : first) {
+            ImportColumn column;
+            column.field = name;
+            plan_.columns.push_back(column);
+        }
+        return MatchByName(plan_.table, fields, plan_.columns, fault) || Tell(fault);
+    }
+
+    bool Import()
+    {
+        QFile file;
+        ImportReport report;
+        if (!OpenFile(file))
+            return false;
+        const bool complete = ImportCsv(run_.Connection(), database_, file, plan_, run_.Prompt(), report);
+        run_.Times().rows = report.records;
+        for (const UserMessage& warning : report.Warnings())
+            run_.Prompt().Show(warning);
+        if (report.stopped)
+            run_.Prompt().Show(report.Count());
+        else if (complete && report.records > 0)
+            run_.Out().WriteLine(report.Count().Text());
+        return complete && !report.stopped;
+    }
+
+    Run& run_;
+    QString path_;
+    QString database_;
+    ImportPlan plan_;
+};
+
+} // namespace
+
+ExitStatus RunImport(Run& run)
+{
+    return run.OpenDatabase() && ImportCommand(run).Execute() ? ExitStatus::Done : ExitStatus::Failed;
+}
+
+} // namespace mirel::cli

@@ -1,0 +1,127 @@
+#include "cli/option.h"
+
+#include "cli/record_writer.h"
+
+#include <algorithm>
+#include <array>
+
+namespace mirel::cli {
+namespace {
+
+constexpr std::array kOptions = {
+    OptionDef{Opt::Home, "--home", ValueKind::Text, "DIR", "the program folder (else MIREL_HOME)"},
+    OptionDef{Opt::Help, "--help", ValueKind::Flag, "", "show this help"},
+    OptionDef{Opt::Version, "--version", ValueKind::Flag, "", "show the version"},
+    OptionDef{Opt::Timing, "--timing", ValueKind::Flag, "", "end with one line of JSON about the time it took"},
+    OptionDef{Opt::Yes, "--yes", ValueKind::Flag, "", "do it: nothing is asked"},
+    OptionDef{Opt::Format, "--format", ValueKind::Format, "table|csv|tsv|json|jsonl", "how records are written"},
+    OptionDef{Opt::Offset, "--offset", ValueKind::Count, "N", "leave out the first N records"},
+    OptionDef{Opt::Limit, "--limit", ValueKind::Count, "N", "write at most N records"},
+    OptionDef{Opt::Table, "--table", ValueKind::Text, "NAME", "the table"},
+    OptionDef{Opt::Create, "--create", ValueKind::Flag, "", "make the table first"},
+    OptionDef{
+        Opt::Columns, "--columns", ValueKind::Text, "auto|LIST",
+        "the file's columns in order, \"Name:Type[:Size],...\", \"-\" for one to leave out; auto: names from "
+        "the first line, types from the data"},
+    OptionDef{Opt::Header, "--header", ValueKind::Flag, "", "the first line holds the field names"},
+    OptionDef{Opt::Separator, "--separator", ValueKind::Separator, "comma|semicolon|tab|space|C",
+              "what stands between the texts (comma)"},
+    OptionDef{Opt::Quote, "--quote", ValueKind::Quote, "C|none", "the quotation mark (\")"},
+    OptionDef{Opt::DateOrder, "--date-order", ValueKind::DateOrder, "0..6",
+              "0 month-day-year, 1 month-year-day, 2 year-day-month, 3 year-month-day, 4 day-month-year, "
+              "5 day-year-month, 6 as the locale writes it (6)"},
+    OptionDef{Opt::DateSeparator, "--date-separator", ValueKind::Character, "C",
+              "between the parts of a date, for the orders 0 to 5 (-)"},
+    OptionDef{Opt::TimeSeparator, "--time-separator", ValueKind::Character, "C",
+              "between the parts of a time, for the orders 0 to 5 (:)"},
+    OptionDef{Opt::DoubledQuotes, "--doubled-quotes", ValueKind::Flag, "",
+              "a quotation mark inside a quoted text is doubled"},
+    OptionDef{Opt::Encoding, "--encoding", ValueKind::Text, "NAME", "how the file writes characters (UTF-8)"},
+    OptionDef{Opt::WholeTexts, "--whole-texts", ValueKind::Flag, "",
+              "keep texts of more than 8192 characters whole"},
+};
+
+constexpr bool StandInTheOrderOfTheirIds()
+{
+    for (size_t i = 0; i < kOptions.size(); ++i) {
+        if (size_t(kOptions[i].id) != i)
+            return false;
+    }
+    return true;
+}
+static_assert(StandInTheOrderOfTheirIds());
+
+struct NamedCharacter {
+    QLatin1StringView name;
+    char16_t character;
+};
+constexpr std::array kSeparators = {
+    NamedCharacter{QLatin1StringView("comma"), u','},
+    NamedCharacter{QLatin1StringView("semicolon"), u';'},
+    NamedCharacter{QLatin1StringView("tab"), u'\t'},
+    NamedCharacter{QLatin1StringView("space"), u' '},
+};
+constexpr std::array kQuotes = {NamedCharacter{QLatin1StringView("none"), 0}};
+
+std::span<const NamedCharacter> NamedCharacters(ValueKind kind)
+{
+    if (kind == ValueKind::Separator)
+        return kSeparators;
+    if (kind == ValueKind::Quote)
+        return kQuotes;
+    return {};
+}
+
+} // namespace
+
+std::span<const OptionDef> Options()
+{
+    return kOptions;
+}
+
+const OptionDef& DefinitionOf(Opt id)
+{
+    return kOptions[size_t(id)];
+}
+
+const OptionDef* FindOption(QStringView name)
+{
+    const auto option = std::ranges::find_if(
+        kOptions, [name](const OptionDef& each) { return name == QLatin1StringView(each.name); });
+    return option == kOptions.end() ? nullptr : &*option;
+}
+
+std::optional<char16_t> CharacterOf(ValueKind kind, QStringView text)
+{
+    for (const NamedCharacter& each : NamedCharacters(kind)) {
+        if (text == each.name)
+            return each.character;
+    }
+    // A line end would cut every record apart, and half a character is none.
+    if (text.size() != 1 || text[0].isSurrogate() || text[0].isNull() || text[0] == u'\n' || text[0] == u'\r')
+        return {};
+    return text[0].unicode();
+}
+
+bool IsValidValue(ValueKind kind, const QString& text)
+{
+    bool ok = false;
+    switch (kind) {
+    case ValueKind::Flag:
+    case ValueKind::Text:
+        return true;
+    case ValueKind::Count:
+        return text.toLongLong(&ok) >= 0 && ok;
+    case ValueKind::Format:
+        return FormatOfName(text).has_value();
+    case ValueKind::Separator:
+    case ValueKind::Quote:
+    case ValueKind::Character:
+        return CharacterOf(kind, text).has_value();
+    case ValueKind::DateOrder:
+        return text.size() == 1 && text[0] >= u'0' && text[0] <= u'6';
+    }
+    return false;
+}
+
+} // namespace mirel::cli

@@ -1,0 +1,157 @@
+#include "cli/record_writer.h"
+
+#include "cli/cell_text.h"
+#include "cli/json_writer.h"
+#include "cli/table_writer.h"
+
+#include <algorithm>
+#include <array>
+#include <vector>
+
+namespace mirel::cli {
+namespace {
+
+// What ends or encloses a text, and so asks for marks around it or for an escape.
+class ByteSet {
+public:
+    constexpr explicit ByteSet(std::string_view bytes)
+    {
+        for (const char byte : bytes)
+            holds_[static_cast<unsigned char>(byte)] = true;
+    }
+    constexpr bool Holds(char byte) const { return holds_[static_cast<unsigned char>(byte)]; }
+    bool HoldsAnyOf(std::string_view text) const
+    {
+        return std::ranges::any_of(text, [this](char byte) { return Holds(byte); });
+    }
+
+private:
+    std::array<bool, 256> holds_{};
+};
+
+// RFC 4180's quotation: a text with a separator, a mark or a line end stands in marks, inner ones doubled.
+void WriteCsvText(Output& output, std::string_view text)
+{
+    static constexpr ByteSet kNeedMarks(",\"\r\n");
+    if (!kNeedMarks.HoldsAnyOf(text)) {
+        output.Write(text);
+        return;
+    }
+    output.Write('"');
+    for (size_t mark; (mark = text.find('"')) != std::string_view::npos; text.remove_prefix(mark + 1)) {
+        output.Write(text.substr(0, mark + 1));
+        output.Write('"');
+    }
+    output.Write(text);
+    output.Write('"');
+}
+
+// What a line of tab-separated texts cannot hold is written as \t, \n, \r and \\.
+void WriteTsvText(Output& output, std::string_view text)
+{
+    static constexpr std::string_view kEscaped = "\t\n\r\\";
+    static constexpr std::string_view kLetters = "tnr\\";
+    static constexpr ByteSet kNeedEscape(kEscaped);
+    if (!kNeedEscape.HoldsAnyOf(text)) {
+        output.Write(text);
+        return;
+    }
+    for (const char byte : text) {
+        const size_t escape = kEscaped.find(byte);
+        if (escape != std::string_view::npos)
+            output.Write('\\');
+        output.Write(escape == std::string_view::npos ? byte : kLetters[escape]);
+    }
+}
+
+// A header line and a line a record, with a separator between the texts.
+class DelimitedWriter : public RecordWriter {
+public:
+    using WriteText = void (*)(Output& output, std::string_view text);
+
+    DelimitedWriter(Output& output, const YesNoWords& words, char separator, WriteText writeText)
+        : output_(output)
+        , cellText_(words)
+        , separator_(separator)
+        , writeText_(writeText)
+    {
+    }
+
+    void Begin(std::span<const ResultField> fields) override
+    {
+        fields_ = fields;
+        for (size_t i = 0; i < fields.size(); ++i) {
+            WriteSeparator(i);
+            writeText_(output_, View(fields[i].name.toUtf8()));
+        }
+        output_.Write('\n');
+    }
+
+    bool Record(std::span<const Cell> cells) override
+    {
+        for (size_t i = 0; i < cells.size(); ++i) {
+            WriteSeparator(i);
+            const std::string_view text = cellText_.Of(cells[i], fields_[i].type);
+            if (cells[i].kind == Cell::Kind::Real || cells[i].kind == Cell::Kind::Null)
+                output_.Write(text);
+            else
+                writeText_(output_, text);
+        }
+        output_.Write('\n');
+        return !output_.HasFailed();
+    }
+
+    void End() override {}
+
+private:
+    void WriteSeparator(size_t column)
+    {
+        if (column > 0)
+            output_.Write(separator_);
+    }
+
+    Output& output_;
+    CellText cellText_;
+    char separator_;
+    WriteText writeText_;
+    std::span<const ResultField> fields_;
+};
+
+struct FormatName {
+    QLatin1StringView name;
+    OutputFormat format;
+};
+constexpr std::array kFormats = {
+    FormatName{QLatin1StringView("table"), OutputFormat::Table},
+    FormatName{QLatin1StringView("csv"), OutputFormat::Csv},
+    FormatName{QLatin1StringView("tsv"), OutputFormat::Tsv},
+    FormatName{QLatin1StringView("json"), OutputFormat::Json},
+    FormatName{QLatin1StringView("jsonl"), OutputFormat::JsonLines},
+};
+
+} // namespace
+
+std::optional<OutputFormat> FormatOfName(QStringView name)
+{
+    const auto row = std::ranges::find_if(kFormats, [name](const FormatName& each) { return name == each.name; });
+    return row == kFormats.end() ? std::nullopt : std::optional(row->format);
+}
+
+std::unique_ptr<RecordWriter> MakeRecordWriter(OutputFormat format, Output& output, const YesNoWords& words)
+{
+    switch (format) {
+    case OutputFormat::Table:
+        return std::make_unique<TableWriter>(output, words);
+    case OutputFormat::Csv:
+        return std::make_unique<DelimitedWriter>(output, words, ',', WriteCsvText);
+    case OutputFormat::Tsv:
+        return std::make_unique<DelimitedWriter>(output, words, '\t', WriteTsvText);
+    case OutputFormat::Json:
+        return std::make_unique<JsonWriter>(output, JsonWriter::Shape::Array);
+    case OutputFormat::JsonLines:
+        return std::make_unique<JsonWriter>(output, JsonWriter::Shape::Lines);
+    }
+    return nullptr;
+}
+
+} // namespace mirel::cli

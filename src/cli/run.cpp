@@ -1,0 +1,99 @@
+#include "cli/run.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QJsonDocument>
+#include <QJsonObject>
+
+namespace mirel::cli {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+ExitStatus RefuseArguments(const QString& fault, const CommandDef* command)
+{
+    const QString name = command ? u' ' + QString::fromLatin1(command->name) : QString();
+    WriteMessage(fault + u'\n' + StringText(Str::CliSeeHelp, {name}));
+    return ExitStatus::BadArguments;
+}
+
+ExitStatus RunCommand(Run& run)
+{
+    const ExitStatus status = run.Args().command->run(run);
+    if (run.Args().Has(Opt::Timing))
+        run.WriteTiming();
+    return WasInterrupted() && status == ExitStatus::Done ? ExitStatus::Failed : status;
+}
+
+// A command that wrote into nowhere has failed; where the reader went away there is nobody to be told.
+ExitStatus EndOutput(Output& output, ExitStatus status)
+{
+    if (output.Flush())
+        return status;
+    if (!output.IsBrokenPipe())
+        WriteMessage(StringText(Str::CliCannotWrite, {output.Reason()}));
+    return ExitStatus::Failed;
+}
+
+} // namespace
+
+Run::Run(Arguments arguments, Output& output)
+    : arguments_(std::move(arguments))
+    , output_(output)
+    , folder_(ProgramFolder::Find(arguments_.Text(Opt::Home)))
+    , prompt_(arguments_.Has(Opt::Yes))
+    , session_(connection_, folder_, prompt_)
+{
+    sinceStart_.start();
+}
+
+QString Run::PathArgument(int index) const
+{
+    return QDir::cleanPath(QFileInfo(Argument(index)).absoluteFilePath());
+}
+
+bool Run::OpenDatabase()
+{
+    const bool open = session_.Open(PathArgument(0));
+    timing_.openMs = sinceStart_.elapsed();
+    return open;
+}
+
+std::unique_ptr<RecordWriter> Run::MakeWriter()
+{
+    const OutputFormat format = FormatOfName(arguments_.Text(Opt::Format)).value_or(OutputFormat::Table);
+    return MakeRecordWriter(format, output_, Settings(Profile(folder_.ProfileFile())).Words());
+}
+
+void Run::WriteTiming() const
+{
+    QJsonObject line{{u"open_ms"_s, timing_.openMs},
+                     {u"run_ms"_s, sinceStart_.elapsed() - timing_.openMs},
+                     {u"rows"_s, timing_.rows}};
+    if (timing_.jumpUs)
+        line[u"jump_us"_s] = *timing_.jumpUs;
+    if (timing_.nsPerEval)
+        line[u"ns_per_eval"_s] = *timing_.nsPerEval;
+    WriteMessage(QString::fromUtf8(QJsonDocument(line).toJson(QJsonDocument::Compact)));
+}
+
+ExitStatus RunProgram(const QStringList& words, Output& output)
+{
+    QString fault;
+    const CommandDef* command = nullptr;
+    std::optional<Arguments> arguments = ParseArguments(words, fault, command);
+    if (!arguments)
+        return RefuseArguments(fault, command);
+    if (arguments->Has(Opt::Help)) {
+        output.WriteLine(command ? CommandHelp(*command) : ProgramHelp());
+        return EndOutput(output, ExitStatus::Done);
+    }
+    if (arguments->Has(Opt::Version)) {
+        output.WriteLine(u"mirel-cli " MIREL_VERSION ""_s);
+        return EndOutput(output, ExitStatus::Done);
+    }
+    Run run(std::move(*arguments), output);
+    return EndOutput(output, RunCommand(run));
+}
+
+} // namespace mirel::cli

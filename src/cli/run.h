@@ -1,0 +1,66 @@
+#pragma once
+
+#include "app/database_session.h"
+#include "app/settings.h"
+#include "cli/arguments.h"
+#include "cli/command.h"
+#include "cli/console_prompt.h"
+#include "cli/output.h"
+#include "cli/record_writer.h"
+#include "data/db_connection.h"
+#include "platform/program_folder.h"
+
+#include <QElapsedTimer>
+
+#include <memory>
+#include <optional>
+
+namespace mirel::cli {
+
+// What --timing tells; what does not apply stays empty.
+struct Timing {
+    qint64 openMs = 0;
+    qint64 rows = 0;
+    std::optional<qint64> jumpUs;
+    std::optional<double> nsPerEval;
+};
+
+// One run of one command: its arguments and all that it works with. Made for the run and gone with it.
+class Run {
+public:
+    Run(Arguments arguments, Output& output);
+    Q_DISABLE_COPY_MOVE(Run)
+
+    const Arguments& Args() const { return arguments_; }
+    QString Argument(int index) const { return arguments_.positional.value(index); }
+    // A file named on the command line, by its full path.
+    QString PathArgument(int index) const;
+
+    // Opens the database that the first argument names, as the window does. On false the reason was told.
+    [[nodiscard]] bool OpenDatabase();
+    DatabaseSession& Session() { return session_; }
+    DbConnection& Connection() { return connection_; }
+    ConsolePrompt& Prompt() { return prompt_; }
+    const ProgramFolder& Folder() const { return folder_; }
+    Output& Out() { return output_; }
+    Timing& Times() { return timing_; }
+
+    // In the format that --format names, with the user's words for Yes and No.
+    std::unique_ptr<RecordWriter> MakeWriter();
+    void WriteTiming() const;
+
+private:
+    Arguments arguments_;
+    Output& output_;
+    QElapsedTimer sinceStart_;
+    ProgramFolder folder_;
+    ConsolePrompt prompt_;
+    DbConnection connection_;
+    DatabaseSession session_;
+    Timing timing_;
+};
+
+// The whole program: `words` is what stands behind its name.
+ExitStatus RunProgram(const QStringList& words, Output& output);
+
+} // namespace mirel::cli

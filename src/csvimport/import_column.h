@@ -1,0 +1,57 @@
+#pragma once
+
+#include "expr/date_format.h"
+#include "platform/field_type.h"
+#include "platform/user_prompt.h"
+#include "provider/provider.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <optional>
+#include <span>
+#include <vector>
+
+namespace mirel {
+
+// Where one column of the file goes. Type and size are those of the field that a new table gets; an existing
+// table's field has its own.
+struct ImportColumn {
+    bool ignored = false;
+    QString field;
+    FieldType type = FieldType::Text;
+    int size = kMaxTextSize;         // of a Text
+    std::optional<DateFormat> dates; // where it is not the file's
+
+    friend bool operator==(const ImportColumn&, const ImportColumn&) = default;
+};
+
+using ImportColumns = std::vector<ImportColumn>;
+
+// The functions below are false, with the reason in `fault` and `columns` as they were, when what they are given
+// does not fit.
+
+// "Name:Type[:Size],…", the file's columns in order; "-" ignores one. The name may stand in brackets, then it may
+// hold "," and ":". A column without a type is a Text of 255.
+[[nodiscard]] bool ParseColumnList(const QString& list, ImportColumns& columns, UserMessage& fault);
+
+// Columns of a new table: the names that the file's first line gives, made fit for fields where they are not.
+ImportColumns ColumnsNamed(const QStringList& names);
+// "Field1", "Field2", … of Text 255.
+ImportColumns NumberedColumns(int count);
+
+// Finds the columns' fields among those of an existing table, by exact name or in any case, and takes over
+// their spelling and types.
+[[nodiscard]] bool MatchByName(const QString& table, std::span<const ResultField> fields, ImportColumns& columns,
+                               UserMessage& fault);
+// The first of the file's `count` columns goes to the first field, and so on.
+[[nodiscard]] bool MatchInOrder(const QString& table, std::span<const ResultField> fields, int count,
+                                ImportColumns& columns, UserMessage& fault);
+
+// Whether a table can be made of them: at least one is not ignored, sizes are 1 to 255, names are there once.
+[[nodiscard]] bool CheckNewColumns(const ImportColumns& columns, UserMessage& fault);
+
+// The statement that makes the table.
+QString CreateTableStatement(const QString& table, const ImportColumns& columns);
+
+} // namespace mirel
