@@ -130,6 +130,8 @@ TEST_F(WrittenSql, GivesWhatTheDialectMeans)
         {u"Qty/2, Qty-(2-1), Qty-2-1, -(-Qty), -Qty*2, Qty%4"_s, u"3.5|6|4|7|-14|3"_s},
         {u"(Qty+1)*2, Qty+1*2, 8/(Qty-3)/2, Qty/0"_s, u"16|9|1.0|NULL"_s},
         {u"Name & Note, Name || Note, Name + '!', 'n' & Qty + 1"_s, u"Ärger|NULL|Ärger!|n8"_s},
+        {u"Price * 40 & ' EUR', 'made ' & Made, 1.50 & '', 'on ' & NOW() - NOW()"_s,
+         u"100 EUR|made 7/4/2001 9:05:00 AM|1.5|on 0"_s},
         {u"UPPER(Name), LOWER('ÀB'), UPPER(Note), LENGTH(Name)"_s, u"ÄRGER|àb|NULL|5"_s},
         {u"LEFT(Name,2), RIGHT(Name,2), RIGHT(Name,0), LEFT(Name,-1), RIGHT(Name,9)"_s, u"Är|er|||Ärger"_s},
         {u"MID(Name,2,3), SUBSTR(Name,4), INSTR(Name,'g'), REPLACE(Name,'r','R')"_s, u"rge|er|3|ÄRgeR"_s},
@@ -143,6 +145,7 @@ TEST_F(WrittenSql, GivesWhatTheDialectMeans)
         {u"(Qty = 7) = (Small = 2), Sold IS TRUE, (Note IS NULL) IS FALSE, TRUE, FALSE"_s, u"1|1|0|1|0"_s},
         {u"Qty = 7 OR Qty = 8 AND Small = 9, (Qty = 7 OR Qty = 8) AND Small = 9"_s, u"1|0"_s},
         {u"'it''s', \"say \"\"so\"\"\", 99999999999999999999 > 1"_s, u"it's|say \"so\"|1"_s},
+        {u"Sold = -1, Sold = 'yes', Sold <> 0, Sold < 5, Sold = TRUE"_s, u"1|1|1|1|1"_s},
         {u"Qty = '7', Name = 'ärger', Small < 99999, Made = '7/4/2001 9:05'"_s, u"1|0|1|1"_s},
     };
     for (const auto& [expressions, expected] : rows)

@@ -97,8 +97,11 @@ Hr FitLiteral(Expr& expression, FieldType type)
     // A comparison has no range: 3.5 and 99999 are fair things to compare a small integer with.
     if (IsInteger(type))
         type = FieldType::Double;
-    if (type == FieldType::Double && IsNumber(TypeOfLiteral(expression)))
+    if (expression.operation == Operation::Number && (type == FieldType::Double || type == FieldType::YesNo)) {
+        if (type == FieldType::YesNo && expression.text == u"-1") // true, as many databases count
+            Become(expression, Operation::True, FieldType::YesNo);
         return Hr::Ok;
+    }
     return Convert(expression, type, -1);
 }
 

@@ -1,6 +1,7 @@
 #include "provider/sqlite/dialect_functions.h"
 
 #include "platform/ole_date.h"
+#include "platform/user_locale.h"
 #include "provider/conversion.h"
 #include "provider/sqlite/plan.h"
 
@@ -133,18 +134,31 @@ void Store(sqlite3_context* context, int, sqlite3_value** arguments)
     sqlite3_result_error(context, message.data(), length);
 }
 
+// (value, type) -> the text that stands for the value elsewhere: "100" and not "100.0", a date as the user
+// writes it.
+void AsText(sqlite3_context* context, int, sqlite3_value** arguments)
+{
+    Value value;
+    const auto type = FieldType(sqlite3_value_int(arguments[1]));
+    if (sqlite3_value_type(arguments[0]) == SQLITE_NULL)
+        return;
+    if (Failed(ConvertForColumn(ValueOf(arguments[0]), type, -1, value)))
+        return sqlite3_result_value(context, arguments[0]);
+    ResultText(context, VariantText(value).toUtf8());
+}
+
 } // namespace
 
 bool RegisterDialectFunctions(sqlite3* database)
 {
-    constexpr int kFlags = SQLITE_UTF8 | SQLITE_DETERMINISTIC | SQLITE_INNOCUOUS;
+    constexpr int kFlags = SQLITE_UTF8 | SQLITE_DETERMINISTIC | SQLITE_DIRECTONLY;
     const auto add = [database](const char* name, int arguments,
                                 void (*function)(sqlite3_context*, int, sqlite3_value**)) {
         return sqlite3_create_function_v2(database, name, arguments, kFlags, nullptr, function, nullptr, nullptr,
                                           nullptr) == SQLITE_OK;
     };
     return add(kUpperFunction, 1, ChangeCase<Case::Upper>) && add(kLowerFunction, 1, ChangeCase<Case::Lower>) &&
-           add(kStoreFunction, 3, Store);
+           add(kStoreFunction, 3, Store) && add(kTextFunction, 2, AsText);
 }
 
 std::optional<Hr> StoreFailure(std::string_view errorMessage)

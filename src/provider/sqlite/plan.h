@@ -95,6 +95,7 @@ inline constexpr const char* kLikeFunction = "mirel_like";       // (text, patte
 
 inline constexpr const char* kUpperFunction = "mirel_upper"; // (text) -> text, letters of every language
 inline constexpr const char* kLowerFunction = "mirel_lower";
+inline constexpr const char* kTextFunction = "mirel_text";   // (any, type) -> the value as people read it
 inline constexpr const char* kStoreFunction = "mirel_store"; // (any, type, size) -> what such a column stores,
                                                              // or the statement fails: see StoreFailure
 

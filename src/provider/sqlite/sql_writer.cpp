@@ -220,7 +220,9 @@ void SqlWriter::Binary(const Expr& expression)
     case Operation::Join:
         return Joined(expression);
     case Operation::Concat: // binds tighter here than in the dialect
-        return Infix(expression, "||", Binding::Operand, Binding::Operand);
+        Shown(expression.arguments.front(), 0);
+        sql_ += " || ";
+        return Shown(expression.arguments.back(), 2);
     case Operation::Add:
     case Operation::Subtract:
         return Sum(expression);
@@ -309,10 +311,21 @@ void SqlWriter::Between(const Expr& expression)
 void SqlWriter::Joined(const Expr& expression)
 {
     sql_ += "coalesce(";
-    Operand(expression.arguments.front(), Binding::None, 3);
+    Shown(expression.arguments.front(), 3);
     sql_ += ",'')||coalesce(";
-    Operand(expression.arguments.back(), Binding::None, 5);
+    Shown(expression.arguments.back(), 5);
     sql_ += ",'')";
+}
+
+// An operand of a joined text.
+void SqlWriter::Shown(const Expr& operand, int waiting)
+{
+    if (operand.type != FieldType::Double && operand.type != FieldType::Date)
+        return Operand(operand, Binding::Operand, waiting);
+    sql_ += kTextFunction;
+    sql_ += '(';
+    Operand(operand, Binding::None, waiting + 3);
+    sql_ += ',' + QByteArray::number(int(operand.type)) + ')';
 }
 
 // Dates are texts in the file: they move by days, and lie days apart, as Julian day numbers.

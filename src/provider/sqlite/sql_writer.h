@@ -44,6 +44,7 @@ private:
     void In(const dialect::Expr& expression);
     void Between(const dialect::Expr& expression);
     void Joined(const dialect::Expr& expression);
+    void Shown(const dialect::Expr& operand, int waiting);
     void Sum(const dialect::Expr& expression);
     void Negated(const dialect::Expr& expression);
     void Call(const dialect::Expr& expression);
