@@ -25,7 +25,7 @@ protected:
         database_.reset(opened);
         sqlite3_db_config(opened, SQLITE_DBCONFIG_DQS_DML, 0, nullptr);
         sqlite3_limit(opened, SQLITE_LIMIT_EXPR_DEPTH, kMaxExpressionDepth);
-        EXPECT_TRUE(RegisterDialectFunctions(opened));
+        EXPECT_EQ(RegisterDialectFunctions(opened), SQLITE_OK);
         const auto add = [opened](const char* name, int arguments, auto* function) {
             sqlite3_create_function(opened, name, arguments, SQLITE_UTF8, nullptr, function, nullptr, nullptr);
         };

@@ -149,16 +149,28 @@ void AsText(sqlite3_context* context, int, sqlite3_value** arguments)
 
 } // namespace
 
-bool RegisterDialectFunctions(sqlite3* database)
+int RegisterDialectFunctions(sqlite3* database)
 {
-    constexpr int kFlags = SQLITE_UTF8 | SQLITE_DETERMINISTIC | SQLITE_DIRECTONLY;
-    const auto add = [database](const char* name, int arguments,
-                                void (*function)(sqlite3_context*, int, sqlite3_value**)) {
-        return sqlite3_create_function_v2(database, name, arguments, kFlags, nullptr, function, nullptr, nullptr,
-                                          nullptr) == SQLITE_OK;
+    struct Row {
+        const char* name;
+        int arguments;
+        void (*function)(sqlite3_context*, int, sqlite3_value**);
     };
-    return add(kUpperFunction, 1, ChangeCase<Case::Upper>) && add(kLowerFunction, 1, ChangeCase<Case::Lower>) &&
-           add(kStoreFunction, 3, Store) && add(kTextFunction, 2, AsText);
+    constexpr std::array kRows = {
+        Row{kUpperFunction, 1, ChangeCase<Case::Upper>},
+        Row{kLowerFunction, 1, ChangeCase<Case::Lower>},
+        Row{kStoreFunction, 3, Store},
+        Row{kTextFunction, 2, AsText},
+    };
+    constexpr int kFlags = SQLITE_UTF8 | SQLITE_DETERMINISTIC | SQLITE_DIRECTONLY;
+    int result = SQLITE_OK;
+    for (const Row& row : kRows) {
+        if (result == SQLITE_OK) {
+            result = sqlite3_create_function_v2(database, row.name, row.arguments, kFlags, nullptr, row.function,
+                                                nullptr, nullptr, nullptr);
+        }
+    }
+    return result;
 }
 
 std::optional<Hr> StoreFailure(std::string_view errorMessage)

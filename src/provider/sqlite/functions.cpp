@@ -1,6 +1,7 @@
 #include "provider/sqlite/functions.h"
 
 #include "provider/sqlite/date_forms.h"
+#include "provider/sqlite/dialect_functions.h"
 #include "provider/sqlite/like_pattern.h"
 #include "provider/sqlite/plan.h"
 #include "provider/sqlite/sort_keys.h"
@@ -76,7 +77,7 @@ int RegisterFunctions(sqlite3* handle)
         result =
             sqlite3_create_function_v2(handle, kLikeFunction, 2, kFlags, nullptr, Like, nullptr, nullptr, nullptr);
     }
-    return result;
+    return result == SQLITE_OK ? RegisterDialectFunctions(handle) : result;
 }
 
 } // namespace mirel::sqlite

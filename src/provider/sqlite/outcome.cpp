@@ -1,5 +1,6 @@
 #include "provider/sqlite/outcome.h"
 
+#include "provider/sqlite/dialect_functions.h"
 #include "resources/string_table.h"
 
 #include <sqlite3.h>
@@ -39,6 +40,9 @@ Outcome OutcomeOfSqlite(int resultCode, const QString& path, const QString& reas
     case SQLITE_CONSTRAINT:
         return {Hr::IntegrityViolation, reason};
     case SQLITE_ERROR:
+        if (const std::optional<Hr> refused = StoreFailure(reason.toStdString()))
+            return {*refused, {}};
+        return {Hr::SyntaxError, reason};
     case SQLITE_SCHEMA:
         return {Hr::SyntaxError, reason};
     default:
