@@ -37,7 +37,10 @@ public:
     static Value Binary(QByteArray bytes) { return Value(std::move(bytes)); }
 
     ValueTag Tag() const;
-    bool IsNull() const { return Tag() == ValueTag::Empty || Tag() == ValueTag::Null; }
+    bool IsNull() const
+    {
+        return std::holds_alternative<std::monostate>(content_) || std::holds_alternative<NullContent>(content_);
+    }
 
     // Each reads a value of its own tag; of any other tag it gives 0, false or empty. Number() reads both
     // integer tags, Double, Date (the day number) and Bool (1 or 0).
