@@ -1,6 +1,7 @@
 #pragma once
 
 #include "expr/evaluator.h"
+#include "expr/text_buffer.h"
 
 #include <cmath>
 #include <optional>
@@ -68,12 +69,22 @@ inline void SetText(ExprNode& node, QStringView text)
 // Null for days outside of the calendar.
 void SetDate(ExprNode& node, std::optional<double> oleDays);
 
-// Lends the node its buffer with `units` units of room to write to; null, and the node null, when the run cannot
-// afford it. KeepBuffer makes what was written the node's value.
-QString* StartBuffer(ExprNode& node, Evaluation& evaluation, qsizetype units);
-void KeepBuffer(ExprNode& node);
+// Makes what stands in the node's buffer its value.
+inline void KeepBuffer(ExprNode& node)
+{
+    SetText(node, node.buffer.View());
+}
 
-// The same with the text of an evaluated child in the buffer: moved from there where the child made it itself.
-QString* TakeText(ExprNode& node, ExprNode& child, Evaluation& evaluation);
+// Moves the text of an evaluated child into the node's buffer where the child computed it itself: it has no more
+// use for it. False, and the buffer as it was, for a text that stands elsewhere.
+inline bool TakeBuffer(ExprNode& node, ExprNode& child)
+{
+    const QStringView text = TextOf(child);
+    const QStringView own = child.buffer.View();
+    if (!child.evaluate || text.data() != own.data() || text.size() != own.size())
+        return false;
+    node.buffer.Swap(child.buffer);
+    return true;
+}
 
 } // namespace mirel

@@ -67,7 +67,7 @@ void ReadField(ExprNode& node, const Value& value, EvalContext& context)
     case FieldType::None:
     case FieldType::VarBinary:
     case FieldType::LongBinary:
-        node.buffer = VariantText(value);
+        node.buffer.Assign(VariantText(value));
         KeepBuffer(node);
         return;
     }
@@ -123,8 +123,8 @@ void EvaluateField(ExprNode& node, Evaluation& evaluation)
 
 void EvaluateControl(ExprNode& node, Evaluation& evaluation)
 {
-    node.buffer = evaluation.context.ControlText(node.text);
-    const QStringView text = TrimmedSpaces(node.buffer);
+    node.buffer.Assign(evaluation.context.ControlText(node.text));
+    const QStringView text = TrimmedSpaces(node.buffer.View());
     if (LooksLikeNumber(text))
         SetNumber(node, LeadingDecimal(text));
     else
@@ -142,16 +142,11 @@ bool EvaluateExpression(EvalContext& context, ExprNode& root)
     return root.code == OpCode::Where ? !root.suppressed : Holds(root);
 }
 
-QStringView TextOf(ExprNode& node)
+void WriteDateText(ExprNode& node)
 {
-    if (!node.isText || node.null)
-        return {};
-    if (node.dateTextDue) {
-        node.buffer = UserLocale::Current().DateTimeText(node.valueNumber);
-        node.valueText = node.buffer;
-        node.dateTextDue = false;
-    }
-    return node.valueText;
+    node.buffer.Assign(UserLocale::Current().DateTimeText(node.valueNumber));
+    node.valueText = node.buffer.View();
+    node.dateTextDue = false;
 }
 
 QString ShownText(ExprNode& node)
@@ -171,36 +166,6 @@ void SetDate(ExprNode& node, std::optional<double> oleDays)
     node.valueNumber = *oleDays;
     node.fieldType = FieldType::Date;
     node.dateTextDue = true; // most dates are only compared or counted: their text is slow to make
-}
-
-QString* StartBuffer(ExprNode& node, Evaluation& evaluation, qsizetype units)
-{
-    if (!evaluation.Afford(units)) {
-        SetNull(node);
-        return nullptr;
-    }
-    node.buffer.resize(0);
-    node.buffer.reserve(units);
-    return &node.buffer;
-}
-
-void KeepBuffer(ExprNode& node)
-{
-    SetText(node, node.buffer);
-}
-
-QString* TakeText(ExprNode& node, ExprNode& child, Evaluation& evaluation)
-{
-    const QStringView text = TextOf(child);
-    const bool ownsIt = text.data() == child.buffer.constData() && text.size() == child.buffer.size();
-    if (child.evaluate && ownsIt) {
-        node.buffer.swap(child.buffer);
-        return &node.buffer;
-    }
-    QString* buffer = StartBuffer(node, evaluation, text.size());
-    if (buffer)
-        buffer->append(text);
-    return buffer;
 }
 
 } // namespace mirel

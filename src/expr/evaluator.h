@@ -44,12 +44,21 @@ private:
     quint64 columnsId_ = 0; // never that of another set of columns, of this context or any other
 };
 
+void WriteDateText(ExprNode& node); // for TextOf
+
 // Evaluates the tree and leaves the value in `root`. True when root is a condition and holds; for WHERE, when its
 // condition holds.
 bool EvaluateExpression(EvalContext& context, ExprNode& root);
 
 // The node's value as text; empty for a number. Good until the next evaluation.
-QStringView TextOf(ExprNode& node);
+inline QStringView TextOf(ExprNode& node)
+{
+    if (!node.isText || node.null)
+        return {};
+    if (node.dateTextDue)
+        WriteDateText(node);
+    return node.valueText;
+}
 
 // The value as a form shows it: nothing for null and for a value whose WHERE did not hold, a number by
 // ExprNumberText.

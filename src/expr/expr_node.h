@@ -1,5 +1,6 @@
 #pragma once
 
+#include "expr/text_buffer.h"
 #include "platform/field_type.h"
 
 #include <QString>
@@ -97,7 +98,7 @@ struct ExprNode {
 
     std::array<ExprTree, 4> args; // arg1 to arg4
 
-    QString buffer;         // texts that the node itself computes
+    TextBuffer buffer;      // texts that the node itself computes
     QString text;           // name, content of a literal, or the spelling in upper case
     qsizetype position = 0; // of the token in the expression, from 0
 };

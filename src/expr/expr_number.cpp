@@ -2,7 +2,6 @@
 
 #include <QVarLengthArray>
 
-#include <array>
 #include <charconv>
 #include <cmath>
 #include <cstdlib>
@@ -83,23 +82,20 @@ private:
 
 } // namespace
 
-void AppendExprNumber(QString& out, double number)
+ExprNumberChars::ExprNumberChars(double number)
 {
-    std::array<char, 320> characters; // the largest double has 309 digits before the point
     const bool whole = number == std::trunc(number);
-    const auto written =
-        std::to_chars(characters.begin(), characters.end(), number + 0.0, std::chars_format::fixed, whole ? 0 : 6);
+    const auto written = std::to_chars(characters_.begin(), characters_.end(), number + 0.0,
+                                       std::chars_format::fixed, whole ? 0 : 6);
     const char* end = written.ptr;
     while (!whole && end[-1] == '0')
         --end;
-    out += QLatin1StringView(characters.data(), end - characters.data());
+    length_ = end - characters_.data();
 }
 
 QString ExprNumberText(double number)
 {
-    QString text;
-    AppendExprNumber(text, number);
-    return text;
+    return ExprNumberChars(number).Text();
 }
 
 double LeadingDecimal(QStringView text)

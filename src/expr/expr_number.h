@@ -3,11 +3,22 @@
 #include <QString>
 #include <QStringView>
 
+#include <array>
+
 namespace mirel {
 
 // A number as expressions write it: a whole number in decimal, any other with six decimals less the zeros at
 // its end. The point stays: 1.0000001 is "1.".
-void AppendExprNumber(QString& out, double number);
+class ExprNumberChars {
+public:
+    explicit ExprNumberChars(double number);
+
+    QLatin1StringView Text() const { return {characters_.data(), length_}; }
+
+private:
+    std::array<char, 320> characters_; // the largest double has 309 digits before the point
+    qsizetype length_;
+};
 QString ExprNumberText(double number);
 
 // The decimal number that a text begins with, after white space; 0 when there is none. Infinite when it is too

@@ -58,24 +58,36 @@ void SetParts(ExprNode& node, int DateParts::*part)
 
 // ---- Text
 
-// Writes the text with each character put through `convert`, which gets code points and never changes lengths.
+// The units of `from` written to `to` through `convert`, which gets code points. A letter whose other form has
+// another length stays as it is. Both may be the same.
+template <typename Convert>
+void ConvertUnits(QStringView from, char16_t* to, Convert& convert)
+{
+    for (qsizetype i = 0; i < from.size(); ++i) {
+        const char16_t unit = from[i].unicode();
+        if (unit < 0x80) {
+            to[i] = char16_t(convert(unit));
+            continue;
+        }
+        const bool pair = QChar::isHighSurrogate(unit) && i + 1 < from.size() && from[i + 1].isLowSurrogate();
+        const char32_t before = pair ? QChar::surrogateToUcs4(unit, from[i + 1].unicode()) : unit;
+        const char32_t after = convert(before);
+        const char32_t kept = QChar::requiresSurrogates(after) == pair ? after : before;
+        to[i] = pair ? QChar::highSurrogate(kept) : char16_t(kept);
+        if (pair)
+            to[++i] = QChar::lowSurrogate(kept);
+    }
+}
+
 template <typename Convert>
 void ConvertText(ExprNode& node, Evaluation& evaluation, Convert convert)
 {
-    QString* buffer = TakeText(node, *Argument(node, 0), evaluation);
-    if (!buffer)
+    const QStringView text = TextArgument(node, 0);
+    if (!TakeBuffer(node, *Argument(node, 0)) && !evaluation.Afford(text.size())) {
+        SetNull(node);
         return;
-    QChar* const units = buffer->data();
-    for (qsizetype i = 0; i < buffer->size(); ++i) {
-        const bool pair = units[i].isHighSurrogate() && i + 1 < buffer->size() && units[i + 1].isLowSurrogate();
-        const char32_t from = pair ? QChar::surrogateToUcs4(units[i], units[i + 1]) : units[i].unicode();
-        const char32_t to = convert(from);
-        if (QChar::requiresSurrogates(to) != pair)
-            continue; // would change the length
-        units[i] = pair ? QChar(QChar::highSurrogate(to)) : QChar(char16_t(to));
-        if (pair)
-            units[++i] = QChar(QChar::lowSurrogate(to));
     }
+    ConvertUnits(text, node.buffer.Resize(text.size()), convert);
     KeepBuffer(node);
 }
 
@@ -95,12 +107,12 @@ char32_t LowerOf(char32_t c)
 
 void FnUpper(ExprNode& node, Evaluation& evaluation)
 {
-    ConvertText(node, evaluation, UpperOf);
+    ConvertText(node, evaluation, [](char32_t c) { return UpperOf(c); });
 }
 
 void FnLower(ExprNode& node, Evaluation& evaluation)
 {
-    ConvertText(node, evaluation, LowerOf);
+    ConvertText(node, evaluation, [](char32_t c) { return LowerOf(c); });
 }
 
 void FnInitCap(ExprNode& node, Evaluation& evaluation)
@@ -176,19 +188,17 @@ void FnReplace(ExprNode& node, Evaluation& evaluation)
         SetText(node, rest);
         return;
     }
-    QString* buffer = StartBuffer(node, evaluation, rest.size());
-    for (; buffer && at >= 0; at = FindText(rest, from, 0)) {
-        *buffer += rest.first(at);
-        *buffer += to;
+    node.buffer.Resize(0);
+    for (; at >= 0; at = FindText(rest, from, 0)) {
+        if (!evaluation.Afford(at + to.size())) {
+            SetNull(node);
+            return;
+        }
+        node.buffer.Append(rest.first(at));
+        node.buffer.Append(to);
         rest = rest.sliced(at + from.size());
-        if (!evaluation.Afford(to.size()))
-            buffer = nullptr;
     }
-    if (!buffer) {
-        SetNull(node);
-        return;
-    }
-    *buffer += rest;
+    node.buffer.Append(rest);
     KeepBuffer(node);
 }
 
@@ -199,8 +209,8 @@ void FnToChar(ExprNode& node, Evaluation&)
         SetText(node, TextOf(argument));
         return;
     }
-    node.buffer.resize(0);
-    AppendExprNumber(node.buffer, argument.valueNumber);
+    node.buffer.Resize(0);
+    node.buffer.Append(ExprNumberChars(argument.valueNumber).Text());
     KeepBuffer(node);
 }
 
@@ -220,7 +230,7 @@ double WholeSeconds(const QDateTime& now)
 void FnSysTime(ExprNode& node, Evaluation& evaluation)
 {
     const double now = WholeSeconds(evaluation.context.Now());
-    node.buffer = UserLocale::Current().TimeText(now);
+    node.buffer.Assign(UserLocale::Current().TimeText(now));
     KeepBuffer(node);
 }
 
@@ -287,8 +297,8 @@ void FnToTimeStr(ExprNode& node, Evaluation&)
 {
     const qint64 seconds = IntegerArgument(node, 0);
     const qint64 size = std::abs(seconds);
-    node.buffer = QString::asprintf("%s%02lld:%02lld:%02lld", seconds < 0 ? "-" : "", size / 3600, size / 60 % 60,
-                                    size % 60);
+    node.buffer.Assign(QString::asprintf("%s%02lld:%02lld:%02lld", seconds < 0 ? "-" : "", size / 3600,
+                                         size / 60 % 60, size % 60));
     KeepBuffer(node);
 }
 

@@ -69,28 +69,28 @@ struct RemainderOf {
     }
 };
 
-void AppendText(QString& buffer, ExprNode& node)
+// The node's value as text behind what the buffer holds.
+void AppendValue(TextBuffer& buffer, ExprNode& node)
 {
     if (node.isText)
-        buffer += TextOf(node);
+        buffer.Append(TextOf(node));
     else
-        AppendExprNumber(buffer, node.valueNumber);
+        buffer.Append(ExprNumberChars(node.valueNumber).Text());
 }
 
 void Concatenate(ExprNode& node, ExprNode& left, ExprNode& right, Evaluation& evaluation)
 {
-    constexpr qsizetype kUnitsOfANumber = 32;
-    const qsizetype units = right.isText ? TextOf(right).size() : kUnitsOfANumber;
-    QString* buffer =
-        left.isText ? TakeText(node, left, evaluation) : StartBuffer(node, evaluation, kUnitsOfANumber);
-    if (!buffer || !evaluation.Afford(units)) {
-        SetNull(node);
-        return;
+    qsizetype moved = 0;
+    if (left.isText && TakeBuffer(node, left)) {
+        moved = node.buffer.View().size();
+    } else {
+        node.buffer.Resize(0);
+        AppendValue(node.buffer, left);
     }
-    if (!left.isText)
-        AppendText(*buffer, left);
-    AppendText(*buffer, right);
+    AppendValue(node.buffer, right);
     KeepBuffer(node);
+    if (!evaluation.Afford(node.buffer.View().size() - moved))
+        SetNull(node);
 }
 
 void EvaluateAdd(ExprNode& node, Evaluation& evaluation)
