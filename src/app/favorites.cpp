@@ -5,6 +5,13 @@
 namespace mirel {
 namespace {
 
+QByteArray WithoutLineEnd(QByteArray line)
+{
+    while (line.endsWith('\n') || line.endsWith('\r'))
+        line.chop(1);
+    return line;
+}
+
 bool IsLineOf(const QByteArray& line, const QByteArray& stamp)
 {
     return line.startsWith(stamp) && (line.size() == stamp.size() || line[stamp.size()] == '\t');
@@ -30,7 +37,7 @@ QStringList FavoritesOf(const QByteArray& file, const QString& stamp)
     QStringList entries;
     const QByteArray wanted = stamp.toUtf8();
     for (const QByteArray& line : file.split('\n')) {
-        const QByteArray own = line.endsWith('\r') ? line.chopped(1) : line;
+        const QByteArray own = WithoutLineEnd(line);
         if (stamp.isEmpty() || !IsLineOf(own, wanted))
             continue;
         for (const QByteArray& entry : own.sliced(wanted.size()).split('\t')) {
@@ -59,7 +66,7 @@ QByteArray WithFavorites(const QByteArray& file, const QString& stamp, const QSt
         const qsizetype end = rest.indexOf('\n') + 1;
         const QByteArray line = rest.first(end);
         rest = rest.sliced(end);
-        if (!IsLineOf(line.trimmed(), wanted)) {
+        if (!IsLineOf(WithoutLineEnd(line), wanted)) {
             result += line;
         } else if (!placed) {
             result += wanted + own + '\n';

@@ -1,5 +1,7 @@
 #include "data/provider_error.h"
 
+#include "data/statement_text.h"
+
 #include <algorithm>
 #include <array>
 
@@ -24,32 +26,10 @@ constexpr std::array kErrors = {
     ErrorRow{0x80040E42, Str::ErrorTooManyColumns}, ErrorRow{0x800A0F0A, Str::ErrorTooManyColumns},
 };
 
-// The word JOIN outside quotes and brackets, whatever stands around it.
-bool NamesAJoin(QStringView statement)
+bool NamesAJoin(QString statement)
 {
-    constexpr QStringView kJoin = u"JOIN";
-    QChar closing;
-    for (qsizetype i = 0; i < statement.size(); ++i) {
-        const QChar character = statement[i];
-        if (!closing.isNull()) {
-            if (character == closing)
-                closing = QChar();
-            continue;
-        }
-        if (character == u'\'' || character == u'"')
-            closing = character;
-        else if (character == u'[')
-            closing = u']';
-        if (!statement.sliced(i).startsWith(kJoin, Qt::CaseInsensitive))
-            continue;
-        const QChar before = i > 0 ? statement[i - 1] : QChar(u' ');
-        const qsizetype end = i + kJoin.size();
-        const QChar after = end < statement.size() ? statement[end] : QChar(u' ');
-        const auto inName = [](QChar each) { return each.isLetterOrNumber() || each == u'_'; };
-        if (!inName(before) && !inName(after))
-            return true;
-    }
-    return false;
+    statement.replace(u'\r', u' ').replace(u'\n', u' '); // people write statements in lines
+    return KeywordPosition(statement, u"JOIN") >= 0;
 }
 
 Str MessageOf(const DbRecordset* recordset, Hr hr)

@@ -12,7 +12,7 @@ using namespace Qt::StringLiterals;
 
 std::optional<QString> Decode(const QByteArray& bytes)
 {
-    QStringDecoder utf8(QStringDecoder::Utf8);
+    QStringDecoder utf8(QStringDecoder::Utf8, QStringDecoder::Flag::ConvertInitialBom); // a mark is text here
     QString text = utf8(bytes);
     if (utf8.hasError())
         return {};

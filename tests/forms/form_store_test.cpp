@@ -5,6 +5,7 @@
 
 #include <QDir>
 #include <QFile>
+#include <QRegularExpression>
 #include <QTemporaryDir>
 #include <QtEndian>
 
@@ -151,6 +152,37 @@ TEST(StoreFile, HasItsFieldsInTheirPlaces)
     const qsizetype formBytes = kFormBytes + 2 * 21 + 2 * kControlBytes + 2 * 12;
     EXPECT_EQ(TextAt(bytes, kHeaderBytes + 2 * formBytes), u"By birthday"_s);
     EXPECT_EQ(bytes.size(), kHeaderBytes + 2 * formBytes + kQueryBytes + 2 * 38);
+}
+
+// The bytes of the page's hex dump; lines that it leaves out are zeros.
+QByteArray BytesOfThePage()
+{
+    QFile page(QStringLiteral(MIREL_SOURCE_DIR "/docs/store-file.md"));
+    EXPECT_TRUE(page.open(QIODevice::ReadOnly));
+    static const QRegularExpression line(u"^([0-9a-f]{6})  ((?:[0-9a-f]{2} ?)+)"_s,
+                                         QRegularExpression::MultilineOption);
+    QByteArray bytes;
+    auto lines = line.globalMatch(QString::fromUtf8(page.readAll()));
+    while (lines.hasNext()) {
+        const QRegularExpressionMatch match = lines.next();
+        bytes.append(match.captured(1).toInt(nullptr, 16) - bytes.size(), '\0');
+        bytes += QByteArray::fromHex(match.captured(2).toLatin1());
+    }
+    return bytes;
+}
+
+TEST(StoreFile, IsWhatItsPageSays)
+{
+    const QByteArray bytes = BytesOfThePage();
+    FormStore store;
+    ASSERT_TRUE(store.LoadFrom(bytes));
+    ASSERT_EQ(store.Forms().size(), 1U);
+    EXPECT_EQ(store.Forms()[0].name, u"Watch");
+    ASSERT_EQ(store.Forms()[0].controls.size(), 1U);
+    EXPECT_EQ(store.Forms()[0].controls[0].source.Text(), u"Birds.Species"_s);
+    ASSERT_EQ(store.Queries().size(), 1U);
+    EXPECT_EQ(store.Queries()[0].text.Text(), u"SELECT * FROM Birds ORDER BY Species"_s);
+    EXPECT_EQ(store.ToBytes(), bytes);
 }
 
 TEST(StoreFile, DistinguishesAnEmptyTextFromNone)
