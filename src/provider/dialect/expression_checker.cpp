@@ -189,7 +189,9 @@ bool ExpressionChecker::CheckColumn(Expr& expression)
     if (expression.source >= 0) // put in by us and found before
         return true;
     switch (FindColumn(expression)) {
-    case Lookup::Found:
+    case Lookup::Found: // however it was written, it is the same column from here on
+        expression.table.clear();
+        expression.text = sources_[size_t(expression.source)].table->columns[size_t(expression.column)].name;
         return true;
     case Lookup::Missing:
         return Fail(Hr::NoSuchColumn);

@@ -90,9 +90,12 @@ Hr FitLiteral(Expr& expression, FieldType type)
 {
     if (!IsLiteral(expression.operation) || expression.operation == Operation::Null)
         return Hr::Ok;
-    if (IsBinary(type) || (IsText(type) && TypeOfLiteral(expression) == FieldType::YesNo))
+    const bool isDate = expression.operation == Operation::Date; // read before, as something else asked for it
+    if (IsBinary(type) || (IsText(type) && TypeOfLiteral(expression) == FieldType::YesNo) ||
+        (isDate && (IsNumber(type) || type == FieldType::YesNo))) {
         return Hr::BadComparison;
-    if (type == FieldType::None)
+    }
+    if (type == FieldType::None || isDate)
         return Hr::Ok;
     // A comparison has no range: 3.5 and 99999 are fair things to compare a small integer with.
     if (IsInteger(type))

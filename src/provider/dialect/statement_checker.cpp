@@ -28,12 +28,6 @@ bool IsAggregate(const Expr& expression)
            std::ranges::find(Functions(), expression.function, &FunctionDef::function)->isAggregate;
 }
 
-bool SameColumn(const Expr& a, const Expr& b)
-{
-    return a.operation == Operation::Column && b.operation == Operation::Column && a.source == b.source &&
-           a.column == b.column;
-}
-
 } // namespace
 
 bool StatementChecker::Fail(Hr code, QString context)
@@ -212,9 +206,7 @@ bool StatementChecker::IsGrouped(const Expr& expression, const std::vector<Expr>
 {
     if (IsAggregate(expression))
         return true;
-    const bool isTerm = std::ranges::any_of(
-        group, [&](const Expr& term) { return SameColumn(expression, term) || expression == term; });
-    if (isTerm)
+    if (std::ranges::find(group, expression) != group.end())
         return true;
     if (expression.operation == Operation::Column) {
         return Fail(Hr::SyntaxError, StringText(Str::NeitherGroupedNorAggregated,
