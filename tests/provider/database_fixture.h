@@ -10,6 +10,8 @@
 #include <QStringList>
 #include <QTemporaryDir>
 
+#include <sqlite3.h>
+
 #include <memory>
 
 namespace mirel {
@@ -89,6 +91,19 @@ protected:
         EXPECT_EQ(recordset.GetValue(field, value), Hr::Ok) << recordset.ErrorContext().toStdString();
         return value;
     }
+
+    // What another program does to the file.
+    static void Outside(const QString& file, const QByteArray& sql)
+    {
+        sqlite3* handle = nullptr;
+        char* error = nullptr;
+        ASSERT_EQ(sqlite3_open(QFile::encodeName(file).constData(), &handle), SQLITE_OK);
+        EXPECT_EQ(sqlite3_exec(handle, sql.constData(), nullptr, nullptr, &error), SQLITE_OK)
+            << (error ? error : "");
+        sqlite3_free(error);
+        sqlite3_close(handle);
+    }
+    void Outside(const QByteArray& sql) { Outside(path, sql); }
 
     void Write(const QString& name, const QByteArray& bytes)
     {

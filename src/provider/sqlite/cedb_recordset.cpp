@@ -3,6 +3,7 @@
 #include "provider/sqlite/cedb_provider.h"
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/forward_cursor.h"
+#include "provider/sqlite/static_cursor.h"
 #include "provider/sqlite/structure_change.h"
 
 #include <algorithm>
@@ -118,8 +119,9 @@ Outcome CedbRecordset::RunPlan(Plan plan, CursorType cursor, LockType lock)
 Outcome CedbRecordset::OpenSelect(SelectPlan plan, CursorType cursor, LockType lock)
 {
     if (cursor == CursorType::Static)
-        return {Hr::NotImplemented, {}};
-    cursor_ = std::make_unique<ForwardCursor>(file_, std::move(plan));
+        cursor_ = std::make_unique<StaticCursor>(file_, std::move(plan));
+    else
+        cursor_ = std::make_unique<ForwardCursor>(file_, std::move(plan));
     const bool updatable = cursor_->IsUpdatable() && !file_->IsReadOnly();
     lock_ = updatable ? lock : LockType::ReadOnly;
     return cursor_->Open();

@@ -2,6 +2,7 @@
 
 #include "provider/sqlite/row_reader.h"
 #include "provider/sqlite/select_sql.h"
+#include "provider/sqlite/static_cursor.h"
 #include "provider/sqlite/transaction.h"
 
 namespace mirel::sqlite {
@@ -29,12 +30,25 @@ Outcome ForwardCursor::FetchBlock()
 {
     block_.clear();
     blockStart_ = position_;
-    const Outcome outcome = Walk(AllFields(plan_.fields), [this](std::span<const Cell> cells) {
+    const CellSink keep = [this](std::span<const Cell> cells) {
         Keep(cells);
         return block_.size() < kBlockSize;
-    });
+    };
+    const Outcome outcome = position_ == 0 ? Walk(AllFields(plan_.fields), keep) : FetchFurther(keep);
     blockIsLast_ = block_.size() < kBlockSize;
     return outcome;
+}
+
+// Most results end within the first block; a longer one that is walked record by record gets positions.
+Outcome ForwardCursor::FetchFurther(const CellSink& keep)
+{
+    if (!rest_) {
+        auto rest = std::make_unique<StaticCursor>(file_, plan_);
+        if (Outcome outcome = rest->Open(); !outcome.Ok())
+            return outcome;
+        rest_ = std::move(rest);
+    }
+    return rest_->Read({.first = position_, .count = qint64(kBlockSize), .fields = {}}, keep);
 }
 
 // Hands over the records from the current one on, running the SELECT anew: nothing was left running.
@@ -110,7 +124,7 @@ Outcome ForwardCursor::Read(const ReadRange& range, const CellSink& sink)
         return sink(cells) && done != range.count;
     });
     position_ += done;
-    if (outcome.Ok() && AtEnd())
+    if (outcome.Ok() && AtEnd() && !blockIsLast_)
         outcome = FetchBlock();
     if (outcome.Ok())
         outcome = transaction.End();

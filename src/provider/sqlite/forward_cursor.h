@@ -32,6 +32,7 @@ public:
 
 private:
     Outcome FetchBlock();
+    Outcome FetchFurther(const CellSink& keep);
     Outcome Walk(const std::vector<int>& fields, const CellSink& sink);
     void Keep(std::span<const Cell> cells);
 
@@ -41,6 +42,7 @@ private:
     qint64 blockStart_ = 0;
     bool blockIsLast_ = false;
     qint64 position_ = 0;
+    std::unique_ptr<ResultCursor> rest_; // once a record behind the first block is asked for
 };
 
 } // namespace mirel::sqlite

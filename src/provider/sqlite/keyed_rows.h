@@ -1,0 +1,60 @@
+#pragma once
+
+#include "provider/sqlite/database_file.h"
+#include "provider/sqlite/plan.h"
+#include "provider/sqlite/result_rows.h"
+
+namespace mirel::sqlite {
+
+// The records of a filtered, sorted or joined result: the row ids of all of them, in the result's order. The
+// result stays what it was when they were gathered, while the values are those of now.
+class KeyedRows : public ResultRows {
+public:
+    // Both must outlive it.
+    KeyedRows(DatabaseFile& file, const SelectPlan& plan);
+
+    void Restart() override;
+    Outcome Extend(qint64 wanted, const QDeadlineTimer& until) override;
+    qint64 Known() const override { return keys_.Size(); }
+    bool IsComplete() const override { return isComplete_; }
+
+    Outcome KeyAt(qint64 position, RecordKey& key) override;
+    Outcome PositionOf(const RecordKey& key, qint64& position) override;
+    Outcome Read(const ReadRange& range, const CellSink& sink) override;
+    Outcome ReadRecord(const RecordKey& key, std::span<const int> fields, const CellSink& sink) override;
+
+    bool Append(const RecordKey& key) override
+    {
+        return keys_.Append(std::span(key.constData(), size_t(key.size())));
+    }
+    void Remove(qint64 position, const RecordKey&) override { keys_.Remove(position); }
+    BulkRanges RangesFor(int source) const override;
+
+private:
+    // One table without an order, read by row ids from the first to the last: keys can be gathered in slices.
+    Outcome ChooseGathering();
+    Outcome GatherAll();
+    Outcome GatherSlice();
+    Outcome Gather(Statement& statement);
+    Outcome ReadAll(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
+    Outcome ReadByKeys(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
+    // Nothing has changed since: the SELECT would give these very records in this order.
+    bool IsFresh() const { return sqlite3_total_changes64(file_.Handle()) == changesBefore_; }
+    QByteArray KeySelect() const;
+    QByteArray RecordSelect(std::span<const int> fields) const;
+
+    DatabaseFile& file_;
+    const SelectPlan& plan_;
+    std::vector<QByteArray> storedTables_; // of each source, as SQL
+    KeyList keys_;
+    bool isComplete_ = false;
+    qint64 changesBefore_ = 0; // the handle's count of changes when gathering began
+
+    enum class Gathering { Unknown, Whole, Slices };
+    Gathering gathering_ = Gathering::Unknown;
+    qint64 nextRowId_ = 0; // of a table that is gathered in slices
+    qint64 lastRowId_ = 0;
+    quint64 sliceWidth_ = 0;
+};
+
+} // namespace mirel::sqlite

@@ -1,0 +1,108 @@
+#include "provider/sqlite/record_writer.h"
+
+#include "provider/conversion.h"
+#include "provider/sqlite/sql_writer.h"
+#include "resources/string_table.h"
+
+namespace mirel::sqlite {
+
+RecordWriter::RecordWriter(DatabaseFile& file, const dialect::Table& table, std::span<const ResultField> fields)
+    : file_(file)
+    , name_(table.name)
+    , table_(QuoteName(table.storedName))
+    , rowId_(table.rowId)
+    , fields_(fields.begin(), fields.end())
+{
+}
+
+QByteArray RecordWriter::ColumnOf(int field) const
+{
+    return QuoteName(fields_[size_t(field)].column);
+}
+
+Outcome RecordWriter::Convert(const FieldChange& change, Value& converted) const
+{
+    const ResultField& field = fields_[size_t(change.field)];
+    if (field.column.isEmpty())
+        return {Hr::ReadOnly, {}};
+    const int size = field.type == FieldType::Text || field.type == FieldType::VarBinary ? field.size : -1;
+    return {ConvertForColumn(change.value, field.type, size, converted), {}};
+}
+
+Outcome RecordWriter::ConvertAll(std::span<const FieldChange> values, std::vector<Value>& converted) const
+{
+    for (const FieldChange& change : values) {
+        if (Outcome outcome = Convert(change, converted.emplace_back()); !outcome.Ok())
+            return outcome;
+    }
+    return {};
+}
+
+// `sql` returns the row id of the record that it wrote, which is bound behind the values.
+Outcome RecordWriter::Run(const QByteArray& sql, std::span<const Value> values, qint64& rowId)
+{
+    Outcome outcome;
+    Statement statement = file_.Prepare(sql, outcome);
+    if (!statement)
+        return outcome;
+    for (size_t i = 0; i < values.size(); ++i)
+        statement.Bind(int(i) + 1, values[i]);
+    if (sqlite3_bind_parameter_count(statement.Get()) > int(values.size()))
+        statement.Bind(int(values.size()) + 1, rowId);
+    bool written = false;
+    int result = statement.Step();
+    for (; result == SQLITE_ROW; result = statement.Step()) {
+        rowId = statement.Integer(0);
+        written = true;
+    }
+    if (result == SQLITE_DONE && !written)
+        return {Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
+    return file_.OutcomeOf(result);
+}
+
+Outcome RecordWriter::Add(std::span<const FieldChange> values, qint64& rowId)
+{
+    std::vector<Value> converted;
+    if (Outcome outcome = ConvertAll(values, converted); !outcome.Ok())
+        return outcome;
+    QByteArray names;
+    QByteArray places;
+    for (const FieldChange& change : values) {
+        names += (names.isEmpty() ? "" : ",") + ColumnOf(change.field);
+        places += places.isEmpty() ? "?" : ",?";
+    }
+    const QByteArray record = names.isEmpty() ? " DEFAULT VALUES" : " (" + names + ") VALUES (" + places + ')';
+    Outcome outcome = Run("INSERT INTO " + table_ + record + " RETURNING " + rowId_, converted, rowId);
+    if (outcome.Ok())
+        file_.NoteChange(name_);
+    return outcome;
+}
+
+Outcome RecordWriter::Update(std::span<const FieldChange> values, qint64& rowId)
+{
+    std::vector<Value> converted;
+    if (Outcome outcome = ConvertAll(values, converted); !outcome.Ok())
+        return outcome;
+    if (values.empty())
+        return {};
+    QByteArray assignments;
+    for (const FieldChange& change : values)
+        assignments += (assignments.isEmpty() ? "" : ",") + ColumnOf(change.field) + "=?";
+    const qint64 old = rowId;
+    Outcome outcome =
+        Run("UPDATE " + table_ + " SET " + assignments + " WHERE " + rowId_ + "=? RETURNING " + rowId_, converted,
+            rowId);
+    if (outcome.Ok() && rowId != old)
+        file_.NoteChange(name_);
+    return outcome;
+}
+
+Outcome RecordWriter::Delete(qint64 rowId)
+{
+    Outcome outcome = Run("DELETE FROM " + table_ + " WHERE " + rowId_ + "=? RETURNING " + rowId_, {}, rowId);
+    if (outcome.Ok())
+        file_.NoteChange(name_);
+    return outcome;
+}
+
+} // namespace mirel::sqlite

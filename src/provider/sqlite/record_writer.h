@@ -1,0 +1,39 @@
+#pragma once
+
+#include "provider/provider.h"
+#include "provider/sqlite/database_file.h"
+
+#include <span>
+
+namespace mirel::sqlite {
+
+// Writes single records of one table, by row id. Values are checked and converted for their columns first, so
+// a refused one leaves the record as it was.
+class RecordWriter {
+public:
+    // `fields` are a result's; all that are written must be columns of `table`. The file must outlive it.
+    RecordWriter(DatabaseFile& file, const dialect::Table& table, std::span<const ResultField> fields);
+
+    Outcome Add(std::span<const FieldChange> values, qint64& rowId);
+    // `rowId` becomes another where a column that is the row id was changed.
+    Outcome Update(std::span<const FieldChange> values, qint64& rowId);
+    Outcome Delete(qint64 rowId);
+
+    // Ends with ReadOnly for an expression, BadLiteral or Overflow for what does not fit.
+    Outcome Convert(const FieldChange& change, Value& converted) const;
+    QByteArray ColumnOf(int field) const;
+    const QByteArray& Table() const { return table_; } // as SQL
+    const QByteArray& RowId() const { return rowId_; } // its alias
+
+private:
+    Outcome ConvertAll(std::span<const FieldChange> values, std::vector<Value>& converted) const;
+    Outcome Run(const QByteArray& sql, std::span<const Value> values, qint64& rowId);
+
+    DatabaseFile& file_;
+    QString name_;
+    QByteArray table_;
+    QByteArray rowId_;
+    std::vector<ResultField> fields_;
+};
+
+} // namespace mirel::sqlite

@@ -1,0 +1,251 @@
+// Changing records: one at a time, all at once, and appended in bulk.
+#include "provider/database_fixture.h"
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+class RecordWrites : public DatabaseFixture {
+protected:
+    RecordWrites()
+    {
+        Run(u"CREATE TABLE T (Name Varchar(5),Small Smallint,Whole Integer,Real Float,Day DateTime,Flag Bit,"_s
+            u"Bytes Varbinary(3),Memo Text)"_s);
+    }
+
+    enum Fields { Name, Small, Whole, Real, Day, Flag, Bytes, Memo };
+
+    void Add(ProviderRecordset& cursor, std::initializer_list<FieldChange> values)
+    {
+        EXPECT_EQ(cursor.AddNew(values), Hr::Ok) << cursor.ErrorContext().toStdString();
+    }
+};
+
+TEST_F(RecordWrites, ComeBackAsTheyWereWritten)
+{
+    const auto cursor = Open(u"T"_s);
+    const Value written[] = {Value::Text(u"Äpfel"_s),
+                             Value::SmallInt(-5),
+                             Value::Integer(1 << 30),
+                             Value::Double(0.1),
+                             Value::Date(37076.25),
+                             Value::Bool(true),
+                             Value::Binary(QByteArray("\0\1", 2)),
+                             Value::Text(QString::fromUtf16(u"a\0b", 3))};
+    std::vector<FieldChange> values;
+    for (int field = Name; field <= Memo; ++field)
+        values.push_back({field, written[field]});
+    ASSERT_EQ(cursor->AddNew(values), Hr::Ok);
+    for (int field = Name; field <= Memo; ++field)
+        EXPECT_EQ(FieldOf(*cursor, field), written[field]) << field;
+    EXPECT_EQ(Rows(u"SELECT Day,Flag FROM T"_s), QStringList{u"2001-07-04 06:00:00|1"_s})
+        << "as the file holds it";
+
+    Add(*cursor, {});
+    for (int field = Name; field <= Memo; ++field)
+        EXPECT_EQ(FieldOf(*cursor, field), Value::Null()) << field;
+}
+
+TEST_F(RecordWrites, AreRefusedWholeWhenAValueDoesNotFit)
+{
+    const auto cursor = Open(u"T"_s);
+    Add(*cursor, {{Name, Value::Text(u"old"_s)}, {Whole, Value::Integer(1)}});
+    const struct {
+        const char* what;
+        FieldChange change;
+        Hr expected;
+    } rows[] = {
+        {"text too long", {Name, Value::Text(u"sixsix"_s)}, Hr::Overflow},
+        {"two units a character", {Name, Value::Text(u"\U0001F600\U0001F600\U0001F600"_s)}, Hr::Overflow},
+        {"no number", {Whole, Value::Text(u"abc"_s)}, Hr::BadLiteral},
+        {"number too large", {Small, Value::Integer(40000)}, Hr::Overflow},
+        {"no date", {Day, Value::Text(u"2001-02-30"_s)}, Hr::BadLiteral},
+        {"bytes too many", {Bytes, Value::Binary(QByteArray("1234"))}, Hr::Overflow},
+    };
+    for (const auto& row : rows) {
+        const FieldChange changes[] = {{Name, Value::Text(u"new"_s)}, row.change};
+        EXPECT_EQ(cursor->Update(changes), row.expected) << row.what;
+        EXPECT_EQ(cursor->AddNew(changes), row.expected) << row.what;
+    }
+    EXPECT_EQ(Rows(u"SELECT Name,Whole FROM T"_s), QStringList{u"old|1"_s});
+}
+
+TEST_F(RecordWrites, NeedAResultThatCanBeUpdated)
+{
+    Run(u"INSERT INTO T (Name,Whole) VALUES ('a',1)"_s);
+    Run(u"CREATE TABLE U (Whole Integer)"_s);
+    Run(u"INSERT INTO U (Whole) VALUES (1)"_s);
+    const struct {
+        QString source;
+        LockType asked;
+        LockType given;
+    } rows[] = {
+        {u"T"_s, LockType::Optimistic, LockType::Optimistic},
+        {u"T"_s, LockType::ReadOnly, LockType::ReadOnly},
+        {u"SELECT T.Name FROM T INNER JOIN U ON T.Whole=U.Whole"_s, LockType::Optimistic, LockType::Optimistic},
+        {u"SELECT T.Name,U.Whole FROM T INNER JOIN U ON T.Whole=U.Whole"_s, LockType::Optimistic,
+         LockType::ReadOnly},
+        {u"SELECT DISTINCT Name FROM T"_s, LockType::Optimistic, LockType::ReadOnly},
+        {u"MSysTables"_s, LockType::Optimistic, LockType::ReadOnly},
+    };
+    for (const auto& row : rows) {
+        const auto cursor = Open(row.source, CursorType::Static, row.asked);
+        EXPECT_EQ(cursor->Lock(), row.given) << row.source.toStdString();
+        const FieldChange change{0, Value::Text(u"b"_s)};
+        EXPECT_EQ(cursor->Update({&change, 1}), row.given == LockType::ReadOnly ? Hr::ReadOnly : Hr::Ok)
+            << row.source.toStdString();
+    }
+    const FieldChange computed{0, Value::Integer(1)};
+    EXPECT_EQ(Open(u"SELECT Whole+1,Name FROM T"_s)->Update({&computed, 1}), Hr::ReadOnly) << "an expression";
+}
+
+class BulkWrites : public RecordWrites {
+protected:
+    static constexpr int kCount = 3000;
+
+    BulkWrites()
+    {
+        Outside("WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<3000) "
+                "INSERT INTO T (Name,Whole,Small) SELECT 'x'||(n%10),n,0 FROM s");
+    }
+    QString Count(const QString& where) { return Rows(u"SELECT COUNT(*) FROM T WHERE "_s + where).value(0); }
+};
+
+TEST_F(BulkWrites, ChangeExactlyTheRecordsOfTheResult)
+{
+    const struct {
+        QString source;
+        int field; // Small in that result
+        int records;
+    } rows[] = {
+        {u"T"_s, Small, kCount},
+        {u"SELECT Small FROM T WHERE Name='x3'"_s, 0, 300},
+        {u"SELECT Small FROM T WHERE Small=0 AND Whole>100"_s, 0, kCount - 100},
+        {u"SELECT Small,Name FROM T WHERE Name='x1' ORDER BY Name DESC,Whole"_s, 0, 300},
+    };
+    for (const auto& row : rows) {
+        Run(u"UPDATE T SET Small=0"_s);
+        const auto cursor = Open(row.source);
+        qint64 told = 0;
+        EXPECT_EQ(
+            cursor->UpdateAll(row.field, Value::Text(u"7"_s), [&told](qint64 done) { return (told = done) >= 0; }),
+            Hr::Ok);
+        EXPECT_EQ(told, row.records) << row.source.toStdString();
+        EXPECT_EQ(Count(u"Small=7"_s).toInt(), row.records) << row.source.toStdString();
+        EXPECT_EQ(cursor->RecordCount(), row.records) << "the result keeps its records";
+    }
+    const auto cursor = Open(u"SELECT * FROM T WHERE Name='x3'"_s);
+    EXPECT_EQ(cursor->DeleteAll({}), Hr::Ok);
+    EXPECT_TRUE(cursor->AtEnd());
+    EXPECT_EQ(cursor->RecordCount(), 0);
+    EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount - 300);
+}
+
+TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
+{
+    const auto cursor = Open(u"T"_s);
+    EXPECT_EQ(cursor->UpdateAll(Small, Value::SmallInt(1), [](qint64 done) { return done < 2000; }), Hr::Ok);
+    EXPECT_EQ(Count(u"Small=1"_s), u"2048"_s);
+    EXPECT_EQ(cursor->UpdateAll(Small, Value::Text(u"x"_s), {}), Hr::BadLiteral);
+
+    const QString foreign = PathOf(u"foreign.db"_s);
+    Outside(foreign, "CREATE TABLE F (n INTEGER, v INTEGER CHECK (n<1500 OR v<5));"
+                     "WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<3000) "
+                     "INSERT INTO F SELECT n,0 FROM s");
+    auto checked = provider->CreateRecordset();
+    ASSERT_EQ(checked->Open(u"F"_s, foreign, CursorType::Static, LockType::Optimistic), Hr::Ok);
+    EXPECT_EQ(checked->UpdateAll(1, Value::Integer(9), {}), Hr::IntegrityViolation);
+    EXPECT_FALSE(checked->ErrorContext().isEmpty());
+    ASSERT_EQ(
+        checked->Open(u"SELECT COUNT(*) FROM F WHERE v=9"_s, foreign, CursorType::Static, LockType::ReadOnly),
+        Hr::Ok);
+    EXPECT_EQ(FieldOf(*checked), Value::Integer(1499));
+
+    EXPECT_EQ(cursor->DeleteAll([](qint64 done) { return done < 1000; }), Hr::Ok);
+    EXPECT_EQ(cursor->RecordCount(), kCount - 1024);
+    EXPECT_EQ(cursor->Position(), 0);
+}
+
+TEST_F(BulkWrites, AreOneTransactionBetweenBeginAndEnd)
+{
+    const auto cursor = Open(u"T"_s);
+    const auto outsideCount = [this] {
+        sqlite3* handle = nullptr;
+        sqlite3_stmt* statement = nullptr;
+        sqlite3_open(QFile::encodeName(path).constData(), &handle);
+        sqlite3_prepare_v2(handle, "SELECT count(*) FROM T", -1, &statement, nullptr);
+        sqlite3_step(statement);
+        const int count = sqlite3_column_int(statement, 0);
+        sqlite3_finalize(statement);
+        sqlite3_close(handle);
+        return count;
+    };
+    ASSERT_EQ(provider->BeginBulk(path), Hr::Ok);
+    ASSERT_EQ(provider->BeginBulk(path), Hr::Ok);
+    Add(*cursor, {});
+    ASSERT_EQ(provider->EndBulk(path), Hr::Ok);
+    Run(u"INSERT INTO T (Name) VALUES ('b')"_s);
+    EXPECT_EQ(outsideCount(), kCount);
+    ASSERT_EQ(provider->EndBulk(path), Hr::Ok);
+    EXPECT_EQ(outsideCount(), kCount + 2);
+    EXPECT_TRUE(Failed(provider->EndBulk(path))) << "there is none to end";
+}
+
+class Appending : public RecordWrites {
+protected:
+    std::unique_ptr<RecordAppender> Appender(const QStringList& columns, Hr expected = Hr::Ok)
+    {
+        Hr result = Hr::Unexpected;
+        QString reason;
+        auto appender = provider->CreateAppender(path, u"T"_s, columns, result, reason);
+        EXPECT_EQ(result, expected) << reason.toStdString();
+        return appender;
+    }
+};
+
+TEST_F(Appending, ChecksEachCellAndGoesOnAfterARefusedRecord)
+{
+    const auto appender = Appender({u"name"_s, u"Small"_s, u"Real"_s, u"Day"_s, u"Flag"_s});
+    ASSERT_TRUE(appender);
+    const struct {
+        const char* what;
+        std::vector<Cell> cells;
+        int refused;
+    } rows[] = {
+        {"texts",
+         {Cell::OfText("Äpfel"), Cell::OfText("12"), Cell::OfText("1.5"), Cell::OfText("2001-07-04T09:05"),
+          Cell::OfText("yes")},
+         -1},
+        {"numbers", {Cell(), Cell::Of(qint64(-3)), Cell::Of(2.5), Cell(), Cell::Of(qint64(5))}, -1},
+        {"text too long", {Cell::OfText("sechs!"), Cell(), Cell(), Cell(), Cell()}, 0},
+        {"out of range", {Cell(), Cell::OfText("32768"), Cell(), Cell(), Cell()}, 1},
+        {"no number", {Cell(), Cell(), Cell::OfText("1,5"), Cell(), Cell()}, 2},
+        {"no date", {Cell(), Cell(), Cell(), Cell::OfText("2001-13-04"), Cell()}, 3},
+        {"too few cells", {Cell()}, -1},
+    };
+    for (const auto& row : rows) {
+        const bool fits = row.refused < 0 && row.cells.size() == 5;
+        EXPECT_EQ(!Failed(appender->Append(row.cells)), fits) << row.what;
+        EXPECT_EQ(appender->RefusedField(), row.refused) << row.what;
+    }
+    ASSERT_EQ(appender->Commit(), Hr::Ok);
+    EXPECT_EQ(Rows(u"SELECT Name,Small,Real,Day,Flag FROM T"_s),
+              (QStringList{u"Äpfel|12|1.5|2001-07-04 09:05:00|1"_s, u"~|-3|2.5|~|1"_s}));
+}
+
+TEST_F(Appending, LeavesNothingWithoutCommit)
+{
+    const Cell cells[] = {Cell::OfText("a")};
+    {
+        const auto appender = Appender({u"Name"_s});
+        ASSERT_EQ(appender->Append(cells), Hr::Ok);
+    }
+    EXPECT_TRUE(Rows(u"SELECT Name FROM T"_s).isEmpty());
+    Appender({u"Nobody"_s}, Hr::NoSuchColumn);
+    Appender({u"Name"_s, u"NAME"_s}, Hr::DuplicateColumn);
+    EXPECT_EQ(Appender({})->Fields().size(), 8U);
+}
+
+} // namespace
+} // namespace mirel
