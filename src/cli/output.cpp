@@ -38,11 +38,15 @@ Output::~Output()
     Flush();
 }
 
-void Output::WriteLine(const QString& text)
+void Output::WriteText(const QString& text)
 {
     const QByteArray utf8 = text.toUtf8();
     Write({utf8.constData(), size_t(utf8.size())});
-    Write('\n');
+}
+
+void Output::WriteLine(const QString& text)
+{
+    WriteText(text + u'\n');
 }
 
 bool Output::Flush()

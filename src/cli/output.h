@@ -26,6 +26,7 @@ public:
         used_ += bytes.size();
     }
     void Write(char byte) { Write(std::string_view(&byte, 1)); }
+    void WriteText(const QString& text);
     void WriteLine(const QString& text);
 
     bool Flush(); // false once a write has failed

@@ -85,7 +85,7 @@ ExitStatus RunProgram(const QStringList& words, Output& output)
     if (!arguments)
         return RefuseArguments(fault, command);
     if (arguments->Has(Opt::Help)) {
-        output.WriteLine(command ? CommandHelp(*command) : ProgramHelp());
+        output.WriteText(command ? CommandHelp(*command) : ProgramHelp());
         return EndOutput(output, ExitStatus::Done);
     }
     if (arguments->Has(Opt::Version)) {

@@ -42,7 +42,8 @@ bool RunStatement(Run& run, const QString& statement)
                       (records.Fields().empty() || WriteRecords(run, records));
     if (!done)
         ReportProviderError(run.Prompt(), &records, records.LastResult());
-    return done && !run.Out().HasFailed() && !WasInterrupted();
+    // Whoever feeds a script may wait for the records before going on.
+    return done && run.Out().Flush() && !WasInterrupted();
 }
 
 bool RunScript(Run& run, QIODevice& script)
@@ -52,6 +53,8 @@ bool RunScript(Run& run, QIODevice& script)
         QByteArray line = script.readLine();
         while (line.endsWith('\n') || line.endsWith('\r'))
             line.chop(1);
+        if (WasInterrupted())
+            return false;
         const std::optional<QString> statement = splitter.AddLine(QString::fromUtf8(line));
         if (statement && !statement->isEmpty() && !RunStatement(run, *statement))
             return false;
