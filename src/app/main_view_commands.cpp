@@ -106,11 +106,9 @@ bool MainViewCommands::DeleteDatabase(const QString& path)
 
 bool MainViewCommands::OpenSample()
 {
-    const QString before = session_.Path();
-    if (sample_.EnsureExists(session_))
-        return OpenDatabase(sample_.Path());
-    OpenDatabase(before);
-    return false;
+    const bool opened = sample_.Open(session_);
+    Refill();
+    return opened;
 }
 
 bool MainViewCommands::AddFavorite()

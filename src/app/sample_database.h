@@ -16,11 +16,13 @@ public:
     SampleDatabase(const ProgramFolder& folder, QString source);
 
     QString Path() const { return path_; }
-    // Makes it where it is not there. False when that fails; why was told to the session's prompt, and nothing
-    // half-made is left. No database is open afterwards.
-    bool EnsureExists(DatabaseSession& session) const;
+    // Opens it in the session, and makes it first where it is not there. False, with no database open, when that
+    // fails: why was told to the session's prompt, and nothing half-made is left.
+    bool Open(DatabaseSession& session) const;
 
 private:
+    bool Make(DatabaseSession& session, const QString& path) const;
+
     QString folder_;
     QString path_;
     QString source_;
