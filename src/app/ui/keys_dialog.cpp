@@ -1,5 +1,6 @@
 #include "app/ui/keys_dialog.h"
 
+#include "app/ui/window_place.h"
 #include "resources/string_table.h"
 
 #include <QAction>
@@ -34,7 +35,7 @@ void ShowKeys(QWidget& window)
     auto* lines = new QVBoxLayout(&dialog);
     lines->addWidget(keys);
     lines->addWidget(buttons);
-    dialog.resize(dialog.sizeHint().boundedTo(window.size()));
+    dialog.resize(IsHandheldSize(window.size()) ? window.size() : keys->sizeHint() * 3 / 2);
     dialog.exec();
 }
 

@@ -92,6 +92,7 @@ bool UsePalette(QStringView name)
 TouchTargetStyle::TouchTargetStyle(const QString& baseStyle)
     : QProxyStyle(baseStyle.isEmpty() ? nullptr : QStyleFactory::create(baseStyle))
     , target_(HasTouchScreen() ? kFingerTarget : kStylusTarget)
+    , own_(!baseStyle.isEmpty())
 {
 }
 
@@ -127,6 +128,15 @@ int TouchTargetStyle::pixelMetric(PixelMetric metric, const QStyleOption* option
     const int roomy = QProxyStyle::pixelMetric(metric, option, widget);
     const auto* tabs = metric == PM_TabBarTabHSpace ? qobject_cast<const CompactTabBar*>(widget) : nullptr;
     return tabs ? tabs->SpaceInTabPx(roomy) : roomy;
+}
+
+int TouchTargetStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                                QStyleHintReturn* returnData) const
+{
+    // The style's own pictures on OK and Cancel go with no palette of ours.
+    if (own_ && hint == SH_DialogButtonBox_ButtonsHaveIcons)
+        return 0;
+    return QProxyStyle::styleHint(hint, option, widget, returnData);
 }
 
 } // namespace mirel

@@ -25,9 +25,12 @@ public:
     QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& contentsSize,
                            const QWidget* widget) const override;
     int pixelMetric(PixelMetric metric, const QStyleOption* option, const QWidget* widget) const override;
+    int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                  QStyleHintReturn* returnData) const override;
 
 private:
     int target_;
+    bool own_; // a style of our choice, not the desktop's
 };
 
 } // namespace mirel

@@ -200,8 +200,10 @@ void CLumoView::ShowList()
 {
     list_->SetLines(Lines());
     list_->SetRow(state_.SelectedRow());
+    setFocusProxy(list_);
     if (!state_.HasDatabase()) {
         pages_->setCurrentWidget(welcome_);
+        setFocusProxy(welcome_);
     } else if (!state_.ShownEntries().empty()) {
         pages_->setCurrentWidget(list_);
     } else {

@@ -1,4 +1,146 @@
-int main()
+#include "app/main_view_commands.h"
+#include "app/ui/look.h"
+#include "app/ui/main_frame.h"
+#include "app/ui/message_box_prompt.h"
+#include "app/window_options.h"
+#include "cli/console_prompt.h"
+
+#include <QApplication>
+
+#include <cstdio>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr int kDone = 0;
+constexpr int kFailed = 1;
+constexpr int kWrongArguments = 2;
+constexpr bool kAnswerNo = false;
+
+const QString kSampleSource = u":/samples"_s;
+
+void Say(std::FILE* stream, const QString& text)
 {
-    return 0;
+    std::fputs(text.toUtf8().constData(), stream);
+}
+
+// The core of the program, from the ground up; a window stands on it, or none.
+struct Core {
+    Core(const QString& home, UserPrompt& prompt)
+        : folder(ProgramFolder::Find(home))
+        , profile(folder.ProfileFile())
+        , settings(profile)
+        , session(connection, folder, prompt)
+        , commands(session, state, settings, SampleDatabase(folder, kSampleSource))
+    {
+    }
+
+    ProgramFolder folder;
+    Profile profile;
+    Settings settings;
+    DbConnection connection;
+    DatabaseSession session;
+    MainViewState state;
+    MainViewCommands commands;
+};
+
+int PrintSamplePath(const WindowOptions& options)
+{
+    cli::ConsolePrompt prompt(kAnswerNo);
+    Core core(options.home, prompt);
+    const SampleDatabase sample(core.folder, kSampleSource);
+    if (!sample.Open(core.session))
+        return kFailed;
+    Say(stdout, sample.Path() + u'\n');
+    return kDone;
+}
+
+void Open(Core& core, const WindowOptions& options)
+{
+    if (options.sample)
+        core.commands.OpenSample();
+    else
+        core.commands.RestoreLastRun(options.database);
+}
+
+int TakePicture(const WindowOptions& options)
+{
+    cli::ConsolePrompt prompt(kAnswerNo); // nobody is there to press a button
+    Core core(options.home, prompt);
+    Open(core, options);
+    CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
+    QWidget* shown = &frame;
+    if (!options.table.isEmpty()) {
+        const QString statement = u"SELECT * FROM "_s + FieldReference(options.table);
+        shown = frame.OpenTable({options.table, statement, options.table});
+    }
+    if (!shown)
+        return kFailed;
+    shown->setWindowState(Qt::WindowNoState);
+    shown->resize(options.size);
+    shown->show();
+    QCoreApplication::processEvents();
+    if (shown->grab().save(options.picture, "PNG"))
+        return kDone;
+    Say(stderr, u"mirel: cannot write %1\n"_s.arg(options.picture));
+    return kFailed;
+}
+
+int ShowWindow(const WindowOptions& options)
+{
+    MessageBoxPrompt prompt;
+    Core core(options.home, prompt);
+    CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
+    frame.show();
+    Open(core, options); // after show: what it has to say stands over the window
+    frame.ShowState();
+    const int result = QApplication::exec();
+    core.commands.KeepForNextRun();
+    return result;
+}
+
+std::optional<int> AnswerWithoutWindow(const WindowOptions& options)
+{
+    if (options.help) {
+        Say(stdout, WindowOptionsHelp());
+        return kDone;
+    }
+    if (options.version) {
+        Say(stdout, u"mirel %1\n"_s.arg(QStringLiteral(MIREL_VERSION)));
+        return kDone;
+    }
+    if (options.printSamplePath)
+        return PrintSamplePath(options);
+    return std::nullopt;
+}
+
+} // namespace
+} // namespace mirel
+
+int main(int argc, char** argv)
+{
+    using namespace mirel;
+    QStringList arguments;
+    for (int i = 1; i < argc; ++i)
+        arguments += QString::fromLocal8Bit(argv[i]);
+    QString complaint;
+    const std::optional<WindowOptions> options = ParseWindowOptions(arguments, complaint);
+    if (!options) {
+        Say(stderr, QStringLiteral("mirel: %1\nTry mirel --help.\n").arg(complaint));
+        return kWrongArguments;
+    }
+    QCoreApplication::setApplicationName(QStringLiteral("Mirel"));
+    if (const std::optional<int> result = AnswerWithoutWindow(*options))
+        return *result;
+
+    const bool picture = !options->picture.isEmpty();
+    if (picture)
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    QGuiApplication::setApplicationDisplayName(QStringLiteral("Mirel"));
+    if (!UsePalette(options->palette))
+        QApplication::setStyle(new TouchTargetStyle({}));
+    return picture ? TakePicture(*options) : ShowWindow(*options);
 }

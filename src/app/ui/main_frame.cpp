@@ -62,6 +62,7 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     connect(view_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
     RestorePlace(*this, profile, kFramePlace, kFrameFirstSize);
     ShowState();
+    view_->setFocus();
 }
 
 void CMainFrame::MakeMenus()
@@ -76,8 +77,10 @@ void CMainFrame::MakeMenus()
                                                {ShellMenu::Layout, layout},
                                                {ShellMenu::Database, database},
                                                {ShellMenu::Help, help}};
-    for (const auto& [id, menu] : menus)
+    for (const auto& [id, menu] : menus) {
         menu->setToolTipsVisible(true); // they say why an entry cannot be chosen
+        LeaveOutKeysWhenSmall(menu);
+    }
     for (const ShellCommandDef& definition : ShellCommands()) {
         const auto menu = menus.find(definition.menu);
         if (menu == menus.end())
@@ -90,6 +93,16 @@ void CMainFrame::MakeMenus()
     }
     database->addMenu(recentMenu_);
     connect(recentMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
+}
+
+// On a handheld a menu with its column of keys is wider than the screen.
+void CMainFrame::LeaveOutKeysWhenSmall(QMenu* menu)
+{
+    connect(menu, &QMenu::aboutToShow, this, [this, menu] {
+        if (IsHandheldSize(size()))
+            actions_->HideKeys(menu->actions());
+    });
+    connect(menu, &QMenu::aboutToHide, actions_, &ShellActions::ShowKeys);
 }
 
 void CMainFrame::FillRecentMenu()

@@ -37,6 +37,7 @@ protected:
 
 private:
     void MakeMenus();
+    void LeaveOutKeysWhenSmall(QMenu* menu);
     void FillRecentMenu();
     void Run(ShellCommand id);
     void ChooseAndOpenDatabase();

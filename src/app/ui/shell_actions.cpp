@@ -19,12 +19,24 @@ ShellActions::ShellActions(QObject* parent)
         const ShellCommand id = definition.id;
         auto* action = new QAction(ThemeIcon(TextOf(definition.icon)), StringText(definition.text), this);
         action->setIconText(action->text()); // buttons keep the mnemonic
-        action->setShortcut(QKeySequence(TextOf(definition.keys), QKeySequence::PortableText));
         action->setCheckable(id == ShellCommand::OpenByDoubleClicking);
         action->setMenuRole(QAction::NoRole);
         connect(action, &QAction::triggered, this, [this, id] { Q_EMIT Given(id); });
         actions_.emplace(id, action);
     }
+    ShowKeys();
+}
+
+void ShellActions::HideKeys(const QList<QAction*>& actions)
+{
+    for (QAction* action : actions)
+        action->setShortcut({});
+}
+
+void ShellActions::ShowKeys()
+{
+    for (const ShellCommandDef& definition : ShellCommands())
+        Of(definition.id)->setShortcut(QKeySequence(TextOf(definition.keys), QKeySequence::PortableText));
 }
 
 void ShellActions::Follow(const MainViewState& state)
