@@ -2,7 +2,6 @@
 
 #include "platform/date_text_reader.h"
 #include "platform/number_text.h"
-#include "platform/number_text.h"
 #include "platform/ole_date.h"
 
 #include <QDate>
