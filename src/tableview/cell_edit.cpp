@@ -51,6 +51,12 @@ void CellEdit::Revert()
     pending_ = false;
 }
 
+void CellEdit::ShowText(const QString& text)
+{
+    text_ = text;
+    pending_ = false;
+}
+
 Value CellEdit::Stored() const
 {
     return kind_ == EditorKind::Check ? Value::Bool(checked_) : TypedValue(text_, type_);

@@ -26,6 +26,7 @@ public:
     void SetChecked(bool checked);
     void Clear(); // to NULL; an unticked box for a Yes/No
     void Revert();
+    void ShowText(const QString& text); // what is no edit: a later Revert gives the loaded text back
 
     Value Stored() const;
 

@@ -191,7 +191,20 @@ void RecordBrowser::ReportFailure()
 
 QString RecordBrowser::FieldLabel() const
 {
+    if (!shownLabel_.isEmpty())
+        return shownLabel_;
     return selectedField_ < 0 ? QString() : StringText(Str::FieldLabel, {FieldName(selectedField_)});
+}
+
+Value RecordBrowser::SelectedValue() const
+{
+    return SelectedRecord() < 0 ? Value::Null() : recordset_.FieldValue(selectedField_);
+}
+
+void RecordBrowser::ShowInEditor(const QString& label, const QString& text)
+{
+    shownLabel_ = label;
+    edit_.ShowText(text);
 }
 
 bool RecordBrowser::IsWritable(int field) const

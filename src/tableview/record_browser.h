@@ -58,6 +58,9 @@ public:
     int FieldCount() const { return recordset_.FieldCount(); }
     QString FieldName(int field) const { return recordset_.FieldName(field); }
     FieldType TypeOfField(int field) const { return recordset_.TypeOfField(field); }
+    std::span<const ResultField> Fields() const { return recordset_.Fields(); }
+    // The result itself, for the commands that work on all of its records. They leave it on the selected one.
+    DbRecordset& Recordset() { return recordset_; }
 
     // The count, where it is known; CountOn counts on for a while and returns true once it is.
     std::optional<qint64> KnownCount() const { return count_; }
@@ -135,6 +138,11 @@ public:
     void RepeatAbove(); // the value of the same field in the record before
     void RevertEdit();
     QString SelectedText() const; // what the cell holds, or would with the pending edit; whole
+    Value SelectedValue() const;  // what the record holds; null without a selection
+    // What is pending as a value of the field's type.
+    Value EditedValue() const { return edit_.Stored(); }
+    // Shows a text in the editor that is none of the record's: the result of a command. It is no edit.
+    void ShowInEditor(const QString& label, const QString& text);
 
     [[nodiscard]] bool WriteEdit();
     bool WriteFailed() const { return writeFailed_; }
@@ -205,6 +213,7 @@ private:
     ListState listState_; // while the detail is shown
 
     CellEdit edit_;
+    QString shownLabel_; // of a text in the editor that is none of the record's
     bool writeFailed_ = false;
     QString writeError_;
 };

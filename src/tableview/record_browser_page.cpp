@@ -218,6 +218,7 @@ void RecordBrowser::LoadEditor()
 {
     const qint64 record = SelectedRecord();
     writeFailed_ = false;
+    shownLabel_.clear();
     if (!IsOpen() || record < 0 || selectedField_ < 0 || !recordset_.MoveTo(record)) {
         edit_.Unload();
         return;

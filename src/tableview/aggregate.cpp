@@ -1,0 +1,59 @@
+#include "tableview/aggregate.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace mirel {
+namespace {
+
+double NumberOf(const Cell& cell)
+{
+    return cell.kind == Cell::Kind::Integer ? double(cell.integer) : cell.real;
+}
+
+bool IsTaken(const Cell& cell)
+{
+    return cell.kind == Cell::Kind::Integer || cell.kind == Cell::Kind::Real;
+}
+
+} // namespace
+
+QString AggregateResult::Text(Aggregate kind) const
+{
+    if (values == 0 && (kind == Aggregate::Max || kind == Aggregate::Min))
+        return {};
+    if (value == std::trunc(value)) // the negative zero is a zero to people
+        return QString::number(value == 0 ? 0.0 : value, 'f', 0);
+    QString text = QString::number(value, 'f', 6);
+    while (text.endsWith(u'0'))
+        text.chop(1);
+    if (text.endsWith(u'.'))
+        text.chop(1);
+    return text;
+}
+
+std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggregate kind)
+{
+    AggregateResult taken;
+    const auto take = [&](std::span<const Cell> cells) {
+        const Cell& cell = cells.front();
+        if (!IsTaken(cell))
+            return true;
+        const double number = NumberOf(cell);
+        if (kind == Aggregate::Sum || kind == Aggregate::Avg)
+            taken.value += number;
+        else if (taken.values == 0)
+            taken.value = number;
+        else
+            taken.value = kind == Aggregate::Max ? std::max(taken.value, number) : std::min(taken.value, number);
+        ++taken.values;
+        return true;
+    };
+    if (!result.Read({.fields = {field}, .order = ReadRange::Order::Any}, take))
+        return {};
+    if (kind == Aggregate::Avg && taken.values > 0)
+        taken.value /= double(taken.values);
+    return taken;
+}
+
+} // namespace mirel

@@ -1,0 +1,60 @@
+#include "tableview/ui/sort_dialog.h"
+
+#include "resources/string_table.h"
+#include "tableview/filter_condition.h"
+#include "tableview/ui/field_chooser.h"
+
+#include <QComboBox>
+#include <QDialogButtonBox>
+#include <QFormLayout>
+#include <QLineEdit>
+#include <QVBoxLayout>
+
+namespace mirel {
+
+using namespace Qt::StringLiterals;
+
+CSortDialog::CSortDialog(FieldLists& lists, const QString& table, QWidget* parent)
+    : QDialog(parent)
+    , terms_(new QLineEdit(this))
+{
+    setWindowTitle(StringText(Str::SortTitle));
+    auto* chooser = new FieldChooser(lists, this);
+    chooser->Choose(table, {});
+    auto* directions = new QComboBox(this);
+    directions->addItems({u"ASC"_s, u"DESC"_s});
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+
+    auto* form = new QFormLayout;
+    form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
+    form->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    form->addRow(StringText(Str::SortOrderBy), terms_);
+    form->addRow(chooser);
+    form->addRow(StringText(Str::SortDirection), directions);
+    auto* column = new QVBoxLayout(this);
+    column->addLayout(form);
+    column->addStretch(1);
+    column->addWidget(buttons);
+
+    connect(chooser, &FieldChooser::fieldPicked, this,
+            [this, chooser] { Insert(SortFieldInsertion(terms_->text(), chooser->Table(), chooser->Field())); });
+    connect(directions, &QComboBox::textActivated, this,
+            [this](const QString& word) { Insert(WordInsertion(terms_->text(), word)); });
+    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    terms_->setFocus();
+}
+
+QString CSortDialog::Terms() const
+{
+    return terms_->text();
+}
+
+// As if it were typed at the caret.
+void CSortDialog::Insert(const QString& text)
+{
+    terms_->setFocus();
+    terms_->insert(text);
+}
+
+} // namespace mirel
