@@ -60,6 +60,9 @@ void MainViewCommands::KeepForNextRun()
 
 void MainViewCommands::Refill()
 {
+    // Also now, not at the end alone: a program that is killed comes back to its database.
+    if (settings_.Text(Setting::ActiveDb) != session_.Path())
+        settings_.SetText(Setting::ActiveDb, session_.Path());
     DatabaseContents contents;
     contents.path = session_.Path();
     if (session_.IsOpen()) {

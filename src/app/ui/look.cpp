@@ -139,4 +139,23 @@ int TouchTargetStyle::styleHint(StyleHint hint, const QStyleOption* option, cons
     return QProxyStyle::styleHint(hint, option, widget, returnData);
 }
 
+QIcon TouchTargetStyle::standardIcon(StandardPixmap which, const QStyleOption* option, const QWidget* widget) const
+{
+    if (own_) {
+        switch (which) {
+        case SP_MessageBoxQuestion:
+            return ThemeIcon(u"dialog-question");
+        case SP_MessageBoxInformation:
+            return ThemeIcon(u"dialog-information");
+        case SP_MessageBoxWarning:
+            return ThemeIcon(u"dialog-warning");
+        case SP_MessageBoxCritical:
+            return ThemeIcon(u"dialog-error");
+        default:
+            break;
+        }
+    }
+    return QProxyStyle::standardIcon(which, option, widget);
+}
+
 } // namespace mirel

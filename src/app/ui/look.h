@@ -27,6 +27,7 @@ public:
     int pixelMetric(PixelMetric metric, const QStyleOption* option, const QWidget* widget) const override;
     int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
                   QStyleHintReturn* returnData) const override;
+    QIcon standardIcon(StandardPixmap which, const QStyleOption* option, const QWidget* widget) const override;
 
 private:
     int target_;

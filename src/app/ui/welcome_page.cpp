@@ -5,7 +5,7 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QLabel>
-#include <QToolButton>
+#include <QPushButton>
 #include <QVBoxLayout>
 
 namespace mirel {
@@ -13,13 +13,13 @@ namespace {
 
 constexpr int kWidthInCharacters = 46; // wider, a column of buttons looks lost
 
-QToolButton* WayIn(QAction* action, QWidget* parent)
+// Without the command's mnemonic, which the buttons under the lists bear as well.
+QPushButton* WayIn(QAction* action, QWidget* parent)
 {
-    auto* button = new QToolButton(parent);
-    button->setDefaultAction(action);
-    button->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
-    button->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-    button->setFocusPolicy(Qt::StrongFocus);
+    auto* button = new QPushButton(action->icon(), action->text().remove(u'&'), parent);
+    button->setToolTip(action->statusTip());
+    button->setAutoDefault(true); // Enter presses it, not the space bar alone
+    QObject::connect(button, &QPushButton::clicked, action, &QAction::trigger);
     return button;
 }
 
@@ -64,7 +64,7 @@ WelcomePage::WelcomePage(const ShellActions& actions, QWidget* parent)
     setWidgetResizable(true);
     setFrameShape(NoFrame);
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    setFocusProxy(column->findChild<QToolButton*>());
+    setFocusProxy(column->findChild<QPushButton*>());
 
     // Going back to a database is one tap, whatever opens the entries of the lists: nothing is edited here.
     connect(recentList_, &EntryList::Tapped, this, [this](int row, Tap tap) {
