@@ -22,6 +22,19 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+QString AcceptText(FileUse use)
+{
+    switch (use) {
+    case FileUse::Open:
+        return StringText(Str::CommandOpen);
+    case FileUse::Create:
+        return StringText(Str::CommandNew);
+    case FileUse::Delete:
+        break;
+    }
+    return StringText(Str::CommandDelete);
+}
+
 // The file dialog of a small screen: fills the window, one list, one line for the name.
 class CFileDialog : public QDialog {
 public:
@@ -35,7 +48,7 @@ public:
         , name_(new QLineEdit(this))
         , buttons_(new QDialogButtonBox(QDialogButtonBox::Cancel, this))
     {
-        accept_ = buttons_->addButton(use == FileUse::Open ? QDialogButtonBox::Open : QDialogButtonBox::Save);
+        accept_ = buttons_->addButton(AcceptText(use), QDialogButtonBox::AcceptRole);
         up_->setIcon(ThemeIcon(u"go-up"));
         up_->setToolTip(StringText(Str::FolderUp));
         up_->setAccessibleName(StringText(Str::FolderUp));
@@ -111,7 +124,7 @@ private:
         folder_->SetText(QDir::toNativeSeparators(choice_.Folder()));
         folder_->setToolTip(folder_->Text());
         up_->setEnabled(choice_.CanGoUp());
-        if (use_ == FileUse::Open)
+        if (use_ != FileUse::Create)
             name_->clear();
         accept_->setEnabled(!name_->text().isEmpty());
     }
@@ -145,10 +158,12 @@ QString ChooseDatabase(QWidget& parent, Str title, FileUse use, const QString& n
     const QString caption = StringText(title).remove(u'&');
     if (IsHandheldSize(parent.size()))
         return ChooseOnSmallScreen(parent, caption, use, folder);
-    const QString filter = StringText(Str::DatabaseFilter);
-    return use == FileUse::Open ? QFileDialog::getOpenFileName(&parent, caption, folder, filter)
-                                : QFileDialog::getSaveFileName(&parent, caption, folder, filter, nullptr,
-                                                               QFileDialog::DontConfirmOverwrite);
+    QFileDialog dialog(&parent, caption, folder, StringText(Str::DatabaseFilter));
+    dialog.setAcceptMode(use == FileUse::Create ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
+    dialog.setFileMode(use == FileUse::Create ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
+    dialog.setOption(QFileDialog::DontConfirmOverwrite);
+    dialog.setLabelText(QFileDialog::Accept, AcceptText(use).remove(u'&'));
+    return dialog.exec() == QDialog::Accepted ? dialog.selectedFiles().value(0) : QString();
 }
 
 } // namespace mirel

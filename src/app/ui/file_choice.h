@@ -8,7 +8,7 @@ class QWidget;
 
 namespace mirel {
 
-enum class FileUse { Open, Create };
+enum class FileUse { Open, Create, Delete };
 
 // Asks the user for a database file; empty when there is none. `title` is a command's text. The dialog begins in
 // the folder of `near`, in the user's documents when that is empty. On a screen too small for the desktop's

@@ -57,19 +57,21 @@ int PrintSamplePath(const WindowOptions& options)
     return kDone;
 }
 
-void Open(Core& core, const WindowOptions& options)
+// False when what was asked for does not open. That the last run's database is gone is no failure.
+bool Open(Core& core, const WindowOptions& options)
 {
     if (options.sample)
-        core.commands.OpenSample();
-    else
-        core.commands.RestoreLastRun(options.database);
+        return core.commands.OpenSample();
+    core.commands.RestoreLastRun(options.database);
+    return options.database.isEmpty() || core.session.IsOpen();
 }
 
 int TakePicture(const WindowOptions& options)
 {
     cli::ConsolePrompt prompt(kAnswerNo); // nobody is there to press a button
     Core core(options.home, prompt);
-    Open(core, options);
+    if (!Open(core, options))
+        return kFailed;
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
     QWidget* shown = &frame;
     if (!options.table.isEmpty()) {
@@ -94,7 +96,7 @@ int ShowWindow(const WindowOptions& options)
     Core core(options.home, prompt);
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
     frame.show();
-    Open(core, options); // after show: what it has to say stands over the window
+    (void)Open(core, options); // after show: what it has to say stands over the window
     frame.ShowState();
     const int result = QApplication::exec();
     core.commands.KeepForNextRun();

@@ -73,6 +73,7 @@ void CMainFrame::MakeMenus()
     QMenu* database = menuBar()->addMenu(StringText(Str::MenuDatabase));
     QMenu* help = menuBar()->addMenu(StringText(Str::MenuHelp));
     recentMenu_ = new QMenu(StringText(Str::MenuRecent), database);
+    recentMenu_->setToolTipsVisible(true); // the paths
     const std::map<ShellMenu, QMenu*> menus = {{ShellMenu::File, file},
                                                {ShellMenu::Layout, layout},
                                                {ShellMenu::Database, database},
@@ -115,7 +116,6 @@ void CMainFrame::FillRecentMenu()
         action->setToolTip(QDir::toNativeSeparators(path));
         connect(action, &QAction::triggered, this, [this, path] { OpenPath(path); });
     }
-    recentMenu_->setToolTipsVisible(true);
 }
 
 void CMainFrame::ShowState()
@@ -244,7 +244,7 @@ void CMainFrame::ChooseAndCreateDatabase()
 
 void CMainFrame::ChooseAndDeleteDatabase()
 {
-    const QString path = ChooseDatabase(*this, Str::CommandDeleteDatabase, FileUse::Open, state_.DatabasePath());
+    const QString path = ChooseDatabase(*this, Str::CommandDeleteDatabase, FileUse::Delete, state_.DatabasePath());
     if (!path.isEmpty() && CloseTables())
         commands_.DeleteDatabase(path);
 }

@@ -1,0 +1,138 @@
+#include "app/ui/main_frame.h"
+
+#include "app/ui/look.h"
+#include "support/printing.h"
+#include "support/scripted_prompt.h"
+#include "tableview/ui/table_view.h"
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QDir>
+#include <QDropEvent>
+#include <QMenuBar>
+#include <QMimeData>
+#include <QTemporaryDir>
+#include <QTest>
+#include <QUrl>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+class MainFrameTest : public ::testing::Test {
+protected:
+    static void SetUpTestSuite() { QApplication::setStyle(new TouchTargetStyle(u"Fusion"_s)); }
+
+    void SetUp() override
+    {
+        ASSERT_TRUE(commands_.NewDatabase(PathOf(u"shop.cdb"_s)));
+        ASSERT_TRUE(Execute(u"CREATE TABLE [Birds] ([Name] Varchar(40),[Wings] SmallInt)"_s));
+        ASSERT_TRUE(Execute(u"INSERT INTO Birds (Name,Wings) VALUES ('Wren',2)"_s));
+        commands_.Refill();
+        frame_.ShowState();
+        frame_.resize(700, 500);
+        frame_.show();
+    }
+
+    bool Execute(const QString& statement)
+    {
+        return session_.GetCatalog().ExecuteStatement(session_.Path(), statement);
+    }
+    QString PathOf(const QString& name) const { return QDir(folder_.path()).filePath(name); }
+    QWidget* OpenBirds() { return frame_.OpenTable({u"Birds"_s, u"SELECT * FROM Birds"_s, u"Birds"_s}); }
+    qsizetype TableViews() const { return frame_.findChildren<CTableView*>().size(); }
+
+    // Drags one file onto the frame and lets it go; false when the frame does not want it.
+    bool Drop(const QString& path)
+    {
+        QMimeData data;
+        data.setUrls({QUrl::fromLocalFile(path)});
+        QDragEnterEvent enter(QPoint(50, 50), Qt::CopyAction | Qt::MoveAction, &data, Qt::LeftButton, {});
+        QApplication::sendEvent(&frame_, &enter);
+        if (!enter.isAccepted())
+            return false;
+        QDropEvent drop(QPointF(50, 50), Qt::CopyAction | Qt::MoveAction, &data, Qt::LeftButton, {});
+        QApplication::sendEvent(&frame_, &drop);
+        EXPECT_EQ(drop.dropAction(), Qt::CopyAction);
+        return true;
+    }
+
+    QTemporaryDir folder_;
+    ProgramFolder programFolder_{folder_.path()};
+    ScriptedPrompt prompt_;
+    Profile profile_{programFolder_.ProfileFile()};
+    Settings settings_{profile_};
+    DbConnection connection_;
+    DatabaseSession session_{connection_, programFolder_, prompt_};
+    MainViewState state_;
+    MainViewCommands commands_{session_, state_, settings_, SampleDatabase(programFolder_, {})};
+    CMainFrame frame_{session_, state_, commands_, settings_, profile_};
+};
+
+TEST_F(MainFrameTest, EveryMenuEntryHasItsMnemonicAndSaysWhatItDoes)
+{
+    QSet<QString> seen;
+    for (const QMenu* menu : frame_.menuBar()->findChildren<QMenu*>()) {
+        if (menu->title().isEmpty())
+            continue; // the menu bar's own, for what does not fit
+        EXPECT_TRUE(menu->toolTipsVisible()) << menu->title().toStdString();
+        QSet<QChar> mnemonics;
+        for (const QAction* action : menu->actions()) {
+            if (action->isSeparator())
+                continue;
+            const QString text = action->text();
+            const QChar mnemonic = text.section(u'&', 1, 1).left(1).toLower().front();
+            EXPECT_FALSE(mnemonics.contains(mnemonic)) << text.toStdString() << ": its letter is taken";
+            mnemonics += mnemonic;
+            seen += QString(text).remove(u'&');
+            if (!action->menu()) {
+                EXPECT_FALSE(action->toolTip().isEmpty()) << text.toStdString();
+            }
+        }
+    }
+    for (const QString& entry :
+         {u"Add Favorites"_s, u"Remove from Favorites"_s, u"Open by Double-Clicking"_s, u"Font"_s,
+          u"Background Color"_s, u"List Background Color"_s, u"Button Background Color"_s,
+          u"Current DB Text Color"_s, u"List Text Color"_s, u"Button Text Color"_s, u"Import from CSV ..."_s,
+          u"Export to CSV ..."_s, u"Exit"_s, u"Open Database"_s, u"New Database"_s, u"Delete Database"_s,
+          u"About Mirel"_s, u"Help"_s})
+        EXPECT_TRUE(seen.contains(entry)) << entry.toStdString();
+}
+
+TEST_F(MainFrameTest, ATableOpensOnceAndComesForwardAgain)
+{
+    QWidget* first = OpenBirds();
+    ASSERT_TRUE(first);
+    EXPECT_EQ(OpenBirds(), first);
+    EXPECT_EQ(TableViews(), 1);
+    EXPECT_FALSE(frame_.OpenTable({u"Bees"_s, u"SELECT * FROM Bees"_s, u"Bees"_s}));
+    EXPECT_EQ(prompt_.shown.size(), 1);
+    EXPECT_EQ(TableViews(), 1);
+}
+
+TEST_F(MainFrameTest, ADroppedDatabaseOpensAndClosesTheTablesOfTheOneBefore)
+{
+    ASSERT_TRUE(commands_.NewDatabase(PathOf(u"other.cdb"_s)));
+    ASSERT_TRUE(commands_.OpenDatabase(PathOf(u"shop.cdb"_s)));
+    ASSERT_TRUE(OpenBirds());
+    EXPECT_FALSE(Drop(PathOf(u"notes.txt"_s)));
+    EXPECT_TRUE(Drop(PathOf(u"other.cdb"_s)));
+    EXPECT_EQ(state_.DatabaseName(), u"other.cdb"_s);
+    EXPECT_TRUE(frame_.windowTitle().contains(u"other.cdb"_s));
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    EXPECT_EQ(TableViews(), 0);
+}
+
+TEST_F(MainFrameTest, ClosingKeepsTheWindowsSizeForTheNextRun)
+{
+    frame_.resize(640, 480);
+    ASSERT_TRUE(OpenBirds());
+    EXPECT_TRUE(frame_.close());
+    const CMainFrame next(session_, state_, commands_, settings_, profile_);
+    EXPECT_EQ(next.size(), QSize(640, 480));
+}
+
+} // namespace
+} // namespace mirel
