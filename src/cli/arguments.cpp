@@ -15,6 +15,12 @@ QString FromAscii(const char* text)
     return QString::fromLatin1(text);
 }
 
+// What the option's value may be, as the help shows it.
+QString ValueOf(const OptionDef& option, const CommandDef* command)
+{
+    return FromAscii(option.kind == ValueKind::Format && command ? command->formats : option.value);
+}
+
 bool IsTakenBy(const CommandDef* command, Opt option)
 {
     constexpr std::array kEverywhere = {Opt::Home, Opt::Help, Opt::Timing};
@@ -96,11 +102,23 @@ private:
         return arguments_.command ? true : Refuse(Str::CliUnknownCommand, {word});
     }
 
+    bool IsFormatHere(const Arguments::Given& given)
+    {
+        const OptionDef& option = DefinitionOf(given.option);
+        if (option.kind != ValueKind::Format)
+            return true;
+        const QString formats = ValueOf(option, arguments_.command);
+        return formats.split(u'|').contains(given.value) ||
+               Refuse(Str::CliValueWrong, {given.value, FromAscii(option.name), formats});
+    }
+
     bool IsComplete()
     {
         for (const Arguments::Given& given : arguments_.options) {
             if (!IsTakenBy(arguments_.command, given.option))
                 return Refuse(Str::CliOptionNotHere, {FromAscii(DefinitionOf(given.option).name)});
+            if (!IsFormatHere(given))
+                return false;
         }
         if (arguments_.Has(Opt::Help) || arguments_.Has(Opt::Version))
             return true;
@@ -126,10 +144,10 @@ private:
     Arguments arguments_;
 };
 
-QString OptionLine(Opt id)
+QString OptionLine(Opt id, const CommandDef* command = nullptr)
 {
     const OptionDef& option = DefinitionOf(id);
-    const QString left = (FromAscii(option.name) + u' ' + FromAscii(option.value)).trimmed();
+    const QString left = (FromAscii(option.name) + u' ' + ValueOf(option, command)).trimmed();
     return u"  "_s + left.leftJustified(26) + u"  "_s + FromAscii(option.help) + u'\n';
 }
 
@@ -190,7 +208,7 @@ QString CommandHelp(const CommandDef& command)
     }
     help += u"\n\n"_s + FromAscii(command.help) + u"\n\n"_s;
     for (const Opt option : command.options)
-        help += OptionLine(option);
+        help += OptionLine(option, &command);
     for (const Opt option : {Opt::Home, Opt::Timing, Opt::Help})
         help += OptionLine(option);
     return help;

@@ -15,6 +15,8 @@ constexpr std::array kImportOptions = {
     Opt::Table,         Opt::Create,    Opt::Columns,       Opt::Header,        Opt::Separator, Opt::Quote,
     Opt::DoubledQuotes, Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator, Opt::Encoding,  Opt::WholeTexts,
 };
+constexpr std::array kEvalOptions = {Opt::Database, Opt::Source, Opt::Record, Opt::All,    Opt::Condition,
+                                     Opt::Control,  Opt::Format, Opt::Tree,   Opt::Explain};
 constexpr std::array kImportNeeds = {Opt::Table};
 
 constexpr std::array kCommands = {
@@ -30,6 +32,7 @@ constexpr std::array kCommands = {
     CommandDef{"tables", "DB", "list the tables", {}, {}, RunTables},
     CommandDef{"fields", "DB TABLE", "list the fields of a table", kFormatOptions, {}, RunFields},
     CommandDef{"import", "DB FILE", "read a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
+    CommandDef{"eval", "EXPRESSION", "the value of an expression", kEvalOptions, {}, RunEval, "text|json"},
     CommandDef{"config get", "SECTION KEY", "print a setting", {}, {}, RunConfigGet},
     CommandDef{"config set", "SECTION KEY VALUE", "change a setting", {}, {}, RunConfigSet},
 };

@@ -21,6 +21,7 @@ struct CommandDef {
     std::span<const Opt> options;
     std::span<const Opt> needed; // of these, the ones that must be given
     ExitStatus (*run)(Run& run);
+    const char* formats = "table|csv|tsv|json|jsonl"; // what --format may name
 };
 
 struct ArgumentCount {

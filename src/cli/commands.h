@@ -18,6 +18,9 @@ ExitStatus RunSql(Run& run);
 // import_command.cpp
 ExitStatus RunImport(Run& run);
 
+// eval_command.cpp
+ExitStatus RunEval(Run& run);
+
 // config_commands.cpp
 ExitStatus RunConfigGet(Run& run);
 ExitStatus RunConfigSet(Run& run);

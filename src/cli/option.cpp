@@ -1,7 +1,5 @@
 #include "cli/option.h"
 
-#include "cli/record_writer.h"
-
 #include <algorithm>
 #include <array>
 
@@ -14,7 +12,7 @@ constexpr std::array kOptions = {
     OptionDef{Opt::Version, "--version", ValueKind::Flag, "", "show the version"},
     OptionDef{Opt::Timing, "--timing", ValueKind::Flag, "", "end with one line of JSON about the time it took"},
     OptionDef{Opt::Yes, "--yes", ValueKind::Flag, "", "do it: nothing is asked"},
-    OptionDef{Opt::Format, "--format", ValueKind::Format, "table|csv|tsv|json|jsonl", "how records are written"},
+    OptionDef{Opt::Format, "--format", ValueKind::Format, "FORMAT", "how it is written"},
     OptionDef{Opt::Offset, "--offset", ValueKind::Count, "N", "leave out the first N records"},
     OptionDef{Opt::Limit, "--limit", ValueKind::Count, "N", "write at most N records"},
     OptionDef{Opt::Table, "--table", ValueKind::Text, "NAME", "the table"},
@@ -39,6 +37,16 @@ constexpr std::array kOptions = {
     OptionDef{Opt::Encoding, "--encoding", ValueKind::Text, "NAME", "how the file writes characters (UTF-8)"},
     OptionDef{Opt::WholeTexts, "--whole-texts", ValueKind::Flag, "",
               "keep texts of more than 8192 characters whole"},
+    OptionDef{Opt::Database, "--db", ValueKind::Text, "DB", "the database of --source"},
+    OptionDef{Opt::Source, "--source", ValueKind::Text, "TABLE|SELECT", "whose records the expression reads"},
+    OptionDef{Opt::Record, "--record", ValueKind::Count, "N", "on record N (1)"},
+    OptionDef{Opt::All, "--all", ValueKind::Flag, "", "on every record, one a line"},
+    OptionDef{Opt::Condition, "--condition", ValueKind::Flag, "", "read it as a condition"},
+    OptionDef{Opt::Control, "--control", ValueKind::Text, "NAME=TEXT",
+              "what the control NAME of a form shows; may be given more than once"},
+    OptionDef{Opt::Tree, "--tree", ValueKind::Flag, "", "print how the expression was read"},
+    OptionDef{Opt::Explain, "--explain", ValueKind::Flag, "",
+              "tell what was left out, what is likely meant otherwise, and why a value is null"},
 };
 
 constexpr bool StandInTheOrderOfTheirIds()
@@ -109,11 +117,10 @@ bool IsValidValue(ValueKind kind, const QString& text)
     switch (kind) {
     case ValueKind::Flag:
     case ValueKind::Text:
+    case ValueKind::Format: // which ones there are depends on the command
         return true;
     case ValueKind::Count:
         return text.toLongLong(&ok) >= 0 && ok;
-    case ValueKind::Format:
-        return FormatOfName(text).has_value();
     case ValueKind::Separator:
     case ValueKind::Quote:
     case ValueKind::Character:

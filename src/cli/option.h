@@ -29,6 +29,14 @@ enum class Opt {
     DoubledQuotes,
     Encoding,
     WholeTexts,
+    Database,
+    Source,
+    Record,
+    All,
+    Condition,
+    Control,
+    Tree,
+    Explain,
 };
 
 // What an option's value has to be; a value that is not is refused before the command runs.

@@ -25,6 +25,11 @@ ExitStatus RunCommand(Run& run)
     return WasInterrupted() && status == ExitStatus::Done ? ExitStatus::Failed : status;
 }
 
+QString FullPath(const QString& file)
+{
+    return QDir::cleanPath(QFileInfo(file).absoluteFilePath());
+}
+
 // A command that wrote into nowhere has failed; where the reader went away there is nobody to be told.
 ExitStatus EndOutput(Output& output, ExitStatus status)
 {
@@ -49,12 +54,12 @@ Run::Run(Arguments arguments, Output& output)
 
 QString Run::PathArgument(int index) const
 {
-    return QDir::cleanPath(QFileInfo(Argument(index)).absoluteFilePath());
+    return FullPath(Argument(index));
 }
 
-bool Run::OpenDatabase()
+bool Run::OpenDatabase(const QString& file)
 {
-    const bool open = session_.Open(PathArgument(0));
+    const bool open = session_.Open(FullPath(file));
     timing_.openMs = sinceStart_.elapsed();
     return open;
 }

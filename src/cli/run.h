@@ -36,8 +36,10 @@ public:
     // A file named on the command line, by its full path.
     QString PathArgument(int index) const;
 
-    // Opens the database that the first argument names, as the window does. On false the reason was told.
-    [[nodiscard]] bool OpenDatabase();
+    // Opens the database that the first argument names, or `file`, as the window does. On false the reason was
+    // told.
+    [[nodiscard]] bool OpenDatabase() { return OpenDatabase(Argument(0)); }
+    [[nodiscard]] bool OpenDatabase(const QString& file);
     DatabaseSession& Session() { return session_; }
     DbConnection& Connection() { return connection_; }
     ConsolePrompt& Prompt() { return prompt_; }

@@ -1,0 +1,80 @@
+#include "forms/record_context.h"
+
+#include "expr/expr_parser.h"
+#include "support/test_database.h"
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+class RecordContextTest : public TestDatabase {
+protected:
+    RecordContextTest()
+    {
+        Run(u"CREATE TABLE [Birds] ([ID] INTEGER, [Bird Name] VARCHAR(40), [Seen] BIT)"_s);
+        Run(u"CREATE TABLE [Places] ([ID] INTEGER, [Bird] INTEGER, [name] VARCHAR(40))"_s);
+        Run(u"INSERT INTO [Birds] ([ID], [Bird Name], [Seen]) VALUES (1, 'Osprey', 1)"_s);
+        Run(u"INSERT INTO [Birds] ([ID], [Bird Name], [Seen]) VALUES (2, 'Gull', 0)"_s);
+        Run(u"INSERT INTO [Places] ([ID], [Bird], [name]) VALUES (7, 1, 'Loch')"_s);
+    }
+
+    QString Shown(QStringView text)
+    {
+        const ExprTree tree = ParseExpression(text, ExprMode::Value);
+        EvaluateExpression(context, *tree);
+        return ShownText(*tree);
+    }
+
+    DbRecordset records{connection_};
+    RecordContext context{records, {u"ja"_s, u"nein"_s}, {}};
+};
+
+TEST_F(RecordContextTest, FindsColumnsByEveryWayToWriteThem)
+{
+    ASSERT_TRUE(Open(records, u"SELECT Birds.ID, Birds.[Bird Name], Places.ID, Places.[name] FROM [Birds] "
+                              "INNER JOIN [Places] ON Birds.ID = Places.Bird"_s));
+    context.ResultChanged();
+    const struct {
+        const char16_t* name;
+        const char16_t* shown;
+    } rows[] = {{u"[Bird Name]", u"Osprey"}, {u"Birds.[Bird Name]", u"Osprey"},
+                {u"BirdName", u"Osprey"},    {u"[birds].[bird name]", u"Osprey"},
+                {u"name", u"Loch"},          {u"[NAME]", u"Loch"},
+                {u"Places.ID", u"7"},        {u"[Places].[ID]", u"7"},
+                {u"Birds.ID", u"1"},         {u"Other.Name", u"Loch"},
+                {u"[Nobody]", u""},          {u"[]", u""}};
+    for (const auto& row : rows)
+        EXPECT_EQ(Shown(row.name), QString::fromUtf16(row.shown)) << QString::fromUtf16(row.name).toStdString();
+}
+
+TEST_F(RecordContextTest, FollowsTheCurrentRecord)
+{
+    ASSERT_TRUE(Open(records, u"SELECT * FROM [Birds]"_s));
+    context.ResultChanged();
+    const ExprTree tree =
+        ParseExpression(u"RECNO()+'/'+RECCOUNT()+' '+[Bird Name]+[Bird Name]+' '+[Seen]", ExprMode::Value);
+    const auto shown = [&] {
+        EvaluateExpression(context, *tree);
+        return ShownText(*tree);
+    };
+    EXPECT_EQ(shown(), u"1/2 OspreyOsprey ja"_s);
+    ASSERT_TRUE(records.MoveNext());
+    EXPECT_EQ(shown(), u"2/2 GullGull nein"_s);
+    ASSERT_TRUE(records.Update(1, Value::Text(u"Tern"_s)));
+    EXPECT_EQ(shown(), u"2/2 TernTern nein"_s);
+    ASSERT_TRUE(records.MoveNext());
+    EXPECT_EQ(shown(), QString()); // behind the last record
+    ASSERT_TRUE(Open(records, u"SELECT [Seen], [Bird Name] FROM [Birds]"_s));
+    context.ResultChanged();
+    EXPECT_EQ(shown(), u"1/2 OspreyOsprey ja"_s);
+}
+
+TEST_F(RecordContextTest, KnowsNoNameWhileClosed)
+{
+    EXPECT_EQ(Shown(u"'<'+[Bird Name]+'>'"), u"<>"_s);
+    EXPECT_EQ(Shown(u"RECCOUNT()"), QString());
+}
+
+} // namespace
+} // namespace mirel
