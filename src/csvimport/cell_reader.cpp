@@ -66,6 +66,8 @@ bool IsIsoDate(std::string_view text)
         return std::ranges::equal(
             part, pattern, [](char byte, char wanted) { return wanted == 'd' ? IsDigit(byte) : byte == wanted; });
     };
+    if (IsStoredDate(text))
+        return true; // most are
     if (!matches(text.substr(0, kDate.size()), kDate))
         return false;
     if (text.size() > kDate.size()) {
@@ -152,8 +154,21 @@ Hr CellReader::ReadDouble(std::string_view text, Cell& cell)
     return Hr::Ok;
 }
 
+// Whether the format reads a text in the stored form as the day that it says. A year below 100 is a short one
+// to the orders 0 to 5.
+bool CellReader::ReadsStoredForm(std::string_view text) const
+{
+    if (dates_.order == DateOrder::Locale)
+        return true;
+    return dates_ == DateFormat{DateOrder::YearMonthDay, u'-', u':'} && !text.starts_with("00");
+}
+
 Hr CellReader::ReadDate(std::string_view text, Cell& cell)
 {
+    if (IsStoredDate(text) && ReadsStoredForm(text)) {
+        cell = Cell::OfText(text);
+        return Hr::Ok;
+    }
     // Every locale takes ISO; most files have it, and the locale's own reader is slow.
     const std::optional<double> date = dates_.order == DateOrder::Locale && IsIsoDate(text)
                                            ? OleDateFromStored(text)

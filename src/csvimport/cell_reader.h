@@ -41,6 +41,7 @@ private:
     Hr ReadInteger(std::string_view text, Cell& cell);
     Hr ReadDouble(std::string_view text, Cell& cell);
     Hr ReadDate(std::string_view text, Cell& cell);
+    bool ReadsStoredForm(std::string_view text) const;
     void CountRest(const char* numberEnd, std::string_view text);
 
     FieldType type_;

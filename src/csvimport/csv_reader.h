@@ -19,8 +19,15 @@ public:
 
     bool IsNone() const { return length_ == 0; }
     size_t Length() const { return length_; }
-    bool Begins(std::string_view text) const { return length_ > 0 && text.starts_with(Text()); }
-    bool Ends(std::string_view text) const { return length_ > 0 && text.ends_with(Text()); }
+    // A single byte, as marks nearly always are, is compared without a call.
+    bool Begins(std::string_view text) const
+    {
+        return length_ == 1 ? text.starts_with(bytes_[0]) : length_ > 0 && text.starts_with(Text());
+    }
+    bool Ends(std::string_view text) const
+    {
+        return length_ == 1 ? text.ends_with(bytes_[0]) : length_ > 0 && text.ends_with(Text());
+    }
     size_t Find(std::string_view text, size_t from) const; // npos: not there
 
 private:

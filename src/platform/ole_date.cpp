@@ -1,7 +1,6 @@
 #include "platform/ole_date.h"
 
 #include <cmath>
-#include <cstdio>
 
 namespace mirel {
 namespace {
@@ -183,18 +182,52 @@ std::optional<StoredDate> StoredDateOf(double oleDays)
     if (!parts)
         return {};
     StoredDate stored;
-    char* out = stored.characters.data();
-    const size_t room = stored.characters.size();
-    stored.length = std::snprintf(out, room, "%04d-%02d-%02d", parts->year, parts->month, parts->day);
+    const auto write = [&stored](int number, int digits) {
+        for (int at = stored.length + digits - 1; at >= stored.length; --at, number /= 10)
+            stored.characters[size_t(at)] = char('0' + number % 10);
+        stored.length += digits;
+    };
+    const auto writeAfter = [&](char sign, int number, int digits) {
+        stored.characters[size_t(stored.length++)] = sign;
+        write(number, digits);
+    };
+    write(parts->year, 4);
+    writeAfter('-', parts->month, 2);
+    writeAfter('-', parts->day, 2);
     if (parts->hour == 0 && parts->minute == 0 && parts->second == 0 && parts->millisecond == 0)
         return stored;
-    stored.length += std::snprintf(out + stored.length, room - size_t(stored.length), " %02d:%02d:%02d",
-                                   parts->hour, parts->minute, parts->second);
-    if (parts->millisecond != 0) {
-        stored.length +=
-            std::snprintf(out + stored.length, room - size_t(stored.length), ".%03d", parts->millisecond);
-    }
+    writeAfter(' ', parts->hour, 2);
+    writeAfter(':', parts->minute, 2);
+    writeAfter(':', parts->second, 2);
+    if (parts->millisecond != 0)
+        writeAfter('.', parts->millisecond, 3);
     return stored;
+}
+
+bool IsStoredDate(std::string_view text)
+{
+    constexpr std::string_view kPattern = "dddd-dd-dd dd:dd:dd.ddd";
+    constexpr size_t kDate = 10;
+    constexpr size_t kSeconds = 19;
+    if (text.size() != kDate && text.size() != kSeconds && text.size() != kPattern.size())
+        return false;
+    for (size_t i = 0; i < text.size(); ++i) {
+        if (kPattern[i] == 'd' ? text[i] < '0' || text[i] > '9' : text[i] != kPattern[i])
+            return false;
+    }
+    const auto number = [text](size_t at, size_t digits) {
+        int value = 0;
+        for (; digits > 0 && at < text.size(); ++at, --digits)
+            value = value * 10 + (text[at] - '0');
+        return value;
+    };
+    const DateParts parts{number(0, 4),  number(5, 2),  number(8, 2), number(11, 2),
+                          number(14, 2), number(17, 2), number(20, 3)};
+    if (!Exists(parts))
+        return false;
+    if (text.size() == kPattern.size())
+        return parts.millisecond != 0;
+    return text.size() == kDate || parts.hour != 0 || parts.minute != 0 || parts.second != 0;
 }
 
 std::optional<double> OleDateFromStored(std::string_view text)

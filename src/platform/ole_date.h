@@ -39,6 +39,8 @@ struct StoredDate {
     std::string_view Text() const { return {characters.data(), size_t(length)}; }
 };
 std::optional<StoredDate> StoredDateOf(double oleDays);
+// Whether a text is that form to the letter, and its day and time exist: bulk work stores it as it stands.
+bool IsStoredDate(std::string_view text);
 
 // Reads the stored form, and what others write for it: a "T" between date and time, a missing second, a
 // fraction of any length; a zone ("Z", "+02:00") moves the value to UTC. Empty when it does not read as such.

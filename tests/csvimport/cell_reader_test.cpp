@@ -93,6 +93,9 @@ TEST(CellReader, ReadsDatesOfTheFormat)
 {
     constexpr auto kDate = FieldType::Date;
     ExpectCells({{kDate, "2001-7-4 9:05:00", "2001-07-04 09:05:00"},
+                 {kDate, "2001-07-04 09:05:00", "2001-07-04 09:05:00"},
+                 {kDate, "2001-07-04 00:00:00", "2001-07-04"},
+                 {kDate, "0045-07-04", "1945-07-04"},
                  {kDate, "45-7-4", "1945-07-04"},
                  {kDate, "2001-13-4", "bad literal"},
                  {kDate, "", "null"}},
@@ -101,6 +104,7 @@ TEST(CellReader, ReadsDatesOfTheFormat)
     ExpectCells({{kDate, "7/4/2001 9:05:00 PM", "2001-07-04 21:05:00"},
                  {kDate, "2001-07-04T09:05:00.25", "2001-07-04 09:05:00.250"},
                  {kDate, "2001-02-30", "bad literal"},
+                 {kDate, "0045-07-04", "0045-07-04"},
                  {kDate, "soon", "bad literal"}});
 }
 

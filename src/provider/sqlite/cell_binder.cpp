@@ -65,6 +65,10 @@ Hr CellBinder::BindText(Statement& statement, int parameter, std::string_view ut
 
 Hr CellBinder::BindDate(Statement& statement, int parameter, std::string_view text)
 {
+    if (IsStoredDate(text)) {
+        statement.BindText(parameter, text);
+        return Hr::Ok;
+    }
     const std::optional<double> days = OleDateFromStored(text);
     const std::optional<StoredDate> date = days ? StoredDateOf(*days) : std::nullopt;
     if (!date)
