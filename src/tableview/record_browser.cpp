@@ -43,10 +43,10 @@ bool RecordBrowser::Open(const QString& statement)
         return false;
     presentation_ = Presentation::List;
     fieldNames_.clear();
-    if (!Execute(statement))
-        return false;
+    conditions_.clear();
+    sort_ = {};
     baseStatement_ = statement;
-    return true;
+    return Execute(statement);
 }
 
 bool RecordBrowser::Rewrite(const QString& statement)
@@ -99,6 +99,7 @@ bool RecordBrowser::Execute(const QString& statement)
     topRow_ = 0;
     selectedRow_ = IsEmpty() ? -1 : 0;
     detailRecord_ = selectedRow_;
+    listState_ = {0, selectedRow_};
     topFieldRow_ = 0;
     const std::vector<int> fields = VisibleFields();
     selectedField_ = fields.empty() ? -1 : fields.front();

@@ -3,6 +3,7 @@
 #include "data/db_recordset.h"
 #include "platform/user_prompt.h"
 #include "tableview/cell_edit.h"
+#include "tableview/filter_condition.h"
 #include "tableview/record_page.h"
 #include "tableview/table_view_settings.h"
 
@@ -16,6 +17,8 @@ namespace mirel {
 
 // The list shows a page of records, a row each; the detail shows one record, a row for each of its fields.
 enum class Presentation { List, Detail };
+
+enum class SortDirection { Ascending, Descending };
 
 // One open result as the user walks through it: the page that the grid shows, the selected cell, the editor of
 // its value, the record counter; all that the table view does, without a window.
@@ -116,6 +119,27 @@ public:
     QString CounterText() const;
     QString CounterTextAt(qint64 position) const;
 
+    // --- filters and sorts: rewrites of the current statement ---------------------------------------------
+
+    // Each does nothing when the result holds no record. False when the provider refused the rewritten
+    // statement: the result before is then shown again.
+    bool FilterByCell(CellFilter filter); // the selected cell
+    bool AddCondition(const QString& condition);
+    bool RemoveFilter(); // back to the base statement, its order included
+    bool IsFiltered() const { return !conditions_.isEmpty(); }
+    const QStringList& Conditions() const { return conditions_; }
+
+    bool SortByColumn(int field, SortDirection direction);
+    bool SortByTerms(const QString& terms);
+    // A tap on a column's header: ascending, and the other way round with the next tap on the same column. Does
+    // nothing where the settings do not ask for it.
+    bool TapHeader(int column);
+    struct ColumnSort {
+        int field = -1; // -1: the order is not that of a column
+        SortDirection direction = SortDirection::Ascending;
+    };
+    ColumnSort CurrentSort() const { return sort_; }
+
     // --- columns ----------------------------------------------------------------------------------------
 
     bool CanHideColumn() const;
@@ -167,6 +191,7 @@ private:
     qint64 Count();
     void Recount();
     void ReportFailure();
+    QString ReferenceOf(int field) const;
 
     // The page.
     void FillPage();
@@ -195,6 +220,8 @@ private:
     TableViewSettings settings_;
     QString baseStatement_;
     QString statement_;
+    QStringList conditions_; // put onto the base statement, in their order
+    ColumnSort sort_;
     std::optional<qint64> count_;
     quint64 generation_ = 0; // of the recordset, when count_ was taken
     QStringList fieldNames_;

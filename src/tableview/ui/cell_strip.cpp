@@ -146,7 +146,7 @@ bool CellStrip::HasEditorFocus() const
 void CellStrip::BeginEdit()
 {
     Editor()->setFocus(Qt::OtherFocusReason);
-    line_->selectAll();
+    line_->end(false);
 }
 
 void CellStrip::BeginTyping(const QString& text)

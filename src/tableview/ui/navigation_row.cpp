@@ -1,12 +1,19 @@
 #include "tableview/ui/navigation_row.h"
 
+#include "resources/string_table.h"
+
 #include <QAction>
 #include <QHBoxLayout>
+#include <QMenu>
 #include <QStyle>
 #include <QToolButton>
 
+#include <algorithm>
+
 namespace mirel {
 namespace {
+
+using namespace Qt::StringLiterals;
 
 constexpr int kTouchPx = 24;
 
@@ -14,26 +21,38 @@ constexpr int kTouchPx = 24;
 
 NavigationRow::NavigationRow(const Actions& actions, QWidget* parent)
     : QWidget(parent)
+    , counter_(new QToolButton(this))
+    , more_(new QToolButton(this))
+    , moreMenu_(new QMenu(this))
 {
     auto* row = new QHBoxLayout(this);
-    const int side = style()->pixelMetric(QStyle::PM_LayoutLeftMargin) / 2;
-    row->setContentsMargins(side, 0, side, side);
+    row->setContentsMargins(0, 0, 0, style()->pixelMetric(QStyle::PM_LayoutBottomMargin) / 2);
     row->setSpacing(0);
-    AddButton(actions.first);
+    row->setSizeConstraint(QLayout::SetNoConstraint); // FitButtons sees to it that they fit
+
+    QToolButton* first = AddButton(actions.first);
     AddButton(actions.previous);
-    counter_ = new QToolButton(this);
     counter_->setAutoRaise(true);
     counter_->setToolTip(actions.goTo->toolTip());
     counter_->setFocusPolicy(Qt::TabFocus);
-    counter_->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Preferred);
+    counter_->setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Preferred);
     connect(counter_, &QToolButton::clicked, actions.goTo, &QAction::trigger);
     row->addWidget(counter_);
     AddButton(actions.next);
-    AddButton(actions.last);
+    QToolButton* last = AddButton(actions.last);
     row->addStretch(1);
-    newRecord_ = AddButton(actions.newRecord);
-    deleteRecord_ = AddButton(actions.deleteRecord);
-    detail_ = AddButton(actions.detail);
+    worded_ = {AddButton(actions.newRecord), AddButton(actions.deleteRecord), AddButton(actions.detail)};
+    yielding_ = {worded_[1], worded_[2], worded_[0], first, last};
+
+    more_->setText(u"…"_s);
+    more_->setToolTip(StringText(Str::ActionMore));
+    more_->setAccessibleName(more_->toolTip());
+    more_->setAutoRaise(true);
+    more_->setFocusPolicy(Qt::TabFocus);
+    more_->setMinimumSize(kTouchPx, kTouchPx);
+    more_->setPopupMode(QToolButton::InstantPopup);
+    more_->setMenu(moreMenu_);
+    row->addWidget(more_);
 }
 
 QToolButton* NavigationRow::AddButton(QAction* action)
@@ -50,17 +69,58 @@ QToolButton* NavigationRow::AddButton(QAction* action)
 
 void NavigationRow::ShowCounter(const QString& text)
 {
+    if (counter_->text() == text)
+        return;
+    const bool sameLength = counter_->text().size() == text.size();
     counter_->setText(text);
-    counter_->setMinimumWidth(counter_->sizeHint().width());
     counter_->setAccessibleName(text);
+    if (!sameLength)
+        FitButtons();
 }
 
-// Words beside the icons where there is room for them.
+QSize NavigationRow::minimumSizeHint() const
+{
+    return {0, QWidget::minimumSizeHint().height()};
+}
+
+int NavigationRow::NeededWidth() const
+{
+    const QMargins margins = layout()->contentsMargins();
+    int width = margins.left() + margins.right();
+    for (int i = 0; i < layout()->count(); ++i) {
+        const QWidget* widget = layout()->itemAt(i)->widget();
+        if (widget && !widget->isHidden())
+            width += std::max(widget->sizeHint().width(), widget->minimumWidth());
+    }
+    return width;
+}
+
+void NavigationRow::FitButtons()
+{
+    const auto setWords = [this](Qt::ToolButtonStyle words) {
+        for (QToolButton* button : worded_)
+            button->setToolButtonStyle(words);
+    };
+    for (QToolButton* button : yielding_)
+        button->show();
+    more_->hide();
+    moreMenu_->clear();
+    setWords(Qt::ToolButtonTextBesideIcon);
+    if (NeededWidth() <= width())
+        return;
+    setWords(Qt::ToolButtonIconOnly);
+    for (QToolButton* button : yielding_) {
+        if (NeededWidth() <= width())
+            return;
+        more_->show();
+        button->hide();
+        moreMenu_->addAction(button->defaultAction());
+    }
+}
+
 void NavigationRow::resizeEvent(QResizeEvent*)
 {
-    const bool roomy = width() > 30 * fontMetrics().height();
-    for (QToolButton* button : {newRecord_, deleteRecord_, detail_})
-        button->setToolButtonStyle(roomy ? Qt::ToolButtonTextBesideIcon : Qt::ToolButtonIconOnly);
+    FitButtons();
 }
 
 } // namespace mirel

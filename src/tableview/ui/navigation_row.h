@@ -1,16 +1,18 @@
 #pragma once
 
-#include "tableview/record_browser.h"
-
 #include <QWidget>
 
+#include <array>
+
 class QAction;
+class QMenu;
 class QToolButton;
 
 namespace mirel {
 
 // The buttons under the grid: first, previous, the counter (which opens Go To Record), next, last, New, Delete,
-// and the change between list and detail. The buttons are those of the actions they are given.
+// and the change between list and detail. The counter is always whole: where the row is too narrow, words give
+// way to icons, and then buttons move into a menu behind "…".
 class NavigationRow : public QWidget {
     Q_OBJECT
 
@@ -30,16 +32,21 @@ public:
 
     void ShowCounter(const QString& text);
 
+    QSize minimumSizeHint() const override;
+
 protected:
     void resizeEvent(QResizeEvent* event) override;
 
 private:
     QToolButton* AddButton(QAction* action);
+    void FitButtons();
+    int NeededWidth() const;
 
     QToolButton* counter_;
-    QToolButton* newRecord_;
-    QToolButton* deleteRecord_;
-    QToolButton* detail_;
+    QToolButton* more_;
+    QMenu* moreMenu_;
+    std::array<QToolButton*, 3> worded_{};   // New, Delete, Detail
+    std::array<QToolButton*, 5> yielding_{}; // in the order in which they give way
 };
 
 } // namespace mirel

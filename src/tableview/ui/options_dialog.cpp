@@ -8,6 +8,8 @@
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QLabel>
+#include <QScreen>
+#include <QScrollArea>
 #include <QSpinBox>
 #include <QVBoxLayout>
 
@@ -53,7 +55,13 @@ COptionsDialog::COptionsDialog(const TableViewSettings& settings, QWidget* paren
 
 void COptionsDialog::LayOut()
 {
-    auto* column = new QVBoxLayout(this);
+    // A small screen scrolls the options and keeps the buttons in sight.
+    auto* scroller = new QScrollArea(this);
+    auto* page = new QWidget(scroller);
+    scroller->setWidget(page);
+    scroller->setWidgetResizable(true);
+    scroller->setFrameShape(QFrame::NoFrame);
+    auto* column = new QVBoxLayout(page);
     column->addWidget(confirmDelete_);
 
     auto* limitBox = new QGroupBox(StringText(Str::OptionColumnGroup), this);
@@ -79,7 +87,10 @@ void COptionsDialog::LayOut()
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     column->addStretch(1);
-    column->addWidget(buttons);
+    auto* whole = new QVBoxLayout(this);
+    whole->addWidget(scroller, 1);
+    whole->addWidget(buttons);
+    resize((scroller->sizeHint() + QSize(2, 3) * fontMetrics().height()).boundedTo(screen()->availableSize()));
     characters_->setAccessibleName(StringText(Str::OptionColumnGroup));
     holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup));
 }

@@ -119,6 +119,9 @@ void RecordGrid::ShowState()
         if (browser_.Settings().autoSizing || otherColumns)
             FitToContent(otherColumns);
     }
+    const RecordBrowser::ColumnSort sort = browser_.CurrentSort();
+    header_->SetArrow(sort.field, sort.direction == SortDirection::Ascending ? GridHeader::Arrow::Ascending
+                                                                             : GridHeader::Arrow::Descending);
     UpdateScrollBars();
     if (shownColumn_ != browser_.SelectedColumn() || layout_.TotalPx() != widthBefore)
         ScrollToSelectedColumn();

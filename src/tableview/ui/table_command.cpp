@@ -54,6 +54,70 @@ constexpr std::array kKeys = {
     KeyRow{Qt::CTRL | Qt::Key_W, InWindow, TableCommand::Close},
 };
 
+constexpr std::array kActions = {
+    ActionRow{TableCommand::First, Str::ActionFirst, Str::ActionFirst, u"go-first"},
+    ActionRow{TableCommand::Previous, Str::ActionPrevious, Str::ActionPrevious, u"go-previous"},
+    ActionRow{TableCommand::Next, Str::ActionNext, Str::ActionNext, u"go-next"},
+    ActionRow{TableCommand::Last, Str::ActionLast, Str::ActionLast, u"go-last"},
+    ActionRow{TableCommand::NewRecord, Str::ActionNewRecord, Str::ActionNewRecordTip, u"list-add"},
+    ActionRow{TableCommand::DeleteRecord, Str::ActionDeleteRecord, Str::ActionDeleteRecordTip, u"list-remove"},
+    ActionRow{TableCommand::ToggleDetail, Str::ActionDetail, Str::ActionDetailTip, u"view-list-details"},
+    ActionRow{TableCommand::GoToRecord, Str::ActionGoToRecord, Str::ActionGoToRecordTip, u"go-jump"},
+    ActionRow{TableCommand::InsertDateTime, Str::ActionInsertDateTime, Str::ActionInsertDateTimeTip, nullptr},
+    ActionRow{TableCommand::RepeatAbove, Str::ActionRepeatAbove, Str::ActionRepeatAboveTip, nullptr},
+    ActionRow{TableCommand::Zoom, Str::ZoomIn, Str::ZoomTip, u"zoom-in"},
+    ActionRow{TableCommand::RunAgain, Str::ActionRunAgain, Str::ActionRunAgainTip, u"view-refresh"},
+    ActionRow{TableCommand::FitAllColumns, Str::ActionFitAll, Str::ActionFitAllTip, nullptr},
+    ActionRow{TableCommand::FitColumn, Str::ActionFitColumn, Str::ActionFitColumnTip, nullptr},
+    ActionRow{TableCommand::HideColumn, Str::ActionHideColumn, Str::ActionHideColumnTip, nullptr},
+    ActionRow{TableCommand::ShowAllColumns, Str::ActionShowAll, Str::ActionShowAllTip, nullptr},
+    ActionRow{TableCommand::FilterBySelection, Str::ActionFilterBy, Str::ActionFilterByTip, u"view-filter"},
+    ActionRow{TableCommand::FilterExcluding, Str::ActionFilterExcluding, Str::ActionFilterExcludingTip, nullptr},
+    ActionRow{TableCommand::RemoveFilter, Str::ActionRemoveFilter, Str::ActionRemoveFilterTip, u"edit-clear"},
+    ActionRow{TableCommand::SortAscending, Str::ActionSortAscending, Str::ActionSortAscendingTip,
+              u"view-sort-ascending"},
+    ActionRow{TableCommand::SortDescending, Str::ActionSortDescending, Str::ActionSortDescendingTip,
+              u"view-sort-descending"},
+    ActionRow{TableCommand::Copy, Str::ActionCopy, Str::ActionCopyTip, u"edit-copy"},
+    ActionRow{TableCommand::Paste, Str::ActionPaste, Str::ActionPasteTip, u"edit-paste"},
+    ActionRow{TableCommand::Options, Str::ActionOptions, Str::ActionOptionsTip, u"configure"},
+    ActionRow{TableCommand::NextPane, Str::ActionNextPane, Str::ActionNextPane, nullptr},
+    ActionRow{TableCommand::Close, Str::ActionClose, Str::ActionCloseTip, nullptr},
+};
+
+constexpr MenuEntry kLine = std::nullopt;
+
+constexpr std::array<MenuEntry, 9> kFileMenu = {
+    TableCommand::InsertDateTime, TableCommand::RepeatAbove,   TableCommand::Zoom,    kLine,
+    TableCommand::RunAgain,       TableCommand::FitAllColumns, TableCommand::Options, kLine,
+    TableCommand::Close};
+constexpr std::array<MenuEntry, 12> kToolsMenu = {TableCommand::NewRecord,
+                                                  TableCommand::DeleteRecord,
+                                                  TableCommand::ToggleDetail,
+                                                  kLine,
+                                                  TableCommand::FilterBySelection,
+                                                  TableCommand::FilterExcluding,
+                                                  TableCommand::RemoveFilter,
+                                                  kLine,
+                                                  TableCommand::SortAscending,
+                                                  TableCommand::SortDescending,
+                                                  kLine,
+                                                  TableCommand::GoToRecord};
+constexpr std::array<MenuEntry, 14> kPopupMenu = {TableCommand::FilterBySelection,
+                                                  TableCommand::FilterExcluding,
+                                                  TableCommand::RemoveFilter,
+                                                  kLine,
+                                                  TableCommand::SortAscending,
+                                                  TableCommand::SortDescending,
+                                                  kLine,
+                                                  TableCommand::HideColumn,
+                                                  TableCommand::ShowAllColumns,
+                                                  TableCommand::FitColumn,
+                                                  TableCommand::FitAllColumns,
+                                                  kLine,
+                                                  TableCommand::Copy,
+                                                  TableCommand::Paste};
+
 } // namespace
 
 std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys)
@@ -71,6 +135,26 @@ QKeyCombination ShortcutOf(TableCommand command)
         return candidate.command == command && (candidate.places & InWindow) != 0;
     });
     return row == kKeys.end() ? QKeyCombination::fromCombined(0) : row->keys;
+}
+
+std::span<const ActionRow> ActionRows()
+{
+    return kActions;
+}
+
+std::span<const MenuEntry> FileMenu()
+{
+    return kFileMenu;
+}
+
+std::span<const MenuEntry> ToolsMenu()
+{
+    return kToolsMenu;
+}
+
+std::span<const MenuEntry> PopupMenu()
+{
+    return kPopupMenu;
 }
 
 } // namespace mirel

@@ -1,8 +1,11 @@
 #pragma once
 
+#include "resources/string_table.h"
+
 #include <QKeyCombination>
 
 #include <optional>
+#include <span>
 
 namespace mirel {
 
@@ -35,6 +38,11 @@ enum class TableCommand {
     RunAgain,
     Copy,
     Paste,
+    FilterBySelection,
+    FilterExcluding,
+    RemoveFilter,
+    SortAscending,
+    SortDescending,
     FitColumn,
     FitAllColumns,
     HideColumn,
@@ -51,5 +59,20 @@ std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys);
 
 // The key that stands beside the command's menu entry; a key of 0: it has none.
 QKeyCombination ShortcutOf(TableCommand command);
+
+// Each command that has a menu entry or a button: its words, and its icon where it has one.
+struct ActionRow {
+    TableCommand command;
+    Str text;
+    Str tip;
+    const char16_t* icon;
+};
+std::span<const ActionRow> ActionRows();
+
+// The menus, in groups: an empty entry is a line between two.
+using MenuEntry = std::optional<TableCommand>;
+std::span<const MenuEntry> FileMenu();
+std::span<const MenuEntry> ToolsMenu();
+std::span<const MenuEntry> PopupMenu(); // on the grid
 
 } // namespace mirel

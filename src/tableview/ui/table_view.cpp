@@ -2,6 +2,7 @@
 
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
+#include "tableview/ui/filter_chip.h"
 #include "tableview/ui/go_to_dialog.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/options_dialog.h"
@@ -56,47 +57,18 @@ constexpr std::array kBrowserCalls = {
     BrowserCall{Command::DeleteRecord, [](RecordBrowser& b) { return b.DeleteRecord(); }},
     BrowserCall{Command::ToggleDetail, [](RecordBrowser& b) { return b.TogglePresentation(); }},
     BrowserCall{Command::RunAgain, [](RecordBrowser& b) { return b.RunAgain(); }},
+    BrowserCall{Command::FilterBySelection,
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::BySelection); }},
+    BrowserCall{Command::FilterExcluding,
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::ExcludingSelection); }},
+    BrowserCall{Command::RemoveFilter, [](RecordBrowser& b) { return b.RemoveFilter(); }},
+    BrowserCall{Command::SortAscending,
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Ascending); }},
+    BrowserCall{Command::SortDescending,
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Descending); }},
     BrowserCall{Command::HideColumn, [](RecordBrowser& b) { return b.HideColumn(); }},
     BrowserCall{Command::ShowAllColumns, [](RecordBrowser& b) { return b.ShowAllColumns(); }},
 };
-
-// Each command that has a menu entry or a button: its words, and its icon where it has one.
-struct ActionRow {
-    Command command;
-    Str text;
-    Str tip;
-    const char16_t* icon;
-};
-constexpr std::array kActions = {
-    ActionRow{Command::First, Str::ActionFirst, Str::ActionFirst, u"go-first"},
-    ActionRow{Command::Previous, Str::ActionPrevious, Str::ActionPrevious, u"go-previous"},
-    ActionRow{Command::Next, Str::ActionNext, Str::ActionNext, u"go-next"},
-    ActionRow{Command::Last, Str::ActionLast, Str::ActionLast, u"go-last"},
-    ActionRow{Command::NewRecord, Str::ActionNewRecord, Str::ActionNewRecordTip, u"list-add"},
-    ActionRow{Command::DeleteRecord, Str::ActionDeleteRecord, Str::ActionDeleteRecordTip, u"list-remove"},
-    ActionRow{Command::ToggleDetail, Str::ActionDetail, Str::ActionDetailTip, u"view-list-details"},
-    ActionRow{Command::GoToRecord, Str::ActionGoToRecord, Str::ActionGoToRecordTip, u"go-jump"},
-    ActionRow{Command::InsertDateTime, Str::ActionInsertDateTime, Str::ActionInsertDateTimeTip, nullptr},
-    ActionRow{Command::RepeatAbove, Str::ActionRepeatAbove, Str::ActionRepeatAboveTip, nullptr},
-    ActionRow{Command::Zoom, Str::ZoomIn, Str::ZoomTip, u"zoom-in"},
-    ActionRow{Command::RunAgain, Str::ActionRunAgain, Str::ActionRunAgainTip, u"view-refresh"},
-    ActionRow{Command::FitAllColumns, Str::ActionFitAll, Str::ActionFitAllTip, nullptr},
-    ActionRow{Command::FitColumn, Str::ActionFitColumn, Str::ActionFitColumnTip, nullptr},
-    ActionRow{Command::HideColumn, Str::ActionHideColumn, Str::ActionHideColumnTip, nullptr},
-    ActionRow{Command::ShowAllColumns, Str::ActionShowAll, Str::ActionShowAllTip, nullptr},
-    ActionRow{Command::Copy, Str::ActionCopy, Str::ActionCopyTip, u"edit-copy"},
-    ActionRow{Command::Paste, Str::ActionPaste, Str::ActionPasteTip, u"edit-paste"},
-    ActionRow{Command::Options, Str::ActionOptions, Str::ActionOptionsTip, u"configure"},
-    ActionRow{Command::NextPane, Str::ActionNextPane, Str::ActionNextPane, nullptr},
-    ActionRow{Command::Close, Str::ActionClose, Str::ActionCloseTip, nullptr},
-};
-
-constexpr std::array kFileMenu = {Command::InsertDateTime, Command::RepeatAbove, Command::RunAgain,
-                                  Command::FitAllColumns,  Command::Options,     Command::Close};
-constexpr std::array kToolsMenu = {Command::NewRecord, Command::DeleteRecord, Command::ToggleDetail, Command::Zoom,
-                                   Command::GoToRecord};
-constexpr std::array kPopupMenu = {Command::HideColumn,    Command::ShowAllColumns, Command::FitColumn,
-                                   Command::FitAllColumns, Command::Copy,           Command::Paste};
 
 } // namespace
 
@@ -111,6 +83,7 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
     , strip_(new CellStrip(browser_, this))
 {
     CreateActions();
+    chip_ = new FilterChip(ActionOf(Command::RemoveFilter), this);
     navigation_ = new NavigationRow({.first = ActionOf(Command::First),
                                      .previous = ActionOf(Command::Previous),
                                      .goTo = ActionOf(Command::GoToRecord),
@@ -131,7 +104,7 @@ CTableView::~CTableView() = default;
 
 void CTableView::CreateActions()
 {
-    for (const ActionRow& row : kActions) {
+    for (const ActionRow& row : ActionRows()) {
         auto* action = new QAction(StringText(row.text), this);
         action->setToolTip(StringText(row.tip));
         if (row.icon)
@@ -149,15 +122,19 @@ void CTableView::CreateActions()
 
 void CTableView::CreateMenus()
 {
-    FillMenu(menuBar()->addMenu(StringText(Str::MenuFile)), kFileMenu);
-    FillMenu(menuBar()->addMenu(StringText(Str::MenuTools)), kToolsMenu);
+    FillMenu(menuBar()->addMenu(StringText(Str::MenuFile)), FileMenu());
+    FillMenu(menuBar()->addMenu(StringText(Str::MenuTools)), ToolsMenu());
 }
 
-void CTableView::FillMenu(QMenu* menu, std::span<const TableCommand> commands)
+void CTableView::FillMenu(QMenu* menu, std::span<const MenuEntry> entries)
 {
     menu->setToolTipsVisible(true);
-    for (const TableCommand command : commands)
-        menu->addAction(ActionOf(command));
+    for (const MenuEntry entry : entries) {
+        if (entry)
+            menu->addAction(ActionOf(*entry));
+        else
+            menu->addSeparator();
+    }
 }
 
 void CTableView::LayOut()
@@ -166,6 +143,7 @@ void CTableView::LayOut()
     auto* column = new QVBoxLayout(center);
     column->setContentsMargins(0, 0, 0, 0);
     column->addWidget(stack_, 1);
+    column->addWidget(chip_);
     column->addWidget(strip_);
     column->addWidget(navigation_);
     stack_->addWidget(grid_);
@@ -186,6 +164,7 @@ void CTableView::ConnectParts()
             [this](int row, int cell) { Settle(browser_.SelectCell(row, cell)); });
     connect(grid_, &RecordGrid::cellDoubleTapped, this, [this] { Edit(nullptr); });
     connect(grid_, &RecordGrid::popupRequested, this, &CTableView::ShowPopup);
+    connect(grid_, &RecordGrid::headerTapped, this, [this](int column) { Settle(browser_.TapHeader(column)); });
     connect(grid_, &RecordGrid::scrollRequested, this,
             [this](qint64 position) { Settle(browser_.ScrollTo(position)); });
     connect(grid_, &RecordGrid::thumbDragged, this,
@@ -255,6 +234,7 @@ void CTableView::ShowState()
     showing_ = true;
     grid_->ShowState();
     strip_->ShowState(zoomed_);
+    chip_->ShowConditions(browser_.Conditions());
     ShowZoom();
     ShowActions();
     navigation_->ShowCounter(browser_.CounterText());
@@ -293,8 +273,10 @@ void CTableView::ShowActions()
     const bool hasRecord = browser_.SelectedRecord() >= 0;
     for (const TableCommand command :
          {Command::First, Command::Previous, Command::Next, Command::Last, Command::GoToRecord, Command::Copy,
-          Command::FitColumn, Command::FitAllColumns})
+          Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection, Command::FilterExcluding,
+          Command::SortAscending, Command::SortDescending})
         ActionOf(command)->setEnabled(hasRecord);
+    ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
     for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove, Command::Paste})
         ActionOf(command)->setEnabled(browser_.CanEdit());
     ActionOf(Command::NewRecord)->setEnabled(browser_.CanUpdate());
@@ -448,7 +430,7 @@ void CTableView::ShowPopup(const QPoint& globalPosition)
     if (!Settle(browser_.WriteEdit()))
         return;
     QMenu popup(this);
-    FillMenu(&popup, kPopupMenu);
+    FillMenu(&popup, PopupMenu());
     popup.exec(globalPosition);
 }
 

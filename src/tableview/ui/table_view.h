@@ -15,6 +15,7 @@ class QStackedWidget;
 namespace mirel {
 
 class CellStrip;
+class FilterChip;
 class NavigationRow;
 class RecordGrid;
 
@@ -49,7 +50,7 @@ private:
     void LayOut();
     void CreateActions();
     void CreateMenus();
-    void FillMenu(QMenu* menu, std::span<const TableCommand> commands);
+    void FillMenu(QMenu* menu, std::span<const MenuEntry> entries);
     void ConnectParts();
 
     void Do(TableCommand command);
@@ -80,6 +81,7 @@ private:
     RecordGrid* grid_;
     QPlainTextEdit* zoomEdit_;
     CellStrip* strip_;
+    FilterChip* chip_ = nullptr;
     NavigationRow* navigation_ = nullptr;
     QTimer countTimer_;
     bool zoomed_ = false;

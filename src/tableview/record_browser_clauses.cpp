@@ -1,0 +1,93 @@
+#include "data/catalog.h"
+#include "data/statement_text.h"
+#include "tableview/cell_text.h"
+#include "tableview/record_browser.h"
+
+#include <algorithm>
+
+// The filters and sorts of the record browser.
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+} // namespace
+
+// With its table where the result draws on more than one.
+QString RecordBrowser::ReferenceOf(int field) const
+{
+    const ResultField& shown = recordset_.Fields()[size_t(field)];
+    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
+    const bool isJoin = KeywordPosition(statement_, u"JOIN") >= 0 ||
+                        std::ranges::any_of(recordset_.Fields(), [&](const ResultField& other) {
+                            return !other.table.isEmpty() && other.table != shown.table;
+                        });
+    return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+}
+
+bool RecordBrowser::FilterByCell(CellFilter filter)
+{
+    if (SelectedRecord() < 0 || selectedField_ < 0)
+        return true;
+    if (!WriteEdit())
+        return false;
+    const FieldType type = TypeOfField(selectedField_);
+    const Value value = recordset_.FieldValue(selectedField_);
+    return AddCondition(ConditionFromCell(filter, ReferenceOf(selectedField_), type, value,
+                                          DisplayText(value, type, settings_.words), settings_.words));
+}
+
+bool RecordBrowser::AddCondition(const QString& condition)
+{
+    if (!IsOpen() || IsEmpty() || condition.isEmpty())
+        return true;
+    if (!Rewrite(WithCondition(statement_, condition)))
+        return false;
+    conditions_ += condition;
+    return true;
+}
+
+bool RecordBrowser::RemoveFilter()
+{
+    if (!IsOpen())
+        return true;
+    if (!Rewrite(baseStatement_))
+        return false;
+    conditions_.clear();
+    sort_ = {};
+    return true;
+}
+
+bool RecordBrowser::SortByTerms(const QString& terms)
+{
+    if (!IsOpen() || IsEmpty() || terms.isEmpty())
+        return true;
+    if (!Rewrite(WithOrder(statement_, terms)))
+        return false;
+    sort_ = {};
+    return true;
+}
+
+bool RecordBrowser::SortByColumn(int field, SortDirection direction)
+{
+    if (!IsOpen() || IsEmpty() || field < 0 || field >= FieldCount())
+        return true;
+    const QString word = direction == SortDirection::Ascending ? u"ASC"_s : u"DESC"_s;
+    if (!SortByTerms(u"%1 %2"_s.arg(ReferenceOf(field), word)))
+        return false;
+    sort_ = {field, direction};
+    return true;
+}
+
+bool RecordBrowser::TapHeader(int column)
+{
+    if (!settings_.sortByHeader || presentation_ != Presentation::List || column < 0 ||
+        column >= page_.ColumnCount())
+        return true;
+    const int field = page_.columns[size_t(column)].field;
+    const bool again = sort_.field == field && sort_.direction == SortDirection::Ascending;
+    return SortByColumn(field, again ? SortDirection::Descending : SortDirection::Ascending);
+}
+
+} // namespace mirel
