@@ -9,7 +9,6 @@
 #include <QDateTime>
 
 #include <algorithm>
-#include <numeric>
 
 // The result, its edits and its records; the page and the selection are in record_browser_page.cpp.
 
@@ -70,8 +69,9 @@ bool RecordBrowser::RunAgain()
     if (!Execute(statement_))
         return false;
     if (top > 0 || record > 0) {
+        const qint64 last = Count() - 1;
         topRow_ = std::min(top, HighestTopRow());
-        ShowRecord(std::min(record, Count() - 1));
+        ShowRecord(std::min(record, last));
     }
     selectedField_ = field < FieldCount() ? field : selectedField_;
     FillPage();

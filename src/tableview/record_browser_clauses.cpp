@@ -8,11 +8,8 @@
 // The filters and sorts of the record browser.
 
 namespace mirel {
-namespace {
 
 using namespace Qt::StringLiterals;
-
-} // namespace
 
 // With its table where the result draws on more than one.
 QString RecordBrowser::ReferenceOf(int field) const

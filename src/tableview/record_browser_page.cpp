@@ -6,11 +6,8 @@
 // The page and the selection of the record browser.
 
 namespace mirel {
-namespace {
 
 using namespace Qt::StringLiterals;
-
-} // namespace
 
 // --- the page -----------------------------------------------------------------------------------------------
 
@@ -91,15 +88,14 @@ void RecordBrowser::TakeUpChanges()
 {
     if (!IsOpen() || edit_.IsPending())
         return;
+    const quint64 before = generation_;
     FillPage();
-    if (recordset_.Generation() == generation_)
+    if (generation_ == before)
         return;
-    Recount();
     // The recordset has found its record again, wherever it stands now.
     const qint64 record = recordset_.Position();
     if (record >= 0 && presentation_ == Presentation::List)
-        topRow_ = std::max<qint64>(record - std::max(selectedRow_, 0), 0);
-    topRow_ = std::min(topRow_, HighestTopRow());
+        topRow_ = std::clamp<qint64>(record - std::max(selectedRow_, 0), 0, HighestTopRow());
     ShowRecord(record >= 0 ? record : std::min(SelectedRecord(), Count() - 1));
     FillPage();
     LoadEditor();
@@ -107,10 +103,13 @@ void RecordBrowser::TakeUpChanges()
 
 void RecordBrowser::FillPage()
 {
-    if (presentation_ == Presentation::List)
-        FillList();
-    else
-        FillDetail();
+    const auto fill = [this] { presentation_ == Presentation::List ? FillList() : FillDetail(); };
+    fill();
+    if (IsOpen() && recordset_.Generation() != generation_) { // another program was here
+        Recount();
+        topRow_ = std::min(topRow_, HighestTopRow());
+        fill();
+    }
     ++pageRevision_;
 }
 
@@ -165,6 +164,8 @@ void RecordBrowser::FillDetail()
     });
     if (!read)
         ReportFailure();
+    if (page_.rows.empty())
+        detailRecord_ = -1;
 }
 
 // The selected cell as the store has it now.
@@ -219,7 +220,9 @@ void RecordBrowser::LoadEditor()
     const qint64 record = SelectedRecord();
     writeFailed_ = false;
     shownLabel_.clear();
-    if (!IsOpen() || record < 0 || selectedField_ < 0 || !recordset_.MoveTo(record)) {
+    const bool stands = IsOpen() && record >= 0 && selectedField_ >= 0 && recordset_.MoveTo(record) &&
+                        recordset_.Position() == record;
+    if (!stands) {
         edit_.Unload();
         return;
     }

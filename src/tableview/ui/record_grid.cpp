@@ -52,6 +52,7 @@ RecordGrid::RecordGrid(const RecordBrowser& browser, QWidget* parent)
     , browser_(browser)
     , header_(new GridHeader(layout_, browser.Page(), this))
 {
+    header_->setObjectName(QStringLiteral("header"));
     setFocusPolicy(Qt::StrongFocus);
     viewport()->setBackgroundRole(QPalette::Base);
     verticalScrollBar()->setTracking(false); // a drag shows where it is; only its end reads the page

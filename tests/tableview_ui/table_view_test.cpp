@@ -1,0 +1,266 @@
+#include "tableview/ui/table_view.h"
+
+#include "tableview/people_fixture.h"
+#include "tableview/ui/cell_strip.h"
+#include "tableview/ui/filter_chip.h"
+#include "tableview/ui/navigation_row.h"
+#include "tableview/ui/record_grid.h"
+
+#include <QAction>
+#include <QApplication>
+#include <QCheckBox>
+#include <QClipboard>
+#include <QLineEdit>
+#include <QPlainTextEdit>
+#include <QScrollBar>
+#include <QTest>
+#include <QToolButton>
+
+#include <algorithm>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+class TableView : public PeopleFixture {
+protected:
+    TableView()
+    {
+        view.resize(700, 400);
+        EXPECT_TRUE(view.OpenTable(u"People"_s));
+        view.show();
+        EXPECT_TRUE(QTest::qWaitForWindowActive(&view));
+    }
+
+    // Keys go where the focus is, as they do for the user.
+    void Press(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier)
+    {
+        QTest::keyClick(QApplication::focusWidget(), key, modifiers);
+    }
+    void Type(const QString& text) { QTest::keyClicks(QApplication::focusWidget(), text); }
+    bool GridHasFocus() const { return QApplication::focusWidget() == grid; }
+    QString Selected() const
+    {
+        return u"%1/%2"_s.arg(browser.FieldName(browser.SelectedField()), browser.CounterText());
+    }
+    QAction* ActionOf(Str text) const
+    {
+        const QList<QAction*> actions = view.actions();
+        return *std::ranges::find(actions, StringText(text), &QAction::text);
+    }
+    QLineEdit* Line() const { return view.findChild<CellStrip*>()->findChild<QLineEdit*>(); }
+
+    CTableView view{connection, path, prompt, {}};
+    const RecordBrowser& browser = view.Browser();
+    RecordGrid* grid = view.findChild<RecordGrid*>();
+};
+
+TEST_F(TableView, ReplacesACellByTypingAndGoesDownWithEnter)
+{
+    Type(u"A"_s);
+    EXPECT_EQ(QApplication::focusWidget(), Line());
+    Type(u"nn"_s);
+    EXPECT_EQ(Line()->text(), u"Ann"_s);
+    EXPECT_TRUE(view.isWindowModified());
+    Press(Qt::Key_Return);
+    EXPECT_EQ(Selected(), u"Name/2/25"_s);
+    EXPECT_TRUE(GridHasFocus());
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=21"_s), u"Ann"_s);
+}
+
+TEST_F(TableView, EditsWithF2AndGivesTheOldValueBackOnEscape)
+{
+    Press(Qt::Key_F2);
+    Type(u"x"_s);
+    EXPECT_EQ(browser.Edit().Text(), u"P1x"_s);
+    Press(Qt::Key_Escape);
+    EXPECT_EQ(Line()->text(), u"P1"_s);
+    EXPECT_TRUE(GridHasFocus());
+    EXPECT_FALSE(browser.HasPendingEdit());
+}
+
+TEST_F(TableView, WalksThroughTheCellsWithItsKeys)
+{
+    const struct {
+        Qt::Key key;
+        Qt::KeyboardModifiers modifiers;
+        QString selected;
+    } steps[] = {
+        {Qt::Key_Down, Qt::NoModifier, u"Name/2/25"_s},
+        {Qt::Key_Right, Qt::NoModifier, u"Age/2/25"_s},
+        {Qt::Key_Tab, Qt::NoModifier, u"Born/2/25"_s},
+        {Qt::Key_Backtab, Qt::ShiftModifier, u"Age/2/25"_s},
+        {Qt::Key_End, Qt::NoModifier, u"Note/2/25"_s},
+        {Qt::Key_Tab, Qt::NoModifier, u"Name/3/25"_s},
+        {Qt::Key_End, Qt::ControlModifier, u"Name/25/25"_s},
+        {Qt::Key_Home, Qt::ControlModifier, u"Name/1/25"_s},
+        {Qt::Key_PageDown, Qt::ControlModifier, u"Name/2/25"_s},
+    };
+    for (const auto& step : steps) {
+        Press(step.key, step.modifiers);
+        EXPECT_EQ(Selected(), step.selected) << QKeySequence(step.key | step.modifiers).toString();
+    }
+}
+
+TEST_F(TableView, SavesWithTabAndGoesOnToTheNextCell)
+{
+    Type(u"Bo"_s);
+    Press(Qt::Key_Tab);
+    EXPECT_EQ(Selected(), u"Age/1/25"_s);
+    Type(u"7"_s);
+    Press(Qt::Key_Tab, Qt::ShiftModifier);
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=7"_s), u"Bo"_s);
+}
+
+TEST_F(TableView, StaysInTheEditorAndSaysWhyWhenAWriteIsRefused)
+{
+    Type(u"longer than ten"_s);
+    Press(Qt::Key_Return);
+    EXPECT_TRUE(prompt.shown.isEmpty()) << "only once the key is over";
+    EXPECT_TRUE(QTest::qWaitFor([this] { return !prompt.shown.isEmpty(); }));
+    EXPECT_EQ(Selected(), u"Name/1/25"_s);
+    EXPECT_EQ(QApplication::focusWidget(), Line());
+    EXPECT_EQ(Line()->text(), u"longer than ten"_s);
+    EXPECT_FALSE(view.close()) << "nothing typed is lost without a word";
+    Press(Qt::Key_Escape);
+    EXPECT_TRUE(view.close());
+}
+
+TEST_F(TableView, TicksWithSpaceAndClearsWithDel)
+{
+    for (int i = 0; i < 3; ++i)
+        Press(Qt::Key_Right);
+    Press(Qt::Key_Space);
+    auto* box = view.findChild<QCheckBox*>();
+    EXPECT_TRUE(box->isVisible());
+    EXPECT_TRUE(box->isChecked());
+    Press(Qt::Key_Left);
+    Press(Qt::Key_Delete);
+    Press(Qt::Key_Left);
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Member=TRUE AND Born IS NULL"_s), u"P1"_s);
+}
+
+TEST_F(TableView, AddsDeletesRepeatsAndCopiesByKey)
+{
+    Press(Qt::Key_Insert);
+    EXPECT_EQ(Selected(), u"Name/26/26"_s);
+    QTest::keyClick(&view, Qt::Key_Apostrophe, Qt::ControlModifier);
+    EXPECT_EQ(Line()->text(), u"P25"_s);
+    QTest::keyClick(&view, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(QApplication::clipboard()->text(), u"P25"_s);
+    prompt.answers = {true};
+    QTest::keyClick(&view, Qt::Key_Delete, Qt::ControlModifier);
+    EXPECT_EQ(browser.CounterText(), u"25/25"_s);
+}
+
+TEST_F(TableView, ScrollsTheWholeResultWithItsBar)
+{
+    QScrollBar* bar = grid->verticalScrollBar();
+    EXPECT_EQ(bar->maximum(), kPeople - browser.RowsPerPage());
+    bar->setSliderDown(true);
+    bar->setSliderPosition(5);
+    EXPECT_EQ(browser.ScrollPosition(), 0) << "a drag only counts";
+    EXPECT_EQ(view.findChild<NavigationRow*>()->findChildren<QToolButton*>()[0]->text(), u"6/25"_s);
+    bar->setSliderDown(false);
+    EXPECT_EQ(browser.ScrollPosition(), 5);
+    bar->triggerAction(QAbstractSlider::SliderSingleStepAdd);
+    EXPECT_EQ(browser.ScrollPosition(), 6);
+    QTest::keyClick(grid, Qt::Key_End, Qt::ControlModifier);
+    EXPECT_EQ(bar->value(), bar->maximum());
+}
+
+TEST_F(TableView, GivesTheBarBackWhenAPendingEditIsRefused)
+{
+    Type(u"longer than ten"_s);
+    grid->verticalScrollBar()->setValue(4);
+    EXPECT_EQ(browser.ScrollPosition(), 0);
+    EXPECT_EQ(grid->verticalScrollBar()->value(), 0);
+}
+
+TEST_F(TableView, SelectsTheTappedCellAndEditsItOnADoubleTap)
+{
+    const QPoint middle = grid->CellRect(2, 1).center();
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, middle);
+    EXPECT_EQ(Selected(), u"Age/3/25"_s);
+    EXPECT_TRUE(GridHasFocus());
+    QTest::mouseDClick(grid->viewport(), Qt::LeftButton, {}, middle);
+    EXPECT_EQ(QApplication::focusWidget(), Line());
+}
+
+TEST_F(TableView, FitsTheColumnsButLeavesAWidthSetByHand)
+{
+    QWidget* header = grid->findChild<QWidget*>(u"header"_s);
+    ASSERT_TRUE(header);
+    const int edge = grid->CellRect(0, 0).right() + 1;
+    QTest::mousePress(header, Qt::LeftButton, {}, QPoint(edge, 5));
+    QTest::mouseMove(header, QPoint(edge + 60, 5));
+    QTest::mouseRelease(header, Qt::LeftButton, {}, QPoint(edge + 60, 5));
+    const int wide = grid->CellRect(0, 0).width();
+    EXPECT_NEAR(wide, edge + 60, 2);
+    QTest::keyClick(grid, Qt::Key_PageDown);
+    EXPECT_EQ(grid->CellRect(0, 0).width(), wide);
+    QTest::mouseDClick(header, Qt::LeftButton, {}, QPoint(wide, 5));
+    EXPECT_EQ(grid->CellRect(0, 0).width(), edge);
+}
+
+TEST_F(TableView, ZoomsIntoALongText)
+{
+    Press(Qt::Key_End);
+    QTest::keyClick(&view, Qt::Key_F2, Qt::ShiftModifier);
+    const auto* zoom = view.findChild<QPlainTextEdit*>();
+    ASSERT_TRUE(zoom->isVisible());
+    EXPECT_EQ(zoom->toPlainText(), longNote);
+    Press(Qt::Key_End, Qt::ControlModifier);
+    Type(u"!"_s);
+    Press(Qt::Key_Return);
+    Press(Qt::Key_Backtab, Qt::ShiftModifier);
+    EXPECT_EQ(Selected(), u"Member/1/25"_s);
+    EXPECT_FALSE(zoom->isVisible()) << "a tick keeps its ordinary editor";
+    EXPECT_EQ(Stored(u"SELECT Note FROM People WHERE Name='P1'"_s), longNote + u"!\n"_s);
+    Press(Qt::Key_Tab);
+    EXPECT_TRUE(zoom->isVisible());
+    QTest::keyClick(&view, Qt::Key_F2, Qt::ShiftModifier);
+    EXPECT_TRUE(grid->isVisible());
+}
+
+TEST_F(TableView, KeepsLineEndsThatASingleLineCannotShow)
+{
+    Run(u"UPDATE People SET Note='one\ntwo' WHERE Name='P1'"_s);
+    QTest::keyClick(&view, Qt::Key_F5);
+    Press(Qt::Key_End);
+    Press(Qt::Key_F2);
+    Type(u"!"_s);
+    Press(Qt::Key_Return);
+    EXPECT_EQ(Stored(u"SELECT Note FROM People WHERE Name='P1'"_s), u"one\ntwo!"_s);
+}
+
+TEST_F(TableView, ShowsTheFilterInForceWithItsCross)
+{
+    auto* chip = view.findChild<FilterChip*>();
+    EXPECT_FALSE(chip->isVisible());
+    ActionOf(Str::ActionFilterBy)->trigger();
+    EXPECT_TRUE(chip->isVisible());
+    EXPECT_EQ(browser.CounterText(), u"1/1"_s);
+    chip->findChild<QToolButton*>()->click();
+    EXPECT_FALSE(chip->isVisible());
+    EXPECT_EQ(browser.CounterText(), u"1/25"_s);
+}
+
+TEST_F(TableView, FitsOnAHandheldWithTheCounterWhole)
+{
+    view.resize(240, 320);
+    QCoreApplication::processEvents();
+    EXPECT_EQ(view.size(), QSize(240, 320));
+    for (const QToolButton* button : view.findChild<NavigationRow*>()->findChildren<QToolButton*>()) {
+        if (button->isHidden())
+            continue;
+        EXPECT_GE(button->geometry().left(), 0);
+        EXPECT_LE(button->geometry().right(), 240) << button->text().toStdString();
+        EXPECT_GE(button->width(), button->sizeHint().width()) << button->text().toStdString();
+        EXPECT_GE(button->height(), 24);
+    }
+}
+
+} // namespace
+} // namespace mirel
