@@ -42,6 +42,8 @@ bool RecordBrowser::Open(const QString& statement)
         return false;
     presentation_ = Presentation::List;
     fieldNames_.clear();
+    visible_.clear();
+    selectedField_ = -1;
     conditions_.clear();
     sort_ = {};
     baseStatement_ = statement;
@@ -65,7 +67,6 @@ bool RecordBrowser::RunAgain()
         return false;
     const qint64 record = SelectedRecord();
     const qint64 top = topRow_;
-    const int field = selectedField_;
     if (!Execute(statement_))
         return false;
     if (top > 0 || record > 0) {
@@ -73,7 +74,6 @@ bool RecordBrowser::RunAgain()
         topRow_ = std::min(top, HighestTopRow());
         ShowRecord(std::min(record, last));
     }
-    selectedField_ = field < FieldCount() ? field : selectedField_;
     FillPage();
     LoadEditor();
     return true;
@@ -101,8 +101,7 @@ bool RecordBrowser::Execute(const QString& statement)
     detailRecord_ = selectedRow_;
     listState_ = {0, selectedRow_};
     topFieldRow_ = 0;
-    const std::vector<int> fields = VisibleFields();
-    selectedField_ = fields.empty() ? -1 : fields.front();
+    selectedField_ = SelectedFieldOrFirstVisible();
     RebuildColumns();
     FillPage();
     LoadEditor();
@@ -125,7 +124,8 @@ void RecordBrowser::Clear()
     edit_.Unload();
 }
 
-// Hidden columns stay hidden as long as the result has the same fields.
+// Hidden columns stay hidden, and the selected one selected, as long as the result has the same fields: who
+// sorts by a column far to the right wants to go on looking at it.
 void RecordBrowser::TakeUpFields()
 {
     QStringList names;
@@ -134,6 +134,7 @@ void RecordBrowser::TakeUpFields()
     if (names == fieldNames_)
         return;
     fieldNames_ = names;
+    selectedField_ = -1;
     visible_.assign(size_t(names.size()), true);
 }
 

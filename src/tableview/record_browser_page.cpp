@@ -406,7 +406,10 @@ bool RecordBrowser::TogglePresentation()
 
 int RecordBrowser::SelectedFieldOrFirstVisible() const
 {
-    return selectedField_ >= 0 && visible_[size_t(selectedField_)] ? selectedField_ : VisibleFields().front();
+    if (selectedField_ >= 0 && visible_[size_t(selectedField_)])
+        return selectedField_;
+    const std::vector<int> fields = VisibleFields();
+    return fields.empty() ? -1 : fields.front();
 }
 
 // --- counter and columns ------------------------------------------------------------------------------------
