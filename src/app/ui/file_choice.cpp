@@ -141,9 +141,9 @@ private:
     QPushButton* accept_;
 };
 
-QString ChooseOnSmallScreen(QWidget& parent, const QString& caption, FileUse use, const QString& folder)
+QString ChooseOnSmallScreen(QWidget& parent, const QString& caption, FileUse use, const FolderChoice& choice)
 {
-    CFileDialog dialog(FolderChoice(folder, u".cdb"_s), use, &parent);
+    CFileDialog dialog(choice, use, &parent);
     dialog.setWindowTitle(caption);
     dialog.resize(parent.size());
     return dialog.exec() == QDialog::Accepted ? dialog.Path() : QString();
@@ -155,10 +155,11 @@ QString ChooseDatabase(QWidget& parent, Str title, FileUse use, const QString& n
 {
     const QString folder = near.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
                                           : QFileInfo(near).path();
+    const FolderChoice choice(folder, u".cdb"_s);
     const QString caption = StringText(title).remove(u'&');
     if (IsHandheldSize(parent.size()))
-        return ChooseOnSmallScreen(parent, caption, use, folder);
-    QFileDialog dialog(&parent, caption, folder, StringText(Str::DatabaseFilter));
+        return ChooseOnSmallScreen(parent, caption, use, choice);
+    QFileDialog dialog(&parent, caption, choice.Folder(), StringText(Str::DatabaseFilter));
     dialog.setAcceptMode(use == FileUse::Create ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
     dialog.setFileMode(use == FileUse::Create ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite);
