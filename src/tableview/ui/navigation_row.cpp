@@ -74,8 +74,10 @@ void NavigationRow::ShowCounter(const QString& text)
     const bool sameLength = counter_->text().size() == text.size();
     counter_->setText(text);
     counter_->setAccessibleName(text);
-    if (!sameLength)
+    if (!sameLength) {
         FitButtons();
+        layout()->activate(); // the very next picture shows it whole
+    }
 }
 
 QSize NavigationRow::minimumSizeHint() const

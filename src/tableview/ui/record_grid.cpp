@@ -154,7 +154,8 @@ void RecordGrid::FitToContent(bool alsoByHand)
         if (alsoByHand || !layout_.IsByHand(column))
             layout_.Fit(column, ContentWidth(column));
     }
-    StretchLastColumn();
+    if (browser_.CurrentPresentation() == Presentation::Detail && layout_.Count() == 2)
+        FitDetail();
 }
 
 // No wider than the view, so that a whole column can always be seen at once.
@@ -167,12 +168,12 @@ int RecordGrid::ContentWidth(int column) const
     return std::min(width, std::max(viewport()->width(), ColumnLayout::kNarrowestPx));
 }
 
-// The values of a single record take the room that the names leave.
-void RecordGrid::StretchLastColumn()
+// A single record is read from top to bottom, never sideways: its values take the room that the names leave.
+void RecordGrid::FitDetail()
 {
-    const int last = layout_.Count() - 1;
-    if (browser_.CurrentPresentation() == Presentation::Detail && last > 0)
-        layout_.Fit(last, std::max(layout_.WidthPx(last), viewport()->width() - layout_.LeftPx(last)));
+    const int room = viewport()->width();
+    layout_.Fit(0, std::min(layout_.WidthPx(0), room * 2 / 5));
+    layout_.Fit(1, room - layout_.WidthPx(0));
 }
 
 void RecordGrid::UpdateScrollBars()

@@ -65,7 +65,7 @@ private:
     void PlaceHeader();
     void FitToContent(bool alsoByHand);
     int ContentWidth(int column) const;
-    void StretchLastColumn();
+    void FitDetail();
     void UpdateScrollBars();
     void ScrollToSelectedColumn();
     int RowAt(int y) const { return rowHeightPx_ > 0 ? y / rowHeightPx_ : -1; }
