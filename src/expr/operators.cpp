@@ -292,14 +292,23 @@ constexpr std::array kConditionWords = {
     OperatorDef{u"NULL", NodeKind::Operand, OpCode::Null, nullptr},
 };
 
-template <typename Table>
-const OperatorDef* FindIn(const Table& table, QStringView token)
+const OperatorDef* FindIn(std::span<const OperatorDef> table, QStringView token)
 {
     const auto row = std::ranges::find_if(table, [&](const OperatorDef& def) { return IsWord(token, def.text); });
     return row == table.end() ? nullptr : &*row;
 }
 
 } // namespace
+
+std::span<const OperatorDef> ArithmeticOperators()
+{
+    return kArithmeticOperators;
+}
+
+std::span<const OperatorDef> ConditionWords()
+{
+    return kConditionWords;
+}
 
 const OperatorDef* FindArithmeticOperator(QStringView token)
 {

@@ -14,6 +14,9 @@ struct OperatorDef {
     Evaluator evaluate;
 };
 
+std::span<const OperatorDef> ArithmeticOperators(); // with both parentheses
+std::span<const OperatorDef> ConditionWords();
+
 // By the spelling in any case; null: there is none.
 const OperatorDef* FindArithmeticOperator(QStringView token);
 const OperatorDef* FindConditionWord(QStringView token);

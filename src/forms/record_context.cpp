@@ -106,7 +106,11 @@ qint64 RecordContext::Position()
 
 qint64 RecordContext::RecordCount()
 {
-    return records_.RecordCount();
+    if (countedAt_ != record_) {
+        count_ = records_.RecordCount();
+        countedAt_ = record_;
+    }
+    return count_;
 }
 
 int RecordContext::FindColumn(QStringView name)

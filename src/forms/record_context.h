@@ -43,6 +43,8 @@ private:
     ControlTexts controlTexts_;
     std::vector<FetchedValue> values_;
     quint64 record_ = 0; // another number for each record, and each change of one
+    qint64 count_ = -1;  // asking the recordset makes it look for changes by others: once a record
+    quint64 countedAt_ = 0;
     qint64 position_ = -1;
     quint64 generation_ = 0;
 };
