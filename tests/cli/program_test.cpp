@@ -305,4 +305,42 @@ TEST_F(Program, DropsADatabaseWithItsSideFile)
     EXPECT_EQ(Run({u"tables"_s, u"a.cdb"_s}).status, 1);
 }
 
+TEST_F(Program, EvaluatesExpressions)
+{
+    NewDatabase();
+    Import("Name,Price\nGull,2.5\nTern,\n",
+           {u"--create"_s, u"--columns"_s, u"Name:Text:20,Price:Double"_s, u"--header"_s});
+    const auto eval = [this](const QStringList& words) { return Run(QStringList{u"eval"_s} + words); };
+    const QStringList onTable = {u"--db"_s, u"a.cdb"_s, u"--source"_s, u"T"_s};
+    const QString counter = u"RECNO()+'/'+RECCOUNT()"_s;
+    EXPECT_EQ(eval({u"--"_s, u"-5+3"_s}), (Ended{0, u"-2\n"_s, {}}));
+    EXPECT_EQ(eval({u"&a*2"_s, u"--control"_s, u"a=5"_s}), (Ended{0, u"10\n"_s, {}}));
+    EXPECT_EQ(eval({u"2+3*4"_s, u"--tree"_s}), (Ended{0, u"{ { 2 }+{ { 3 }*{ 4 } } }\n"_s, {}}));
+    EXPECT_EQ(eval(QStringList{counter, u"--record"_s, u"2"_s} + onTable), (Ended{0, u"2/2\n"_s, {}}));
+    EXPECT_EQ(eval(QStringList{u"[Name]+[Price]"_s, u"--all"_s} + onTable), (Ended{0, u"Gull2.5\n\n"_s, {}}));
+    EXPECT_EQ(eval(QStringList{counter, u"--record"_s, u"3"_s} + onTable),
+              (Ended{1, {}, u"There is no record 3.\n"_s}));
+    EXPECT_EQ(eval({u"1"_s, u"--all"_s}).status, 2);
+    EXPECT_EQ(eval({u"1"_s, u"--control"_s, u"a"_s}).status, 2);
+    EXPECT_EQ(eval({u"1"_s, u"--format"_s, u"csv"_s}).status, 2);
+}
+
+TEST_F(Program, TellsOfExpressionsAsJson)
+{
+    const auto object = [this](const QStringList& words) {
+        const Ended ended = Run(QStringList{u"eval"_s, u"--format"_s, u"json"_s} + words);
+        return QJsonDocument::fromJson(ended.out.toUtf8()).object();
+    };
+    EXPECT_EQ(object({u"'a\"'+1"_s}), (QJsonObject{{u"null"_s, false},
+                                                   {u"isText"_s, true},
+                                                   {u"text"_s, u"a\"1"_s},
+                                                   {u"number"_s, 0},
+                                                   {u"fieldType"_s, 0}}));
+    EXPECT_EQ(object({u"1 < 2"_s, u"--condition"_s})[u"holds"_s], QJsonValue(1));
+    EXPECT_EQ(object({u"NULL < 2"_s, u"--condition"_s})[u"holds"_s], QJsonValue(0));
+    const QJsonObject explained = object({u"1/0 2"_s, u"--explain"_s});
+    EXPECT_TRUE(explained[u"null"_s].toBool());
+    EXPECT_EQ(explained[u"explanation"_s].toArray().size(), 2);
+}
+
 } // namespace
