@@ -162,9 +162,15 @@ TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
         Hr::Ok);
     EXPECT_EQ(FieldOf(*checked), Value::Integer(1499));
 
-    EXPECT_EQ(cursor->DeleteAll([](qint64 done) { return done < 1000; }), Hr::Ok);
-    EXPECT_EQ(cursor->RecordCount(), kCount - 1024);
-    EXPECT_EQ(cursor->Position(), 0);
+    const auto filtered = Open(u"SELECT * FROM T WHERE Whole>0"_s);
+    EXPECT_EQ(filtered->DeleteAll([](qint64 done) { return done < 1000; }), Hr::Ok);
+    EXPECT_EQ(filtered->RecordCount(), kCount - 1024);
+    EXPECT_EQ(filtered->Position(), 0);
+    EXPECT_EQ(cursor->DeleteAll([](qint64) { return false; }), Hr::Ok);
+    EXPECT_EQ(cursor->RecordCount(), kCount - 1024) << "a whole table goes at once or not at all";
+    EXPECT_EQ(cursor->DeleteAll({}), Hr::Ok);
+    EXPECT_EQ(cursor->RecordCount(), 0);
+    EXPECT_TRUE(cursor->AtEnd());
 }
 
 TEST_F(BulkWrites, AreOneTransactionBetweenBeginAndEnd)

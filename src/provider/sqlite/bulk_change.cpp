@@ -1,5 +1,6 @@
 #include "provider/sqlite/bulk_change.h"
 
+#include "provider/sqlite/sql_writer.h"
 #include "provider/sqlite/transaction.h"
 
 namespace mirel::sqlite {
@@ -51,7 +52,27 @@ Outcome BulkChange::Update(const BulkRanges& ranges, const FieldChange& change, 
 Outcome BulkChange::Delete(const BulkRanges& ranges, const BulkProgress& progress)
 {
     const FreedPagesStay faster(file_);
+    if (ranges.isWholeTable && !HasTriggers())
+        return DeleteWhole(ranges, progress);
     return Run("DELETE FROM " + Target() + Within(ranges.condition), ranges, progress, nullptr);
+}
+
+bool BulkChange::HasTriggers() const
+{
+    return file_.Number("SELECT count(*) FROM sqlite_schema WHERE type='trigger' AND lower(tbl_name)=lower(" +
+                        QuoteText(writer_.TableName()) + ')') > 0;
+}
+
+// The engine drops all pages of the table at once, in a twentieth of the time that its records would take; there
+// is nothing to be stopped on the way.
+Outcome BulkChange::DeleteWhole(const BulkRanges& ranges, const BulkProgress& progress)
+{
+    if (progress && !progress(0))
+        return {};
+    Outcome outcome = file_.Execute("DELETE FROM " + writer_.Table());
+    if (outcome.Ok() && progress)
+        (void)progress(ranges.count);
+    return outcome;
 }
 
 Outcome BulkChange::Run(const QByteArray& sql, const BulkRanges& ranges, const BulkProgress& progress,

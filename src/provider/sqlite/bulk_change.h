@@ -22,6 +22,8 @@ public:
     Outcome Delete(const BulkRanges& ranges, const BulkProgress& progress);
 
 private:
+    bool HasTriggers() const;
+    Outcome DeleteWhole(const BulkRanges& ranges, const BulkProgress& progress);
     QByteArray Target() const { return writer_.Table() + " AS " + alias_; }
     QByteArray Within(const QByteArray& condition) const;
     Outcome Run(const QByteArray& sql, const BulkRanges& ranges, const BulkProgress& progress, const Value* value);

@@ -5,10 +5,13 @@
 #include "provider/sqlite/static_cursor.h"
 #include "provider/sqlite/transaction.h"
 
+#include <QElapsedTimer>
+
 namespace mirel::sqlite {
 namespace {
 
 constexpr size_t kBlockSize = 256;
+constexpr int kFirstBlockMs = 2;
 
 } // namespace
 
@@ -30,13 +33,16 @@ Outcome ForwardCursor::FetchBlock()
 {
     block_.clear();
     blockStart_ = position_;
-    const CellSink keep = [this](std::span<const Cell> cells) {
+    QElapsedTimer timer;
+    timer.start();
+    blockIsLast_ = true;
+    const CellSink keep = [&](std::span<const Cell> cells) {
         Keep(cells);
-        return block_.size() < kBlockSize;
+        // A search that finds little is not run to the block's end: reading on starts it again.
+        blockIsLast_ = block_.size() < kBlockSize && (position_ > 0 || !timer.hasExpired(kFirstBlockMs));
+        return blockIsLast_;
     };
-    const Outcome outcome = position_ == 0 ? Walk(AllFields(plan_.fields), keep) : FetchFurther(keep);
-    blockIsLast_ = block_.size() < kBlockSize;
-    return outcome;
+    return position_ == 0 ? Walk(AllFields(plan_.fields), keep) : FetchFurther(keep);
 }
 
 // Most results end within the first block; a longer one that is walked record by record gets positions.
@@ -48,7 +54,7 @@ Outcome ForwardCursor::FetchFurther(const CellSink& keep)
             return outcome;
         rest_ = std::move(rest);
     }
-    return rest_->Read({.first = position_, .count = qint64(kBlockSize), .fields = {}}, keep);
+    return rest_->Read({.first = position_, .count = qint64(kBlockSize) + 1, .fields = {}}, keep);
 }
 
 // Hands over the records from the current one on, running the SELECT anew: nothing was left running.

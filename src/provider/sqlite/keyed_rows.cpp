@@ -3,6 +3,7 @@
 #include "provider/sqlite/row_reader.h"
 #include "provider/sqlite/select_sql.h"
 #include "provider/sqlite/sql_writer.h"
+#include "provider/sqlite/text_sort.h"
 
 #include <QElapsedTimer>
 
@@ -86,7 +87,7 @@ Outcome KeyedRows::ChooseGathering()
     if (result != SQLITE_ROW)
         return file_.OutcomeOf(result);
     isComplete_ = sqlite3_column_type(bounds.Get(), 0) == SQLITE_NULL;
-    nextRowId_ = bounds.Integer(0);
+    firstRowId_ = nextRowId_ = bounds.Integer(0);
     lastRowId_ = bounds.Integer(1);
     sliceWidth_ = kFirstSliceWidth;
     return {};
@@ -95,12 +96,41 @@ Outcome KeyedRows::ChooseGathering()
 Outcome KeyedRows::GatherAll()
 {
     Outcome outcome;
-    Statement statement = file_.Prepare(KeySelect(), outcome);
-    if (!statement)
-        return outcome;
-    outcome = Gather(statement);
+    bool sorted = false;
+    if (plan_.sources.size() == 1 && plan_.order.size() == 1 && plan_.order.front().isText)
+        outcome = GatherByText(sorted);
+    if (outcome.Ok() && !sorted) {
+        Statement statement = file_.Prepare(KeySelect(), outcome);
+        if (statement)
+            outcome = Gather(statement);
+    }
     isComplete_ = outcome.Ok();
     return outcome;
+}
+
+Outcome KeyedRows::GatherByText(bool& sorted)
+{
+    const PlannedOrder& order = plan_.order.front();
+    Outcome outcome;
+    Statement statement = file_.Prepare("SELECT " + RowIdList(plan_) + ',' + order.expression + " FROM " +
+                                            plan_.from + WhereClause(plan_),
+                                        outcome);
+    if (!statement)
+        return outcome;
+    TextSort sort;
+    int result = statement.Step();
+    for (; result == SQLITE_ROW; result = statement.Step()) {
+        if (!sort.Add(statement.Integer(0), statement.TextView(1)))
+            return {};
+    }
+    if (result != SQLITE_DONE)
+        return file_.OutcomeOf(result);
+    sorted = true;
+    for (const qint64 rowId : sort.Finish(order.descending)) {
+        if (!keys_.Append({&rowId, 1}))
+            return {Hr::OutOfMemory, {}};
+    }
+    return {};
 }
 
 Outcome KeyedRows::GatherSlice()
@@ -160,23 +190,48 @@ Outcome KeyedRows::PositionOf(const RecordKey& key, qint64& position)
 Outcome KeyedRows::Read(const ReadRange& range, const CellSink& sink)
 {
     const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;
-    // Walking a join in the order of its keys is walking it by its keys; all else the SELECT itself does faster.
-    const bool keepsOrder =
-        plan_.sources.size() == 1 || !plan_.order.empty() || range.order == ReadRange::Order::Any;
-    if (range.first == 0 && range.count < 0 && IsFresh() && keepsOrder)
-        return ReadAll(range, fields, sink);
-    return ReadByKeys(range, fields, sink);
+    bool goOn = true;
+    const CellSink stopping = [&](std::span<const Cell> cells) { return goOn = sink(cells); };
+    if (!ShouldRunAgain(range)) {
+        const qint64 end = range.count < 0 ? kAllRecords : range.first + range.count;
+        Outcome outcome = Extend(end, QDeadlineTimer(QDeadlineTimer::Forever));
+        return outcome.Ok() ? ReadByKeys(range.first, std::min(end, Known()), fields, stopping) : outcome;
+    }
+    // What slices have found so far is not searched for again.
+    const qint64 known = gathering_ == Gathering::Slices && !isComplete_ ? Known() : 0;
+    Outcome outcome = ReadByKeys(0, known, fields, stopping);
+    return outcome.Ok() && goOn ? ReadRest(range, fields, sink) : outcome;
 }
 
-Outcome KeyedRows::ReadAll(const ReadRange& range, std::span<const int> fields, const CellSink& sink)
+// Reading it all is fastest by the SELECT itself, which visits the records in row id order; but few records of
+// a big table by their keys. A join without an order stands in the order of its keys alone.
+bool KeyedRows::ShouldRunAgain(const ReadRange& range) const
 {
-    QByteArray sql = "SELECT " + ColumnList(plan_, fields) + " FROM " + plan_.from + WhereClause(plan_);
+    constexpr quint64 kFew = 8; // one in so many row ids
+    if (range.first != 0 || range.count >= 0 || !IsFresh())
+        return false;
+    if (range.order == ReadRange::Order::Any || !plan_.order.empty())
+        return true;
+    if (plan_.sources.size() > 1)
+        return false;
+    return !isComplete_ || gathering_ == Gathering::Whole ||
+           quint64(Known()) > (quint64(lastRowId_) - quint64(firstRowId_)) / kFew;
+}
+
+Outcome KeyedRows::ReadRest(const ReadRange& range, std::span<const int> fields, const CellSink& sink)
+{
+    const bool inSlices = gathering_ == Gathering::Slices && !isComplete_;
+    const QByteArray& rowId = plan_.sources.front().rowId;
+    QByteArray sql = "SELECT " + ColumnList(plan_, fields) + " FROM " + plan_.from +
+                     WhereClause(plan_, inSlices ? rowId + ">=?1" : QByteArray());
     if (range.order == ReadRange::Order::Result)
         sql += KeyedOrder(plan_);
     Outcome outcome;
     Statement statement = file_.Prepare(sql, outcome);
     if (!statement)
         return outcome;
+    if (inSlices)
+        statement.Bind(1, nextRowId_);
     RowReader reader(plan_.fields, fields, RowReader::Layout::Listed);
     int result = statement.Step();
     for (; result == SQLITE_ROW; result = statement.Step()) {
@@ -186,24 +241,25 @@ Outcome KeyedRows::ReadAll(const ReadRange& range, std::span<const int> fields, 
     return file_.OutcomeOf(result);
 }
 
-Outcome KeyedRows::ReadByKeys(const ReadRange& range, std::span<const int> fields, const CellSink& sink)
+Outcome KeyedRows::ReadByKeys(qint64 first, qint64 end, std::span<const int> fields, const CellSink& sink)
 {
-    const qint64 end = range.count < 0 ? kAllRecords : range.first + range.count;
-    Outcome outcome = Extend(end, QDeadlineTimer(QDeadlineTimer::Forever));
-    bool goOn = true;
-    const CellSink stopping = [&](std::span<const Cell> cells) { return goOn = sink(cells); };
-    Statement record = outcome.Ok() ? file_.Prepare(RecordSelect(fields), outcome) : Statement();
+    if (first >= end)
+        return {};
+    Outcome outcome;
+    Statement record = file_.Prepare(RecordSelect(fields), outcome);
     if (!record)
         return outcome;
     RowReader reader(plan_.fields, fields, RowReader::Layout::Listed);
-    for (qint64 position = range.first; goOn && position < std::min(end, Known()); ++position) {
+    for (qint64 position = first; position < end; ++position) {
         for (size_t source = 0; source < plan_.sources.size(); ++source)
             record.Bind(int(source) + 1, keys_.RowIdAt(position, source));
         const int result = record.Step();
-        if (result == SQLITE_ROW)
-            goOn = sink(reader.Read(record.Get()));
-        else if (result != SQLITE_DONE)
+        if (result == SQLITE_ROW) {
+            if (!sink(reader.Read(record.Get())))
+                return {};
+        } else if (result != SQLITE_DONE) {
             return file_.OutcomeOf(result);
+        }
         record.Reset();
     }
     return {};
@@ -255,6 +311,7 @@ BulkRanges KeyedRows::RangesFor(int source) const
     const bool byCondition = IsFresh() && plan_.sources.size() == 1;
     const size_t step = byCondition ? size_t(kBulkStep) : 1;
     BulkRanges bulk;
+    bulk.count = qint64(rowIds.size());
     for (size_t at = 0; at < rowIds.size(); at += step)
         bulk.ranges.push_back({rowIds[at], rowIds[std::min(at + step, rowIds.size()) - 1]});
     if (byCondition)

@@ -35,9 +35,12 @@ private:
     Outcome ChooseGathering();
     Outcome GatherAll();
     Outcome GatherSlice();
+    // One table in the order of one text: sorted here. `sorted` stays false when it is too much for memory.
+    Outcome GatherByText(bool& sorted);
     Outcome Gather(Statement& statement);
-    Outcome ReadAll(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
-    Outcome ReadByKeys(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
+    bool ShouldRunAgain(const ReadRange& range) const;
+    Outcome ReadRest(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
+    Outcome ReadByKeys(qint64 first, qint64 end, std::span<const int> fields, const CellSink& sink);
     // Nothing has changed since: the SELECT would give these very records in this order.
     bool IsFresh() const { return sqlite3_total_changes64(file_.Handle()) == changesBefore_; }
     QByteArray KeySelect() const;
@@ -52,7 +55,8 @@ private:
 
     enum class Gathering { Unknown, Whole, Slices };
     Gathering gathering_ = Gathering::Unknown;
-    qint64 nextRowId_ = 0; // of a table that is gathered in slices
+    qint64 firstRowId_ = 0; // of a table that is gathered in slices
+    qint64 nextRowId_ = 0;
     qint64 lastRowId_ = 0;
     quint64 sliceWidth_ = 0;
 };

@@ -2,114 +2,158 @@
 
 #include <QStringList>
 
-#include <algorithm>
 #include <cstdint>
 #include <cstring>
 
 namespace mirel::sqlite {
 namespace {
 
-bool IsAscii(std::string_view text)
+constexpr uint64_t kEachByte = 0x0101010101010101;
+constexpr uint64_t kTopBits = 0x80 * kEachByte;
+
+// Eight ASCII bytes in small letters at once: adding carries into the top bit of those at or behind "A", and of
+// those behind "Z".
+constexpr uint64_t LowerEight(uint64_t bytes)
 {
+    const uint64_t fromA = bytes + (0x80 - 'A') * kEachByte;
+    const uint64_t behindZ = bytes + (0x7F - 'Z') * kEachByte;
+    return bytes | (((fromA ^ behindZ) & kTopBits) >> 2);
+}
+static_assert(LowerEight(0x405A415B7A617B30) == 0x407A615B7A617B30);
+
+// Puts `text` into `lower` in small letters; false when it is not ASCII.
+bool LowerAscii(std::string_view text, std::string& lower)
+{
+    lower.resize(text.size());
     size_t at = 0;
     for (; at + 8 <= text.size(); at += 8) {
-        uint64_t word = 0;
-        std::memcpy(&word, text.data() + at, 8);
-        if (word & 0x8080808080808080U)
+        uint64_t bytes = 0;
+        std::memcpy(&bytes, text.data() + at, 8);
+        if (bytes & kTopBits)
             return false;
+        bytes = LowerEight(bytes);
+        std::memcpy(lower.data() + at, &bytes, 8);
     }
-    return std::all_of(text.begin() + qsizetype(at), text.end(), [](char unit) { return (unit & 0x80) == 0; });
-}
-
-constexpr char Lower(char unit)
-{
-    return unit >= 'A' && unit <= 'Z' ? char(unit + ('a' - 'A')) : unit;
-}
-
-bool EqualFolded(const char* text, const std::string& lower)
-{
-    for (size_t i = 0; i < lower.size(); ++i) {
-        if (Lower(text[i]) != lower[i])
-            return false;
-    }
+    uint64_t rest = 0;
+    const size_t left = text.size() - at;
+    std::memcpy(&rest, text.data() + at, left);
+    if (rest & kTopBits)
+        return false;
+    rest = LowerEight(rest);
+    std::memcpy(lower.data() + at, &rest, left);
     return true;
 }
 
-// Where `lower` first stands in `text` at or behind `from`.
-size_t FindFolded(std::string_view text, const std::string& lower, size_t from)
+// Letters that texts are full of come last; what is not listed is rarer than all of them.
+constexpr std::string_view kCommon = "zqjxkvbywgpfmucdlhrsnioate ";
+
+// The byte of `part` to look for first: the fewer places it stands at, the less there is to compare.
+size_t RarestByte(const std::string& part)
 {
-    if (lower.size() > text.size())
-        return std::string_view::npos;
-    const size_t last = text.size() - lower.size();
-    const char first = lower.front();
-    for (; from <= last; ++from) {
-        if (Lower(text[from]) == first && EqualFolded(text.data() + from, lower))
-            return from;
+    size_t rarest = 0;
+    size_t lowest = kCommon.size();
+    for (size_t i = 0; i < part.size(); ++i) {
+        const size_t place = kCommon.find(part[i]) + 1; // 0: not listed
+        if (place < lowest) {
+            lowest = place;
+            rarest = i;
+        }
     }
-    return std::string_view::npos;
+    return rarest;
+}
+
+qsizetype FindShort(std::string_view text, const std::string& part)
+{
+    const size_t anchor = RarestByte(part);
+    for (size_t from = anchor; text.size() - from >= part.size() - anchor;) {
+        const void* hit = std::memchr(text.data() + from, part[anchor], text.size() - from);
+        if (!hit)
+            return -1;
+        const size_t at = size_t(static_cast<const char*>(hit) - text.data()) - anchor;
+        if (text.substr(at, part.size()) == part)
+            return qsizetype(at);
+        from = at + anchor + 1;
+    }
+    return -1;
+}
+
+qsizetype Find(std::string_view text, const std::string& part)
+{
+    constexpr size_t kShort = 16; // a longer one is searched for in a time that does not grow with its length
+    if (part.size() > text.size())
+        return -1;
+    if (part.empty())
+        return 0;
+    if (part.size() <= kShort)
+        return FindShort(text, part);
+    const void* found = memmem(text.data(), text.size(), part.data(), part.size());
+    return found ? static_cast<const char*>(found) - text.data() : -1;
+}
+
+qsizetype Find(QStringView text, const QString& part)
+{
+    return text.indexOf(part);
+}
+
+std::string_view From(std::string_view text, qsizetype start)
+{
+    return text.substr(size_t(start));
+}
+
+QStringView From(QStringView text, qsizetype start)
+{
+    return text.mid(start);
+}
+
+bool StartsWith(std::string_view text, std::string_view part)
+{
+    return text.starts_with(part);
+}
+
+bool StartsWith(QStringView text, const QString& part)
+{
+    return text.startsWith(part);
+}
+
+// The first and the last part stand at the ends; each part between them where it first fits.
+template <typename View, typename Part>
+bool MatchesParts(View text, const std::vector<Part>& parts)
+{
+    if (!StartsWith(text, parts.front()))
+        return false;
+    if (parts.size() == 1)
+        return text.size() == parts.front().size();
+    text = From(text, qsizetype(parts.front().size()));
+    for (size_t i = 1; i + 1 < parts.size(); ++i) {
+        const qsizetype at = Find(text, parts[i]);
+        if (at < 0)
+            return false;
+        text = From(text, at + qsizetype(parts[i].size()));
+    }
+    const Part& last = parts.back();
+    return text.size() >= last.size() && From(text, qsizetype(text.size() - last.size())) == last;
 }
 
 } // namespace
 
 LikePattern::LikePattern(std::string_view utf8)
-    : isAscii_(IsAscii(utf8))
 {
+    std::string lower;
+    const bool isAscii = LowerAscii(utf8, lower);
     const QString pattern = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
     for (const QString& part : pattern.split(u'%')) {
         folded_.push_back(part);
-        if (isAscii_)
+        if (isAscii)
             ascii_.push_back(part.toStdString());
     }
 }
 
-bool LikePattern::Matches(std::string_view utf8) const
+bool LikePattern::Matches(std::string_view utf8)
 {
-    if (isAscii_ && IsAscii(utf8))
-        return MatchesAscii(utf8);
-    return MatchesFolded(QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded());
-}
-
-// The first and the last part stand at the ends; each part between them where it first fits.
-bool LikePattern::MatchesAscii(std::string_view text) const
-{
-    const std::string& first = ascii_.front();
-    const std::string& last = ascii_.back();
-    if (ascii_.size() == 1)
-        return text.size() == first.size() && EqualFolded(text.data(), first);
-    if (text.size() < first.size() + last.size() || !EqualFolded(text.data(), first) ||
-        !EqualFolded(text.data() + text.size() - last.size(), last)) {
-        return false;
-    }
-    const std::string_view middle = text.substr(0, text.size() - last.size());
-    size_t at = first.size();
-    for (size_t i = 1; i + 1 < ascii_.size(); ++i) {
-        if (ascii_[i].empty())
-            continue;
-        at = FindFolded(middle, ascii_[i], at);
-        if (at == std::string_view::npos)
-            return false;
-        at += ascii_[i].size();
-    }
-    return true;
-}
-
-bool LikePattern::MatchesFolded(const QString& folded) const
-{
-    const QString& first = folded_.front();
-    const QString& last = folded_.back();
-    if (folded_.size() == 1)
-        return folded == first;
-    if (folded.size() < first.size() + last.size() || !folded.startsWith(first) || !folded.endsWith(last))
-        return false;
-    const QStringView middle = QStringView(folded).chopped(last.size());
-    qsizetype at = first.size();
-    for (size_t i = 1; i + 1 < folded_.size(); ++i) {
-        at = middle.indexOf(folded_[i], at);
-        if (at < 0)
-            return false;
-        at += folded_[i].size();
-    }
-    return true;
+    if (!ascii_.empty() && LowerAscii(utf8, lower_))
+        return MatchesParts(std::string_view(lower_), ascii_);
+    const QString folded = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
+    return MatchesParts(QStringView(folded), folded_);
 }
 
 } // namespace mirel::sqlite

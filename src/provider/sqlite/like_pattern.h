@@ -14,15 +14,13 @@ class LikePattern {
 public:
     explicit LikePattern(std::string_view utf8);
 
-    bool Matches(std::string_view utf8) const;
+    bool Matches(std::string_view utf8);
 
 private:
-    bool MatchesAscii(std::string_view text) const;
-    bool MatchesFolded(const QString& folded) const;
-
-    std::vector<std::string> ascii_; // between the wildcards, lower case; empty when one is not ASCII
-    std::vector<QString> folded_;    // the same, case folded
-    bool isAscii_ = false;
+    // Its parts between the wildcards, in small letters. Most texts are ASCII and are compared as bytes.
+    std::vector<std::string> ascii_; // empty when a part is not ASCII
+    std::vector<QString> folded_;
+    std::string lower_; // the text at hand
 };
 
 } // namespace mirel::sqlite

@@ -22,6 +22,7 @@ public:
     // Ends with ReadOnly for an expression, BadLiteral or Overflow for what does not fit.
     Outcome Convert(const FieldChange& change, Value& converted) const;
     QByteArray ColumnOf(int field) const;
+    const QString& TableName() const { return name_; }
     const QByteArray& Table() const { return table_; } // as SQL
     const QByteArray& RowId() const { return rowId_; } // its alias
 

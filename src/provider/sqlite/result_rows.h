@@ -18,6 +18,8 @@ namespace mirel::sqlite {
 struct BulkRanges {
     std::vector<RowIdIndex::Range> ranges;
     QByteArray condition;
+    bool isWholeTable = false;
+    qint64 count = 0; // of the records
 };
 
 // The records behind a static cursor: which stands at which position, and reading them. Positions count from 0;

@@ -82,6 +82,14 @@ QString Statement::Text(int column) const
     return QString::fromUtf8(text, sqlite3_column_bytes(Get(), column));
 }
 
+std::optional<std::string_view> Statement::TextView(int column) const
+{
+    const auto* text = reinterpret_cast<const char*>(sqlite3_column_text(Get(), column));
+    if (!text)
+        return {};
+    return std::string_view(text, size_t(sqlite3_column_bytes(Get(), column)));
+}
+
 Statement StatementCache::Lend(sqlite3* handle, const QByteArray& sql)
 {
     const auto found = std::ranges::find(idle_, sql, &Idle::sql);

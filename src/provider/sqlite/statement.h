@@ -9,6 +9,7 @@
 
 #include <list>
 #include <memory>
+#include <optional>
 #include <string_view>
 
 namespace mirel::sqlite {
@@ -54,6 +55,7 @@ public:
 
     qint64 Integer(int column) const { return sqlite3_column_int64(Get(), column); }
     QString Text(int column) const;
+    std::optional<std::string_view> TextView(int column) const; // until the next step; empty for NULL
 
 private:
     void Keep(int result)

@@ -119,14 +119,19 @@ Outcome TableRows::Read(const ReadRange& range, const CellSink& sink)
     if (!outcome.Ok() || range.first >= Known())
         return outcome;
     const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;
+    const RowIdIndex::Place place = index_.PlaceOf(range.first);
+    const bool isBounded = range.count >= 0 || place.skip > 0; // counting would cost every record a little
     Statement page =
-        file_.Prepare(Select(ColumnList(plan_, fields), " WHERE @>=?1 ORDER BY @ LIMIT ?2 OFFSET ?3"), outcome);
+        file_.Prepare(Select(ColumnList(plan_, fields),
+                             isBounded ? " WHERE @>=?1 ORDER BY @ LIMIT ?2 OFFSET ?3" : " WHERE @>=?1 ORDER BY @"),
+                      outcome);
     if (!page)
         return outcome;
-    const RowIdIndex::Place place = index_.PlaceOf(range.first);
     page.Bind(1, place.rowId);
-    page.Bind(2, range.count);
-    page.Bind(3, place.skip);
+    if (isBounded) {
+        page.Bind(2, range.count);
+        page.Bind(3, place.skip);
+    }
     RowReader reader(plan_.fields, fields, RowReader::Layout::Listed);
     int result = page.Step();
     for (; result == SQLITE_ROW; result = page.Step()) {

@@ -25,7 +25,7 @@ public:
 
     bool Append(const RecordKey& key) override { return index_.Append(key[0]); }
     void Remove(qint64 position, const RecordKey& key) override { index_.Remove(position, key[0]); }
-    BulkRanges RangesFor(int) const override { return {index_.Ranges(), {}}; }
+    BulkRanges RangesFor(int) const override { return {index_.Ranges(), {}, true, Known()}; }
 
 private:
     Outcome Begin();
