@@ -13,6 +13,7 @@ template <typename Record>
 std::vector<MainEntry> EntriesOf(const std::vector<Record>& records, EntryKind kind)
 {
     std::vector<MainEntry> entries;
+    entries.reserve(records.size());
     for (const Record& record : records)
         entries.push_back({kind, record.name.Text(), record.tableName.Text(), false});
     return entries;

@@ -165,14 +165,14 @@ NewOutcome OutcomeOfNew(const MainViewState& state)
 
 Str EmptyListText(MainTab tab)
 {
-    constexpr std::array texts = {Str::EmptyFavorites, Str::EmptyTables, Str::EmptyForms, Str::EmptyQueries};
-    return texts[size_t(tab)];
+    constexpr std::array kTexts = {Str::EmptyFavorites, Str::EmptyTables, Str::EmptyForms, Str::EmptyQueries};
+    return kTexts[size_t(tab)];
 }
 
 Str TabText(MainTab tab)
 {
-    constexpr std::array texts = {Str::TabFavorites, Str::TabTable, Str::TabForm, Str::TabQuery};
-    return texts[size_t(tab)];
+    constexpr std::array kTexts = {Str::TabFavorites, Str::TabTable, Str::TabForm, Str::TabQuery};
+    return kTexts[size_t(tab)];
 }
 
 } // namespace mirel
