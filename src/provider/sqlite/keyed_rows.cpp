@@ -304,8 +304,7 @@ BulkRanges KeyedRows::RangesFor(int source) const
     for (qint64 position = 0; position < Known(); ++position)
         rowIds.push_back(keys_.RowIdAt(position, size_t(source)));
     std::ranges::sort(rowIds);
-    const auto doubles = std::ranges::unique(rowIds);
-    rowIds.erase(doubles.begin(), doubles.end());
+    rowIds.erase(std::unique(rowIds.begin(), rowIds.end()), rowIds.end());
     std::erase(rowIds, kNoRow);
 
     const bool byCondition = IsFresh() && plan_.sources.size() == 1;
