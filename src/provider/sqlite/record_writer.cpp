@@ -4,6 +4,8 @@
 #include "provider/sqlite/sql_writer.h"
 #include "resources/string_table.h"
 
+#include <optional>
+
 namespace mirel::sqlite {
 
 RecordWriter::RecordWriter(DatabaseFile& file, const dialect::Table& table, std::span<const ResultField> fields)
@@ -49,15 +51,16 @@ Outcome RecordWriter::Run(const QByteArray& sql, std::span<const Value> values, 
         statement.Bind(int(i) + 1, values[i]);
     if (sqlite3_bind_parameter_count(statement.Get()) > int(values.size()))
         statement.Bind(int(values.size()) + 1, rowId);
-    bool written = false;
+    std::optional<qint64> written;
     int result = statement.Step();
-    for (; result == SQLITE_ROW; result = statement.Step()) {
-        rowId = statement.Integer(0);
-        written = true;
-    }
-    if (result == SQLITE_DONE && !written)
+    for (; result == SQLITE_ROW; result = statement.Step())
+        written = statement.Integer(0);
+    if (result != SQLITE_DONE) // what it returned is undone: the file was in use when it came to commit
+        return file_.OutcomeOf(result);
+    if (!written)
         return {Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
-    return file_.OutcomeOf(result);
+    rowId = *written;
+    return {};
 }
 
 Outcome RecordWriter::Add(std::span<const FieldChange> values, qint64& rowId)

@@ -22,8 +22,9 @@ StaticCursor::StaticCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan)
 {
     if (plan_.updatableSource < 0)
         return;
-    const QString& table = plan_.sources[size_t(plan_.updatableSource)].table;
-    writer_.emplace(*file_, *file_->Schema().FindTable(table), plan_.fields);
+    const QString& name = plan_.sources[size_t(plan_.updatableSource)].table;
+    if (const dialect::Table* table = file_->Schema().FindTable(name))
+        writer_.emplace(*file_, *table, plan_.fields);
 }
 
 template <typename Work>
@@ -45,6 +46,8 @@ Outcome StaticCursor::Open()
             if (Outcome outcome = kept_->Fill(plan_); !outcome.Ok())
                 return outcome;
             plan_ = kept_->Plan(plan_);
+        } else if (!HasTables()) {
+            return {Hr::NoSuchTable, {}};
         }
         if (plan_.sources.size() == 1 && plan_.where.isEmpty() && plan_.order.empty())
             rows_ = std::make_unique<TableRows>(*file_, plan_);
@@ -53,6 +56,14 @@ Outcome StaticCursor::Open()
         if (Outcome outcome = ReadVersion(version_); !outcome.Ok())
             return outcome;
         return Settle(0);
+    });
+}
+
+// A plan can be older than the file's structure: a forward-only cursor comes here when its first block ends.
+bool StaticCursor::HasTables() const
+{
+    return std::ranges::all_of(plan_.sources, [this](const PlannedSource& source) {
+        return file_->Schema().FindTable(source.table) != nullptr;
     });
 }
 

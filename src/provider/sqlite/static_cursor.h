@@ -56,6 +56,7 @@ private:
 
     template <typename Work>
     Outcome InRead(Work work);
+    bool HasTables() const;
     Outcome ReadVersion(Version& version);
     Outcome TakeUpChanges();
     Outcome Restart();
