@@ -29,10 +29,11 @@ protected:
         const QString head = shown.section(u"\r\n"_s, 0, 0);
         EXPECT_EQ(head.left(head.indexOf(u')') + 1), u"Error: (%1)"_s.arg(code)) << what.toStdString();
         EXPECT_EQ(shown.section(u"\r\n"_s, 1), StringText(message)) << what.toStdString();
-        if (context.isEmpty())
+        if (context.isEmpty()) {
             EXPECT_TRUE(head.endsWith(u')')) << shown.toStdString();
-        else
+        } else {
             EXPECT_TRUE(head.contains(context)) << shown.toStdString();
+        }
     }
     void ExpectFailure(const QString& file, const QString& statement, const QString& code, Str message,
                        const QString& context = {})

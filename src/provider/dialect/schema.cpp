@@ -8,8 +8,10 @@ namespace {
 template <typename Record>
 const Record* FindByName(const std::vector<Record>& records, QStringView name)
 {
-    const auto found =
-        std::ranges::find_if(records, [&](const Record& record) { return SameName(record.name, name); });
+    // Others know names apart that differ in the case of a letter beyond ASCII.
+    auto found = std::ranges::find_if(records, [&](const Record& record) { return record.name == name; });
+    if (found == records.end())
+        found = std::ranges::find_if(records, [&](const Record& record) { return SameName(record.name, name); });
     return found == records.end() ? nullptr : &*found;
 }
 

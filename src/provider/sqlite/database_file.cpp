@@ -61,10 +61,38 @@ constexpr const char* kSettings = "PRAGMA cell_size_check=ON;"
 const QByteArray kNewDatabase =
     "PRAGMA page_size=16384; PRAGMA application_id=" + QByteArray::number(kApplicationId);
 
-Outcome CheckFile(const QString& path)
+// What the engine keeps beside a database.
+constexpr std::array kCompanions = {"-journal", "-wal", "-shm"};
+
+QString CompanionOf(const QString& path, const char* suffix)
+{
+    return path + QLatin1String(suffix);
+}
+
+Outcome CheckName(const QString& path)
 {
     if (path.isEmpty())
         return {Hr::CannotOpen, StringText(Str::NoDatabaseNamed)};
+    if (path.contains(QChar::Null)) // the system would take the part before it for the name
+        return {Hr::CannotOpen, StringText(Str::DatabaseIsNoFile, {path})};
+    return {};
+}
+
+// The engine opens what bears these names, and a pipe would keep it waiting for ever.
+Outcome CheckCompanions(const QString& path)
+{
+    for (const char* suffix : kCompanions) {
+        const QFileInfo companion(CompanionOf(path, suffix));
+        if (companion.exists() && !companion.isFile())
+            return {Hr::CannotOpen, StringText(Str::DatabaseIsNoFile, {companion.filePath()})};
+    }
+    return {};
+}
+
+Outcome CheckFile(const QString& path)
+{
+    if (Outcome outcome = CheckName(path); !outcome.Ok())
+        return outcome;
     const QFileInfo info(path);
     if (!info.exists())
         return {Hr::CannotOpen, StringText(Str::DatabaseNotFound, {path})};
@@ -72,7 +100,7 @@ Outcome CheckFile(const QString& path)
         return {Hr::CannotOpen, StringText(Str::DatabaseIsNoFile, {path})};
     if (info.size() == 0) // the engine would make a database of it
         return {Hr::NotADatabase, StringText(Str::FileIsNoDatabase, {path})};
-    return {};
+    return CheckCompanions(IdentityOfPath(path));
 }
 
 bool MayBeWritten(const QString& path)
@@ -128,8 +156,8 @@ Outcome DatabaseFile::OpenHandle(bool readOnly)
 
 Outcome DatabaseFile::Create(const QString& path)
 {
-    if (path.isEmpty())
-        return {Hr::CannotOpen, StringText(Str::NoDatabaseNamed)};
+    if (Outcome outcome = CheckName(path); !outcome.Ok())
+        return outcome;
     QFile place(path);
     if (!place.open(QIODevice::WriteOnly | QIODevice::NewOnly)) {
         if (QFileInfo::exists(path))
@@ -162,8 +190,8 @@ Outcome DatabaseFile::Remove(const QString& path)
     QFile whole(file->Path());
     if (!whole.remove())
         return {Hr::AccessDenied, StringText(Str::DatabaseFailure, {path, whole.errorString()})};
-    for (const QString& suffix : {u"-journal"_s, u"-wal"_s, u"-shm"_s})
-        QFile::remove(file->Path() + suffix);
+    for (const char* suffix : kCompanions)
+        QFile::remove(CompanionOf(file->Path(), suffix));
     return {};
 }
 

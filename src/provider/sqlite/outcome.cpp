@@ -42,6 +42,8 @@ Outcome OutcomeOfSqlite(int resultCode, const QString& path, const QString& reas
     case SQLITE_ERROR:
         if (const std::optional<Hr> refused = StoreFailure(reason.toStdString()))
             return {*refused, {}};
+        if (reason.startsWith(u"too many columns")) // of a table as wide as can be, together with its row id
+            return {Hr::TooManyColumns, {}};
         return {Hr::SyntaxError, reason};
     case SQLITE_SCHEMA:
         return {Hr::SyntaxError, reason};

@@ -56,9 +56,13 @@ Outcome TableRows::AddSample()
     const int result = next.Step();
     if (result == SQLITE_DONE)
         return Finish();
-    if (result == SQLITE_ROW)
-        index_.AddSample(next.Integer(0));
-    return file_.OutcomeOf(result);
+    if (result != SQLITE_ROW)
+        return file_.OutcomeOf(result);
+    // In a damaged tree row ids can come again and again: there would be no end of samples.
+    if (next.Integer(0) <= *index_.LastSample())
+        return OutcomeOfSqlite(SQLITE_CORRUPT, file_.Path(), QLatin1String(sqlite3_errstr(SQLITE_CORRUPT)));
+    index_.AddSample(next.Integer(0));
+    return {};
 }
 
 Outcome TableRows::Finish()
