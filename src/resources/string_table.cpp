@@ -1,7 +1,7 @@
 #include "resources/string_table.h"
 
 #include <algorithm>
-#include <array>
+#include <iterator>
 #include <string_view>
 
 namespace mirel {
@@ -12,7 +12,8 @@ struct Row {
     std::u16string_view text;
 };
 
-constexpr std::array kRows = {
+// A plain array: clang 14 deduces the size of a std::array up to 256 elements only.
+constexpr Row kRows[] = {
 #define MIREL_STRING(name, number, text) Row{Str::name, u##text},
 #include "resources/strings.def"
 #undef MIREL_STRING
@@ -20,7 +21,7 @@ constexpr std::array kRows = {
 
 constexpr bool NumbersRise()
 {
-    for (size_t i = 1; i < kRows.size(); ++i) {
+    for (size_t i = 1; i < std::size(kRows); ++i) {
         if (kRows[i - 1].id >= kRows[i].id)
             return false;
     }
@@ -48,7 +49,7 @@ QString Fill(QStringView pattern, const QStringList& arguments)
 QString StringText(Str id, const QStringList& arguments)
 {
     const auto row = std::ranges::lower_bound(kRows, id, {}, &Row::id);
-    if (row == kRows.end() || row->id != id)
+    if (row == std::end(kRows) || row->id != id)
         return {};
     return Fill(QStringView(row->text.data(), qsizetype(row->text.size())), arguments);
 }
