@@ -2,7 +2,7 @@
 
 #include <QString>
 
-#include <cstring>
+#include <algorithm>
 #include <memory>
 #include <string_view>
 
@@ -22,7 +22,7 @@ public:
             WriteThrough(bytes);
             return;
         }
-        std::memcpy(buffer_.get() + used_, bytes.data(), bytes.size());
+        std::copy(bytes.begin(), bytes.end(), buffer_.get() + used_); // memcpy refuses an empty view's null
         used_ += bytes.size();
     }
     void Write(char byte) { Write(std::string_view(&byte, 1)); }
