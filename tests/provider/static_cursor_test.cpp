@@ -200,6 +200,11 @@ TEST_F(StaticCursor, ForwardOnlyWalksBeyondItsFirstBlock)
         ASSERT_EQ(cursor->MoveNext(), Hr::Ok);
     }
     EXPECT_EQ(expected, 1000);
+    const auto read = Open(u"SELECT N FROM T WHERE N<1000"_s, CursorType::ForwardOnly);
+    EXPECT_EQ(Read(*read, {.count = 300, .fields = {}}).last(), u"299"_s);
+    EXPECT_EQ(FieldOf(*read), Value::Integer(300)) << "what was read is used up";
+    EXPECT_EQ(Read(*read).size(), 700);
+    EXPECT_TRUE(read->AtEnd());
     EXPECT_EQ(cursor->RecordCount(), -1);
     EXPECT_TRUE(Failed(cursor->MovePrevious()));
 }

@@ -124,14 +124,21 @@ Outcome ForwardCursor::Read(const ReadRange& range, const CellSink& sink)
     if (!outcome.Ok())
         return outcome;
     qint64 done = 0;
+    bool isStopped = false;
     const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;
     outcome = Walk(fields, [&](std::span<const Cell> cells) {
         ++done;
-        return sink(cells) && done != range.count;
+        isStopped = !sink(cells) || done == range.count;
+        return !isStopped;
     });
     position_ += done;
-    if (outcome.Ok() && AtEnd() && !blockIsLast_)
+    if (outcome.Ok() && !isStopped) {
+        block_.clear();
+        blockStart_ = position_;
+        blockIsLast_ = true;
+    } else if (outcome.Ok() && AtEnd() && !blockIsLast_) {
         outcome = FetchBlock();
+    }
     if (outcome.Ok())
         outcome = transaction.End();
     return outcome;

@@ -11,10 +11,8 @@ namespace {
 
 std::string_view TextOf(sqlite3_value* value)
 {
-    // As bytes: asked for a text, the library would copy each one to put a NUL behind it.
-    const bool asBytes = sqlite3_value_type(value) == SQLITE_TEXT && sqlite3_value_encoding(value) == SQLITE_UTF8;
-    const void* text = asBytes ? sqlite3_value_blob(value) : sqlite3_value_text(value);
-    return {text ? static_cast<const char*>(text) : "", size_t(sqlite3_value_bytes(value))};
+    const auto* text = reinterpret_cast<const char*>(sqlite3_value_text(value));
+    return {text ? text : "", size_t(sqlite3_value_bytes(value))};
 }
 
 void SortKeyOf(sqlite3_context* context, int, sqlite3_value** arguments)

@@ -2,46 +2,42 @@
 
 #include <QStringList>
 
+#include <algorithm>
 #include <cstdint>
 #include <cstring>
 
 namespace mirel::sqlite {
 namespace {
 
-constexpr uint64_t kEachByte = 0x0101010101010101;
-constexpr uint64_t kTopBits = 0x80 * kEachByte;
-
-// Eight ASCII bytes in small letters at once: adding carries into the top bit of those at or behind "A", and of
-// those behind "Z".
-constexpr uint64_t LowerEight(uint64_t bytes)
+bool IsAscii(std::string_view text)
 {
-    const uint64_t fromA = bytes + (0x80 - 'A') * kEachByte;
-    const uint64_t behindZ = bytes + (0x7F - 'Z') * kEachByte;
-    return bytes | (((fromA ^ behindZ) & kTopBits) >> 2);
-}
-static_assert(LowerEight(0x405A415B7A617B30) == 0x407A615B7A617B30);
-
-// Puts `text` into `lower` in small letters; false when it is not ASCII.
-bool LowerAscii(std::string_view text, std::string& lower)
-{
-    lower.resize(text.size());
+    uint64_t all = 0;
     size_t at = 0;
     for (; at + 8 <= text.size(); at += 8) {
         uint64_t bytes = 0;
         std::memcpy(&bytes, text.data() + at, 8);
-        if (bytes & kTopBits)
-            return false;
-        bytes = LowerEight(bytes);
-        std::memcpy(lower.data() + at, &bytes, 8);
+        all |= bytes;
     }
     uint64_t rest = 0;
-    const size_t left = text.size() - at;
-    std::memcpy(&rest, text.data() + at, left);
-    if (rest & kTopBits)
-        return false;
-    rest = LowerEight(rest);
-    std::memcpy(lower.data() + at, &rest, left);
-    return true;
+    std::memcpy(&rest, text.data() + at, text.size() - at);
+    return ((all | rest) & 0x8080808080808080) == 0;
+}
+
+constexpr bool IsSmall(char unit)
+{
+    return unit >= 'a' && unit <= 'z';
+}
+
+constexpr char Small(char unit)
+{
+    return unit >= 'A' && unit <= 'Z' ? char(unit + ('a' - 'A')) : unit;
+}
+
+// Whether `text` begins with `part`, which is in small letters.
+bool StartsWith(std::string_view text, const std::string& part)
+{
+    return text.size() >= part.size() &&
+           std::equal(part.begin(), part.end(), text.begin(), [](char a, char b) { return a == Small(b); });
 }
 
 // Letters that texts are full of come last; what is not listed is rarer than all of them.
@@ -62,17 +58,49 @@ size_t RarestByte(const std::string& part)
     return rarest;
 }
 
+// Meets every place where a byte stands in either case, from the first on.
+class BothCases {
+public:
+    BothCases(std::string_view text, char small)
+        : text_(text)
+        , small_(small)
+        , capital_(IsSmall(small) ? char(small - ('a' - 'A')) : small)
+        , nextSmall_(Next(small_, 0))
+        , nextCapital_(capital_ == small_ ? text_.size() : Next(capital_, 0))
+    {
+    }
+
+    // The size of the text when there is no further one.
+    size_t Place() const { return std::min(nextSmall_, nextCapital_); }
+    void Advance()
+    {
+        if (nextSmall_ < nextCapital_)
+            nextSmall_ = Next(small_, nextSmall_ + 1);
+        else
+            nextCapital_ = Next(capital_, nextCapital_ + 1);
+    }
+
+private:
+    size_t Next(char unit, size_t from) const
+    {
+        const void* hit = std::memchr(text_.data() + from, unit, text_.size() - from);
+        return hit ? size_t(static_cast<const char*>(hit) - text_.data()) : text_.size();
+    }
+
+    std::string_view text_;
+    char small_;
+    char capital_;
+    size_t nextSmall_;
+    size_t nextCapital_;
+};
+
 qsizetype FindShort(std::string_view text, const std::string& part)
 {
     const size_t anchor = RarestByte(part);
-    for (size_t from = anchor; text.size() - from >= part.size() - anchor;) {
-        const void* hit = std::memchr(text.data() + from, part[anchor], text.size() - from);
-        if (!hit)
-            return -1;
-        const size_t at = size_t(static_cast<const char*>(hit) - text.data()) - anchor;
-        if (text.substr(at, part.size()) == part)
-            return qsizetype(at);
-        from = at + anchor + 1;
+    for (BothCases places(text.substr(anchor), part[anchor]); places.Place() + anchor < text.size();
+         places.Advance()) {
+        if (StartsWith(text.substr(places.Place()), part))
+            return qsizetype(places.Place());
     }
     return -1;
 }
@@ -86,8 +114,10 @@ qsizetype Find(std::string_view text, const std::string& part)
         return 0;
     if (part.size() <= kShort)
         return FindShort(text, part);
-    const void* found = memmem(text.data(), text.size(), part.data(), part.size());
-    return found ? static_cast<const char*>(found) - text.data() : -1;
+    std::string small(text);
+    std::ranges::transform(small, small.begin(), Small);
+    const void* found = memmem(small.data(), small.size(), part.data(), part.size());
+    return found ? static_cast<const char*>(found) - small.data() : -1;
 }
 
 qsizetype Find(QStringView text, const QString& part)
@@ -103,11 +133,6 @@ std::string_view From(std::string_view text, qsizetype start)
 QStringView From(QStringView text, qsizetype start)
 {
     return text.mid(start);
-}
-
-bool StartsWith(std::string_view text, std::string_view part)
-{
-    return text.starts_with(part);
 }
 
 bool StartsWith(QStringView text, const QString& part)
@@ -131,27 +156,25 @@ bool MatchesParts(View text, const std::vector<Part>& parts)
         text = From(text, at + qsizetype(parts[i].size()));
     }
     const Part& last = parts.back();
-    return text.size() >= last.size() && From(text, qsizetype(text.size() - last.size())) == last;
+    return text.size() >= last.size() && StartsWith(From(text, qsizetype(text.size() - last.size())), last);
 }
 
 } // namespace
 
 LikePattern::LikePattern(std::string_view utf8)
 {
-    std::string lower;
-    const bool isAscii = LowerAscii(utf8, lower);
     const QString pattern = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
     for (const QString& part : pattern.split(u'%')) {
         folded_.push_back(part);
-        if (isAscii)
+        if (IsAscii(utf8))
             ascii_.push_back(part.toStdString());
     }
 }
 
-bool LikePattern::Matches(std::string_view utf8)
+bool LikePattern::Matches(std::string_view utf8) const
 {
-    if (!ascii_.empty() && LowerAscii(utf8, lower_))
-        return MatchesParts(std::string_view(lower_), ascii_);
+    if (!ascii_.empty() && IsAscii(utf8))
+        return MatchesParts(utf8, ascii_);
     const QString folded = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
     return MatchesParts(QStringView(folded), folded_);
 }

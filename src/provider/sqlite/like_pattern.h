@@ -14,13 +14,12 @@ class LikePattern {
 public:
     explicit LikePattern(std::string_view utf8);
 
-    bool Matches(std::string_view utf8);
+    bool Matches(std::string_view utf8) const;
 
 private:
     // Its parts between the wildcards, in small letters. Most texts are ASCII and are compared as bytes.
     std::vector<std::string> ascii_; // empty when a part is not ASCII
     std::vector<QString> folded_;
-    std::string lower_; // the text at hand
 };
 
 } // namespace mirel::sqlite

@@ -10,12 +10,8 @@ namespace {
 
 std::string_view TextAt(sqlite3_stmt* row, int column)
 {
-    const bool isUtf8 = sqlite3_value_encoding(sqlite3_column_value(row, column)) == SQLITE_UTF8;
-    // As bytes: asked for a text, the library would copy each one to put a NUL behind it.
-    const void* text = isUtf8 && sqlite3_column_type(row, column) == SQLITE_TEXT
-                           ? sqlite3_column_blob(row, column)
-                           : sqlite3_column_text(row, column);
-    return {text ? static_cast<const char*>(text) : "", size_t(sqlite3_column_bytes(row, column))};
+    const auto* text = reinterpret_cast<const char*>(sqlite3_column_text(row, column));
+    return {text ? text : "", size_t(sqlite3_column_bytes(row, column))};
 }
 
 Cell BinaryAt(sqlite3_stmt* row, int column)
