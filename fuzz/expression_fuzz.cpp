@@ -1,6 +1,7 @@
 // Parses any text in both modes and evaluates it twice against a record made of the same bytes: evaluating again
-// must give the same.
+// must give the same, and explanations must name a place in the text.
 #include "expr/evaluator.h"
+#include "expr/explain.h"
 #include "expr/expr_parser.h"
 
 #include <QStringList>
@@ -146,6 +147,10 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size)
         DumpExpression(tree.get(), dump);
         if (tree && Run(*tree, record) != Run(*tree, record))
             __builtin_trap();
+        for (const ExprSlip& slip : ExplainExpression(text, mode, record)) {
+            if (slip.position < 1 || slip.position > text.size() + 1)
+                __builtin_trap();
+        }
     }
     return 0;
 }
