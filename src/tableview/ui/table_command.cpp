@@ -78,6 +78,17 @@ constexpr std::array kActions = {
               u"view-sort-ascending"},
     ActionRow{TableCommand::SortDescending, Str::ActionSortDescending, Str::ActionSortDescendingTip,
               u"view-sort-descending"},
+    ActionRow{TableCommand::FilterExpression, Str::ActionFilterExpression, Str::ActionFilterExpressionTip,
+              nullptr},
+    ActionRow{TableCommand::SortExpression, Str::ActionSortExpression, Str::ActionSortExpressionTip, nullptr},
+    ActionRow{TableCommand::EditAll, Str::ActionEditAll, Str::ActionEditAllTip, nullptr},
+    ActionRow{TableCommand::Aggregate, Str::ActionAggregate, Str::ActionAggregateTip, nullptr},
+    ActionRow{TableCommand::NewQuery, Str::ActionNewQuery, Str::ActionNewQueryTip, nullptr},
+    ActionRow{TableCommand::OpenQuery, Str::ActionOpenQuery, Str::ActionOpenQueryTip, nullptr},
+    ActionRow{TableCommand::SaveQuery, Str::ActionSaveQuery, Str::ActionSaveQueryTip, nullptr},
+    ActionRow{TableCommand::ExportCsv, Str::ActionExportCsv, Str::ActionExportCsvTip, nullptr},
+    ActionRow{TableCommand::Layout, Str::ActionLayout, Str::ActionLayoutTip, nullptr},
+    ActionRow{TableCommand::Help, Str::ActionHelp, Str::ActionHelpTip, nullptr},
     ActionRow{TableCommand::Copy, Str::ActionCopy, Str::ActionCopyTip, u"edit-copy"},
     ActionRow{TableCommand::Paste, Str::ActionPaste, Str::ActionPasteTip, u"edit-paste"},
     ActionRow{TableCommand::Options, Str::ActionOptions, Str::ActionOptionsTip, u"configure"},
@@ -87,20 +98,37 @@ constexpr std::array kActions = {
 
 constexpr MenuEntry kLine = std::nullopt;
 
-constexpr std::array<MenuEntry, 9> kFileMenu = {
-    TableCommand::InsertDateTime, TableCommand::RepeatAbove,   TableCommand::Zoom,    kLine,
-    TableCommand::RunAgain,       TableCommand::FitAllColumns, TableCommand::Options, kLine,
-    TableCommand::Close};
-constexpr std::array<MenuEntry, 12> kToolsMenu = {TableCommand::NewRecord,
+constexpr std::array<MenuEntry, 16> kFileMenu = {TableCommand::InsertDateTime,
+                                                 TableCommand::RepeatAbove,
+                                                 TableCommand::Zoom,
+                                                 kLine,
+                                                 TableCommand::NewQuery,
+                                                 TableCommand::OpenQuery,
+                                                 TableCommand::SaveQuery,
+                                                 TableCommand::ExportCsv,
+                                                 kLine,
+                                                 TableCommand::RunAgain,
+                                                 TableCommand::FitAllColumns,
+                                                 TableCommand::Options,
+                                                 TableCommand::Layout,
+                                                 TableCommand::Help,
+                                                 kLine,
+                                                 TableCommand::Close};
+constexpr std::array<MenuEntry, 17> kToolsMenu = {TableCommand::NewRecord,
                                                   TableCommand::DeleteRecord,
                                                   TableCommand::ToggleDetail,
                                                   kLine,
                                                   TableCommand::FilterBySelection,
                                                   TableCommand::FilterExcluding,
+                                                  TableCommand::FilterExpression,
                                                   TableCommand::RemoveFilter,
                                                   kLine,
                                                   TableCommand::SortAscending,
                                                   TableCommand::SortDescending,
+                                                  TableCommand::SortExpression,
+                                                  kLine,
+                                                  TableCommand::EditAll,
+                                                  TableCommand::Aggregate,
                                                   kLine,
                                                   TableCommand::GoToRecord};
 constexpr std::array<MenuEntry, 14> kPopupMenu = {TableCommand::FilterBySelection,
@@ -140,6 +168,11 @@ QKeyCombination ShortcutOf(TableCommand command)
 std::span<const ActionRow> ActionRows()
 {
     return kActions;
+}
+
+bool IsToCome(TableCommand command)
+{
+    return command >= TableCommand::FilterExpression && command <= TableCommand::Help;
 }
 
 std::span<const MenuEntry> FileMenu()

@@ -43,6 +43,17 @@ enum class TableCommand {
     RemoveFilter,
     SortAscending,
     SortDescending,
+    // Not built yet: their menu entries are there, disabled, and say what they will do.
+    FilterExpression,
+    SortExpression,
+    EditAll,
+    Aggregate,
+    NewQuery,
+    OpenQuery,
+    SaveQuery,
+    ExportCsv,
+    Layout,
+    Help,
     FitColumn,
     FitAllColumns,
     HideColumn,
@@ -68,6 +79,8 @@ struct ActionRow {
     const char16_t* icon;
 };
 std::span<const ActionRow> ActionRows();
+// The commands that are not built yet.
+bool IsToCome(TableCommand command);
 
 // The menus, in groups: an empty entry is a line between two.
 using MenuEntry = std::optional<TableCommand>;

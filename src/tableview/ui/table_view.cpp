@@ -114,6 +114,7 @@ void CTableView::CreateActions()
             const QString keyText = action->shortcut().toString(QKeySequence::NativeText);
             action->setToolTip(StringText(Str::TipWithKey, {action->toolTip(), keyText}));
         }
+        action->setEnabled(!IsToCome(row.command));
         connect(action, &QAction::triggered, this, [this, command = row.command] { Do(command); });
         addAction(action); // its key works although no menu may show it
         actions_.insert(row.command, action);
