@@ -190,7 +190,8 @@ QString SideFilePath(const QString& folder, const QString& stamp)
 QString FieldReference(QStringView name)
 {
     const bool asItStands = name.isEmpty() || name.startsWith(u'[') || name == u"*";
-    const bool plain = !name.isEmpty() && name.front().isLetter() && std::ranges::all_of(name, [](QChar each) {
+    const auto isLatinLetter = [](QChar each) { return each.unicode() < 0x80 && each.isLetter(); };
+    const bool plain = !name.isEmpty() && isLatinLetter(name.front()) && std::ranges::all_of(name, [](QChar each) {
         return each.isLetter() || each.isDigit() || each == u'_';
     });
     if (asItStands || (plain && !dialect::IsReservedWord(name)))

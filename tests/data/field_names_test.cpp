@@ -48,6 +48,7 @@ TEST(FieldReference, BracketsWhatCouldNotStandBare)
     } rows[] = {
         {"plain", u"Ship_Name2"_s, u"Ship_Name2"_s},
         {"letters of any language", u"Größe"_s, u"Größe"_s},
+        {"first letter beyond A to Z", u"Ärger"_s, u"[Ärger]"_s},
         {"blank", u"Ship Name"_s, u"[Ship Name]"_s},
         {"digit in front", u"2nd"_s, u"[2nd]"_s},
         {"underscore in front", u"_id"_s, u"[_id]"_s},
