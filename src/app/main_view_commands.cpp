@@ -1,6 +1,7 @@
 #include "app/main_view_commands.h"
 
 #include "app/shell_commands.h"
+#include "resources/string_table.h"
 
 #include <QFileInfo>
 

@@ -1,6 +1,7 @@
 #include "app/sample_database.h"
 
 #include "csvimport/csv_import.h"
+#include "resources/string_table.h"
 
 #include <QDir>
 #include <QFile>

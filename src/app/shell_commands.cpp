@@ -1,5 +1,7 @@
 #include "app/shell_commands.h"
 
+#include "resources/string_table.h"
+
 #include <algorithm>
 #include <array>
 

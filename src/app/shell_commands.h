@@ -1,7 +1,7 @@
 #pragma once
 
 #include "app/main_view_state.h"
-#include "resources/string_table.h"
+#include "resources/string_id.h"
 
 #include <span>
 

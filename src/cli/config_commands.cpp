@@ -1,5 +1,6 @@
 #include "cli/commands.h"
 #include "cli/run.h"
+#include "resources/string_table.h"
 
 namespace mirel::cli {
 namespace {

@@ -6,6 +6,7 @@
 #include "expr/explain.h"
 #include "expr/expr_parser.h"
 #include "forms/record_context.h"
+#include "resources/string_table.h"
 
 #include <QHash>
 

@@ -3,6 +3,7 @@
 #include "csvimport/csv_import.h"
 #include "csvimport/utf8_source.h"
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 
 #include <QFile>
 

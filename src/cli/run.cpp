@@ -1,5 +1,7 @@
 #include "cli/run.h"
 
+#include "resources/string_table.h"
+
 #include <QDir>
 #include <QFileInfo>
 #include <QJsonDocument>

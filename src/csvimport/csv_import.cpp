@@ -2,6 +2,7 @@
 
 #include "csvimport/type_guess.h"
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 

@@ -6,6 +6,7 @@
 #include "csvimport/import_column.h"
 #include "data/db_connection.h"
 #include "platform/user_prompt.h"
+#include "resources/string_table.h"
 
 #include <QIODevice>
 #include <QString>

@@ -1,6 +1,7 @@
 #include "csvimport/import_column.h"
 
 #include "data/field_names.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,7 @@
 #include "data/provider_error.h"
 
 #include "data/statement_text.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 #include <array>

@@ -2,6 +2,7 @@
 
 #include "expr/expr_parser.h"
 #include "expr/function_library.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 

@@ -2,7 +2,7 @@
 
 #include "expr/evaluator.h"
 #include "expr/expr_token.h"
-#include "resources/string_table.h"
+#include "resources/string_id.h"
 
 #include <QStringList>
 

@@ -1,7 +1,6 @@
 #pragma once
 
-#include <QString>
-#include <QStringList>
+#include "resources/string_id.h"
 
 namespace mirel {
 
@@ -13,8 +12,5 @@ enum class Str : int {
 #include "resources/strings.def"
 #undef MIREL_STRING
 };
-
-// The text with %1, %2, … replaced by `arguments`, all at once: an argument that holds "%2" stays as it is.
-QString StringText(Str id, const QStringList& arguments = {});
 
 } // namespace mirel

@@ -2,6 +2,7 @@
 
 #include "data/field_names.h"
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 
 namespace mirel {
 namespace {

@@ -4,6 +4,7 @@
 #include "data/provider_error.h"
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
+#include "resources/string_table.h"
 #include "tableview/cell_text.h"
 
 #include <QDateTime>

@@ -1,6 +1,7 @@
 #include "app/main_view_state.h"
 #include "app/shell_commands.h"
 
+#include "resources/string_table.h"
 #include "support/printing.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
 #include "csvimport/import_column.h"
 #include "csvimport/type_guess.h"
+#include "resources/string_table.h"
 #include "support/printing.h"
 
 #include <gtest/gtest.h>

@@ -1,4 +1,6 @@
 #include "data/provider_error.h"
+
+#include "resources/string_table.h"
 #include "support/test_database.h"
 
 namespace mirel {

@@ -1,5 +1,6 @@
 // Every result code that a database can raise, raised by one, with the words that people then read.
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 #include "support/small_disk.h"
 #include "support/sqlite_file.h"
 #include "support/test_database.h"

@@ -1,6 +1,7 @@
 #include "expr/explain.h"
 
 #include "expr/fake_record.h"
+#include "resources/string_table.h"
 #include "support/printing.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
 #include "tableview/ui/table_view.h"
 
+#include "resources/string_table.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"

@@ -4,6 +4,7 @@
 #include "app/ui/elided_label.h"
 #include "app/ui/entry_list.h"
 #include "app/ui/window_place.h"
+#include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
 #include <QDialog>

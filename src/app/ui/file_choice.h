@@ -1,6 +1,6 @@
 #pragma once
 
-#include "resources/string_table.h"
+#include "resources/string_id.h"
 
 #include <QString>
 

@@ -7,6 +7,7 @@
 #include "app/ui/lumo_view.h"
 #include "app/ui/shell_actions.h"
 #include "app/ui/window_place.h"
+#include "resources/string_table.h"
 #include "tableview/ui/table_view.h"
 
 #include <QApplication>

@@ -1,5 +1,7 @@
 #include "app/ui/message_box_prompt.h"
 
+#include "resources/string_table.h"
+
 #include <QApplication>
 #include <QElapsedTimer>
 #include <QInputDialog>

@@ -1,5 +1,6 @@
 #include "app/ui/shell_actions.h"
 
+#include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
 namespace mirel {

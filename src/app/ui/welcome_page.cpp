@@ -1,6 +1,7 @@
 #include "app/ui/welcome_page.h"
 
 #include "app/ui/entry_list.h"
+#include "resources/string_table.h"
 
 #include <QDir>
 #include <QFileInfo>

@@ -2,6 +2,7 @@
 
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
+#include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
 #include <QAction>

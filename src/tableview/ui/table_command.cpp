@@ -1,5 +1,7 @@
 #include "tableview/ui/table_command.h"
 
+#include "resources/string_table.h"
+
 #include <algorithm>
 #include <array>
 

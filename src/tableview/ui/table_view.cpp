@@ -1,5 +1,6 @@
 #include "tableview/ui/table_view.h"
 
+#include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"
@@ -112,7 +113,7 @@ void CTableView::CreateActions()
         if (const QKeyCombination keys = ShortcutOf(row.command); keys.toCombined() != 0) {
             action->setShortcut(keys);
             const QString keyText = action->shortcut().toString(QKeySequence::NativeText);
-            action->setToolTip(StringText(Str::TipWithKey, {action->toolTip(), keyText}));
+            action->setToolTip(StringText(Str::TipWithKeys, {action->toolTip(), keyText}));
         }
         action->setEnabled(!IsToCome(row.command));
         connect(action, &QAction::triggered, this, [this, command = row.command] { Do(command); });
