@@ -1,77 +1,27 @@
 #include "tableview/ui/table_view.h"
 
 #include "resources/string_table.h"
-#include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"
-#include "tableview/ui/go_to_dialog.h"
 #include "tableview/ui/navigation_row.h"
-#include "tableview/ui/options_dialog.h"
 #include "tableview/ui/record_grid.h"
 
-#include <QAction>
 #include <QApplication>
-#include <QClipboard>
 #include <QCloseEvent>
 #include <QKeyEvent>
-#include <QMenu>
-#include <QMenuBar>
 #include <QPlainTextEdit>
 #include <QStackedWidget>
 #include <QVBoxLayout>
 
-#include <algorithm>
-#include <array>
-
 namespace mirel {
 namespace {
-
-using Command = TableCommand;
 
 constexpr int kCountSliceMs = 8;
 constexpr int kWriteErrorDelayMs = 1;
 
-// What the browser does by itself.
-struct BrowserCall {
-    Command command;
-    bool (*call)(RecordBrowser&);
-};
-constexpr std::array kBrowserCalls = {
-    BrowserCall{Command::First, [](RecordBrowser& b) { return b.GoToFirst(); }},
-    BrowserCall{Command::Previous, [](RecordBrowser& b) { return b.GoToPrevious(); }},
-    BrowserCall{Command::Next, [](RecordBrowser& b) { return b.GoToNext(); }},
-    BrowserCall{Command::Last, [](RecordBrowser& b) { return b.GoToLast(); }},
-    BrowserCall{Command::RowUp, [](RecordBrowser& b) { return b.MoveRows(-1); }},
-    BrowserCall{Command::RowDown, [](RecordBrowser& b) { return b.MoveRows(1); }},
-    BrowserCall{Command::PageUp, [](RecordBrowser& b) { return b.PageUp(); }},
-    BrowserCall{Command::PageDown, [](RecordBrowser& b) { return b.PageDown(); }},
-    BrowserCall{Command::ColumnLeft, [](RecordBrowser& b) { return b.MoveColumns(-1); }},
-    BrowserCall{Command::ColumnRight, [](RecordBrowser& b) { return b.MoveColumns(1); }},
-    BrowserCall{Command::FirstColumn, [](RecordBrowser& b) { return b.MoveToFirstColumn(); }},
-    BrowserCall{Command::LastColumn, [](RecordBrowser& b) { return b.MoveToLastColumn(); }},
-    BrowserCall{Command::NextCell, [](RecordBrowser& b) { return b.MoveToNextCell(); }},
-    BrowserCall{Command::PreviousCell, [](RecordBrowser& b) { return b.MoveToPreviousCell(); }},
-    BrowserCall{Command::ClearCell, [](RecordBrowser& b) { return b.ClearCell(), true; }},
-    BrowserCall{Command::RepeatAbove, [](RecordBrowser& b) { return b.RepeatAbove(), true; }},
-    BrowserCall{Command::InsertDateTime, [](RecordBrowser& b) { return b.InsertCurrentDateTime(), true; }},
-    BrowserCall{Command::NewRecord, [](RecordBrowser& b) { return b.AddRecord(); }},
-    BrowserCall{Command::DeleteRecord, [](RecordBrowser& b) { return b.DeleteRecord(); }},
-    BrowserCall{Command::ToggleDetail, [](RecordBrowser& b) { return b.TogglePresentation(); }},
-    BrowserCall{Command::RunAgain, [](RecordBrowser& b) { return b.RunAgain(); }},
-    BrowserCall{Command::FilterBySelection,
-                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::BySelection); }},
-    BrowserCall{Command::FilterExcluding,
-                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::ExcludingSelection); }},
-    BrowserCall{Command::RemoveFilter, [](RecordBrowser& b) { return b.RemoveFilter(); }},
-    BrowserCall{Command::SortAscending,
-                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Ascending); }},
-    BrowserCall{Command::SortDescending,
-                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Descending); }},
-    BrowserCall{Command::HideColumn, [](RecordBrowser& b) { return b.HideColumn(); }},
-    BrowserCall{Command::ShowAllColumns, [](RecordBrowser& b) { return b.ShowAllColumns(); }},
-};
-
 } // namespace
+
+using Command = TableCommand;
 
 CTableView::CTableView(DbConnection& connection, const QString& database, UserPrompt& prompt,
                        const TableViewSettings& settings, QWidget* parent)
@@ -102,42 +52,6 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
 }
 
 CTableView::~CTableView() = default;
-
-void CTableView::CreateActions()
-{
-    for (const ActionRow& row : ActionRows()) {
-        auto* action = new QAction(StringText(row.text), this);
-        action->setToolTip(StringText(row.tip));
-        if (row.icon)
-            action->setIcon(ThemeIcon(row.icon));
-        if (const QKeyCombination keys = ShortcutOf(row.command); keys.toCombined() != 0) {
-            action->setShortcut(keys);
-            const QString keyText = action->shortcut().toString(QKeySequence::NativeText);
-            action->setToolTip(StringText(Str::TipWithKeys, {action->toolTip(), keyText}));
-        }
-        action->setEnabled(!IsToCome(row.command));
-        connect(action, &QAction::triggered, this, [this, command = row.command] { Do(command); });
-        addAction(action); // its key works although no menu may show it
-        actions_.insert(row.command, action);
-    }
-}
-
-void CTableView::CreateMenus()
-{
-    FillMenu(menuBar()->addMenu(StringText(Str::MenuFile)), FileMenu());
-    FillMenu(menuBar()->addMenu(StringText(Str::MenuTools)), ToolsMenu());
-}
-
-void CTableView::FillMenu(QMenu* menu, std::span<const MenuEntry> entries)
-{
-    menu->setToolTipsVisible(true);
-    for (const MenuEntry entry : entries) {
-        if (entry)
-            menu->addAction(ActionOf(*entry));
-        else
-            menu->addSeparator();
-    }
-}
 
 void CTableView::LayOut()
 {
@@ -268,172 +182,6 @@ void CTableView::ShowZoom()
         zoomEdit_->setPlainText(browser_.Edit().Text());
     if (moved)
         zoomEdit_->setFocus();
-}
-
-void CTableView::ShowActions()
-{
-    const bool hasRecord = browser_.SelectedRecord() >= 0;
-    for (const TableCommand command :
-         {Command::First, Command::Previous, Command::Next, Command::Last, Command::GoToRecord, Command::Copy,
-          Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection, Command::FilterExcluding,
-          Command::SortAscending, Command::SortDescending})
-        ActionOf(command)->setEnabled(hasRecord);
-    ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
-    for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove, Command::Paste})
-        ActionOf(command)->setEnabled(browser_.CanEdit());
-    ActionOf(Command::NewRecord)->setEnabled(browser_.CanUpdate());
-    ActionOf(Command::DeleteRecord)->setEnabled(hasRecord && browser_.CanUpdate());
-    ActionOf(Command::HideColumn)->setEnabled(browser_.CanHideColumn());
-    ActionOf(Command::ShowAllColumns)->setEnabled(browser_.CanShowAllColumns());
-    ActionOf(Command::Zoom)->setEnabled(zoomed_ || browser_.Edit().Kind() == EditorKind::Text);
-    ActionOf(Command::Zoom)->setText(StringText(zoomed_ ? Str::ZoomBack : Str::ZoomIn));
-
-    const bool list = browser_.CurrentPresentation() == Presentation::List;
-    QAction* detail = ActionOf(Command::ToggleDetail);
-    detail->setEnabled(browser_.IsOpen());
-    detail->setText(StringText(list ? Str::ActionDetail : Str::ActionList));
-    detail->setIcon(ThemeIcon(list ? u"view-list-details" : u"view-list-text"));
-}
-
-// --- commands -----------------------------------------------------------------------------------------------
-
-void CTableView::Do(TableCommand command)
-{
-    const auto row = std::ranges::find(kBrowserCalls, command, &BrowserCall::command);
-    if (row != kBrowserCalls.end()) {
-        const bool fromEditor = strip_->HasEditorFocus();
-        const bool isEdit = command == Command::RepeatAbove || command == Command::InsertDateTime;
-        if (Run(row->call) && fromEditor && !isEdit)
-            grid_->setFocus();
-        return;
-    }
-    switch (command) {
-    case Command::EditCell:
-        return Edit(nullptr);
-    case Command::RevertEdit:
-        return Revert();
-    case Command::Zoom:
-        return ToggleZoom();
-    case Command::GoToRecord:
-        return GoTo();
-    case Command::Copy:
-        return Copy();
-    case Command::Paste:
-        return Paste();
-    case Command::FitColumn:
-        return grid_->FitColumn(browser_.SelectedColumn());
-    case Command::FitAllColumns:
-        return grid_->FitAllColumns();
-    case Command::NextPane:
-        return FocusNextPane();
-    case Command::Options:
-        return ChooseOptions();
-    case Command::Close:
-        close();
-        return;
-    default: // the rest is the browser's, above
-        return;
-    }
-}
-
-void CTableView::Edit(const QString* typed)
-{
-    if (stack_->currentWidget() == zoomEdit_) {
-        zoomEdit_->setFocus();
-        return;
-    }
-    const bool isCheck = browser_.Edit().Kind() == EditorKind::Check;
-    if (!typed) {
-        strip_->BeginEdit();
-    } else if (isCheck && *typed == u" ") {
-        browser_.EditChecked(!browser_.Edit().IsChecked());
-        ShowState();
-    } else if (!isCheck && browser_.CanEdit()) {
-        strip_->BeginTyping(*typed);
-    }
-}
-
-void CTableView::Revert()
-{
-    browser_.RevertEdit();
-    ShowState();
-    if (stack_->currentWidget() == zoomEdit_)
-        zoomEdit_->setPlainText(browser_.Edit().Text());
-    else
-        grid_->setFocus();
-}
-
-void CTableView::Copy()
-{
-    QGuiApplication::clipboard()->setText(browser_.SelectedText());
-}
-
-void CTableView::Paste()
-{
-    QString text = QGuiApplication::clipboard()->text();
-    if (text.endsWith(u'\n')) // a cell copied elsewhere comes as a line
-        text.chop(1);
-    browser_.EditText(text);
-    ShowState();
-}
-
-void CTableView::GoTo()
-{
-    if (!Settle(browser_.WriteEdit()))
-        return;
-    CGoToDialog dialog(browser_.SelectedRecord() + 1, this);
-    if (dialog.exec() != QDialog::Accepted)
-        return;
-    switch (dialog.Chosen()) {
-    case CGoToDialog::Choice::Record:
-        Settle(browser_.GoToRecord(dialog.Number()));
-        return;
-    case CGoToDialog::Choice::First:
-        return Do(Command::First);
-    case CGoToDialog::Choice::Last:
-        return Do(Command::Last);
-    case CGoToDialog::Choice::Previous:
-        return Do(Command::Previous);
-    case CGoToDialog::Choice::Next:
-        return Do(Command::Next);
-    }
-}
-
-void CTableView::ChooseOptions()
-{
-    if (!Settle(browser_.WriteEdit()))
-        return;
-    COptionsDialog dialog(browser_.Settings(), this);
-    if (dialog.exec() != QDialog::Accepted)
-        return;
-    Settle(browser_.ChangeSettings(dialog.Chosen()));
-    Q_EMIT settingsChanged(browser_.Settings());
-}
-
-void CTableView::FocusNextPane()
-{
-    if (grid_->hasFocus())
-        strip_->BeginEdit();
-    else if (strip_->HasEditorFocus())
-        navigation_->focusWidget() ? navigation_->focusWidget()->setFocus() : navigation_->setFocus();
-    else
-        stack_->currentWidget()->setFocus();
-}
-
-void CTableView::ToggleZoom()
-{
-    zoomed_ = !zoomed_;
-    ShowState();
-    stack_->currentWidget()->setFocus();
-}
-
-void CTableView::ShowPopup(const QPoint& globalPosition)
-{
-    if (!Settle(browser_.WriteEdit()))
-        return;
-    QMenu popup(this);
-    FillMenu(&popup, PopupMenu());
-    popup.exec(globalPosition);
 }
 
 void CTableView::closeEvent(QCloseEvent* event)

@@ -1,0 +1,172 @@
+#include "resources/string_table.h"
+#include "resources/ui/theme_icon.h"
+#include "tableview/ui/cell_strip.h"
+#include "tableview/ui/record_grid.h"
+#include "tableview/ui/table_view.h"
+
+#include <QAction>
+#include <QMenu>
+#include <QMenuBar>
+
+#include <algorithm>
+#include <array>
+
+// The commands of the table view: their actions and menus, when each can be given, and what carries it out.
+
+namespace mirel {
+namespace {
+
+using Command = TableCommand;
+
+// What the browser does by itself.
+struct BrowserCall {
+    Command command;
+    bool (*call)(RecordBrowser&);
+};
+constexpr std::array kBrowserCalls = {
+    BrowserCall{Command::First, [](RecordBrowser& b) { return b.GoToFirst(); }},
+    BrowserCall{Command::Previous, [](RecordBrowser& b) { return b.GoToPrevious(); }},
+    BrowserCall{Command::Next, [](RecordBrowser& b) { return b.GoToNext(); }},
+    BrowserCall{Command::Last, [](RecordBrowser& b) { return b.GoToLast(); }},
+    BrowserCall{Command::RowUp, [](RecordBrowser& b) { return b.MoveRows(-1); }},
+    BrowserCall{Command::RowDown, [](RecordBrowser& b) { return b.MoveRows(1); }},
+    BrowserCall{Command::PageUp, [](RecordBrowser& b) { return b.PageUp(); }},
+    BrowserCall{Command::PageDown, [](RecordBrowser& b) { return b.PageDown(); }},
+    BrowserCall{Command::ColumnLeft, [](RecordBrowser& b) { return b.MoveColumns(-1); }},
+    BrowserCall{Command::ColumnRight, [](RecordBrowser& b) { return b.MoveColumns(1); }},
+    BrowserCall{Command::FirstColumn, [](RecordBrowser& b) { return b.MoveToFirstColumn(); }},
+    BrowserCall{Command::LastColumn, [](RecordBrowser& b) { return b.MoveToLastColumn(); }},
+    BrowserCall{Command::NextCell, [](RecordBrowser& b) { return b.MoveToNextCell(); }},
+    BrowserCall{Command::PreviousCell, [](RecordBrowser& b) { return b.MoveToPreviousCell(); }},
+    BrowserCall{Command::ClearCell, [](RecordBrowser& b) { return b.ClearCell(), true; }},
+    BrowserCall{Command::RepeatAbove, [](RecordBrowser& b) { return b.RepeatAbove(), true; }},
+    BrowserCall{Command::InsertDateTime, [](RecordBrowser& b) { return b.InsertCurrentDateTime(), true; }},
+    BrowserCall{Command::NewRecord, [](RecordBrowser& b) { return b.AddRecord(); }},
+    BrowserCall{Command::DeleteRecord, [](RecordBrowser& b) { return b.DeleteRecord(); }},
+    BrowserCall{Command::ToggleDetail, [](RecordBrowser& b) { return b.TogglePresentation(); }},
+    BrowserCall{Command::RunAgain, [](RecordBrowser& b) { return b.RunAgain(); }},
+    BrowserCall{Command::FilterBySelection,
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::BySelection); }},
+    BrowserCall{Command::FilterExcluding,
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::ExcludingSelection); }},
+    BrowserCall{Command::RemoveFilter, [](RecordBrowser& b) { return b.RemoveFilter(); }},
+    BrowserCall{Command::SortAscending,
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Ascending); }},
+    BrowserCall{Command::SortDescending,
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Descending); }},
+    BrowserCall{Command::HideColumn, [](RecordBrowser& b) { return b.HideColumn(); }},
+    BrowserCall{Command::ShowAllColumns, [](RecordBrowser& b) { return b.ShowAllColumns(); }},
+};
+
+} // namespace
+
+void CTableView::CreateActions()
+{
+    for (const ActionRow& row : ActionRows()) {
+        auto* action = new QAction(StringText(row.text), this);
+        action->setToolTip(StringText(row.tip));
+        if (row.icon)
+            action->setIcon(ThemeIcon(row.icon));
+        if (const QKeyCombination keys = ShortcutOf(row.command); keys.toCombined() != 0) {
+            action->setShortcut(keys);
+            const QString keyText = action->shortcut().toString(QKeySequence::NativeText);
+            action->setToolTip(StringText(Str::TipWithKeys, {action->toolTip(), keyText}));
+        }
+        action->setEnabled(!IsToCome(row.command));
+        connect(action, &QAction::triggered, this, [this, command = row.command] { Do(command); });
+        addAction(action); // its key works although no menu may show it
+        actions_.insert(row.command, action);
+    }
+}
+
+void CTableView::CreateMenus()
+{
+    FillMenu(menuBar()->addMenu(StringText(Str::MenuFile)), FileMenu());
+    FillMenu(menuBar()->addMenu(StringText(Str::MenuTools)), ToolsMenu());
+}
+
+void CTableView::FillMenu(QMenu* menu, std::span<const MenuEntry> entries)
+{
+    menu->setToolTipsVisible(true);
+    for (const MenuEntry entry : entries) {
+        if (entry)
+            menu->addAction(ActionOf(*entry));
+        else
+            menu->addSeparator();
+    }
+}
+
+void CTableView::ShowPopup(const QPoint& globalPosition)
+{
+    if (!Settle(browser_.WriteEdit()))
+        return;
+    QMenu popup(this);
+    FillMenu(&popup, PopupMenu());
+    popup.exec(globalPosition);
+}
+
+void CTableView::ShowActions()
+{
+    const bool hasRecord = browser_.SelectedRecord() >= 0;
+    for (const TableCommand command :
+         {Command::First, Command::Previous, Command::Next, Command::Last, Command::GoToRecord, Command::Copy,
+          Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection, Command::FilterExcluding,
+          Command::SortAscending, Command::SortDescending})
+        ActionOf(command)->setEnabled(hasRecord);
+    ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
+    for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove, Command::Paste})
+        ActionOf(command)->setEnabled(browser_.CanEdit());
+    ActionOf(Command::NewRecord)->setEnabled(browser_.CanUpdate());
+    ActionOf(Command::DeleteRecord)->setEnabled(hasRecord && browser_.CanUpdate());
+    ActionOf(Command::HideColumn)->setEnabled(browser_.CanHideColumn());
+    ActionOf(Command::ShowAllColumns)->setEnabled(browser_.CanShowAllColumns());
+    ActionOf(Command::Zoom)->setEnabled(zoomed_ || browser_.Edit().Kind() == EditorKind::Text);
+    ActionOf(Command::Zoom)->setText(StringText(zoomed_ ? Str::ZoomBack : Str::ZoomIn));
+
+    const bool list = browser_.CurrentPresentation() == Presentation::List;
+    QAction* detail = ActionOf(Command::ToggleDetail);
+    detail->setEnabled(browser_.IsOpen());
+    detail->setText(StringText(list ? Str::ActionDetail : Str::ActionList));
+    detail->setIcon(ThemeIcon(list ? u"view-list-details" : u"view-list-text"));
+}
+
+void CTableView::Do(TableCommand command)
+{
+    const auto row = std::ranges::find(kBrowserCalls, command, &BrowserCall::command);
+    if (row != kBrowserCalls.end()) {
+        const bool fromEditor = strip_->HasEditorFocus();
+        const bool isEdit = command == Command::RepeatAbove || command == Command::InsertDateTime;
+        if (Run(row->call) && fromEditor && !isEdit)
+            grid_->setFocus();
+        return;
+    }
+    switch (command) {
+    case Command::EditCell:
+        return Edit(nullptr);
+    case Command::RevertEdit:
+        return Revert();
+    case Command::Zoom:
+        return ToggleZoom();
+    case Command::GoToRecord:
+        return GoTo();
+    case Command::Copy:
+        return Copy();
+    case Command::Paste:
+        return Paste();
+    case Command::FitColumn:
+        return grid_->FitColumn(browser_.SelectedColumn());
+    case Command::FitAllColumns:
+        return grid_->FitAllColumns();
+    case Command::NextPane:
+        return FocusNextPane();
+    case Command::Options:
+        return ChooseOptions();
+    case Command::Close:
+        close();
+        return;
+    default: // the rest is the browser's, above
+        return;
+    }
+}
+
+} // namespace mirel
