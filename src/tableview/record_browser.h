@@ -1,9 +1,9 @@
 #pragma once
 
 #include "data/db_recordset.h"
+#include "data/filter_condition.h"
 #include "platform/user_prompt.h"
 #include "tableview/cell_edit.h"
-#include "tableview/filter_condition.h"
 #include "tableview/record_page.h"
 #include "tableview/table_view_settings.h"
 

@@ -1,7 +1,7 @@
 #pragma once
 
+#include "data/filter_condition.h"
 #include "tableview/field_lists.h"
-#include "tableview/filter_condition.h"
 
 #include <QDialog>
 

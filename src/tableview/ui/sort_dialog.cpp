@@ -1,7 +1,7 @@
 #include "tableview/ui/sort_dialog.h"
 
+#include "data/filter_condition.h"
 #include "resources/string_table.h"
-#include "tableview/filter_condition.h"
 #include "tableview/ui/field_chooser.h"
 
 #include <QComboBox>

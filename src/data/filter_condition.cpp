@@ -1,4 +1,4 @@
-#include "tableview/filter_condition.h"
+#include "data/filter_condition.h"
 
 #include "data/catalog.h"
 
