@@ -125,6 +125,16 @@ qint64 DbRecordset::Position() const
     return open_ ? cursor_->Position() : -1;
 }
 
+std::optional<qint64> DbRecordset::RecordId() const
+{
+    return open_ ? cursor_->RecordId() : std::nullopt;
+}
+
+bool DbRecordset::MoveToRecord(qint64 id)
+{
+    return Keep(open_ ? cursor_->MoveToRecord(id) : Hr::NotOpen);
+}
+
 qint64 DbRecordset::RecordCount()
 {
     return open_ ? cursor_->RecordCount() : -1;

@@ -5,6 +5,7 @@
 #include <QString>
 
 #include <memory>
+#include <optional>
 #include <span>
 
 namespace mirel {
@@ -50,6 +51,10 @@ public:
     bool IsEof() const;
     bool IsBof() const;
     qint64 Position() const; // -1 at either end
+
+    // See ProviderRecordset: a record's number in its table, and the way back to it. False when it is not there.
+    std::optional<qint64> RecordId() const;
+    [[nodiscard]] bool MoveToRecord(qint64 id);
 
     qint64 RecordCount();         // finishes counting; -1 when not open or forward-only
     bool CountStep(int budgetMs); // true once the count is known

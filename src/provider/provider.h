@@ -9,6 +9,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -98,6 +99,14 @@ public:
     [[nodiscard]] virtual Hr MovePrevious() = 0;
     // To a position from 0. Past the last record it stands at the end, below 0 before the first; both are Ok.
     [[nodiscard]] virtual Hr MoveTo(qint64 position) = 0;
+
+    // The current record's number in the table that this result can change: the same in every result over that
+    // table, whatever its order, for as long as the record is there. None at either end, or where nothing can
+    // be changed.
+    virtual std::optional<qint64> RecordId() const = 0;
+    // To the record of that number. NoCurrentRecord, and nothing moved, when the result does not hold it, or draws
+    // on more than one table.
+    [[nodiscard]] virtual Hr MoveToRecord(qint64 id) = 0;
 
     // The current record's value. NoCurrentRecord at either end.
     [[nodiscard]] virtual Hr GetValue(int field, Value& value) = 0;

@@ -235,5 +235,32 @@ TEST_F(StaticCursor, EndsWithItsDatabase)
     EXPECT_EQ(Rows(u"SELECT N FROM T"_s).size(), 3) << "opened anew";
 }
 
+TEST_F(StaticCursor, FindsARecordByItsNumberInEveryOrder)
+{
+    Fill(kMany);
+    const auto table = Open(u"SELECT * FROM T"_s);
+    ASSERT_EQ(table->MoveTo(1234), Hr::Ok);
+    const std::optional<qint64> id = table->RecordId();
+    ASSERT_TRUE(id);
+    const auto sorted = Open(u"SELECT N FROM T WHERE Grp=1 ORDER BY N DESC"_s);
+    ASSERT_EQ(sorted->MoveToRecord(*id), Hr::Ok);
+    EXPECT_EQ(FieldOf(*sorted).ToInt(), 1234);
+    EXPECT_EQ(sorted->RecordId(), id);
+
+    const auto others = Open(u"SELECT N FROM T WHERE Grp=2"_s);
+    ASSERT_EQ(others->MoveTo(7), Hr::Ok);
+    EXPECT_EQ(others->MoveToRecord(*id), Hr::NoCurrentRecord);
+    EXPECT_EQ(others->Position(), 7) << "nothing moved";
+    Outside("DELETE FROM T WHERE N=1234");
+    for (const qint64 gone : {*id, 0LL, -1LL, kMany + 1})
+        EXPECT_EQ(table->MoveToRecord(gone), Hr::NoCurrentRecord) << gone;
+    EXPECT_EQ(table->MoveToRecord(*id + 1), Hr::Ok);
+    EXPECT_EQ(table->Position(), 1234);
+
+    const auto fixed = Open(u"SELECT DISTINCT Grp FROM T"_s);
+    EXPECT_FALSE(fixed->RecordId());
+    EXPECT_EQ(fixed->MoveToRecord(1), Hr::NoCurrentRecord);
+}
+
 } // namespace
 } // namespace mirel

@@ -187,6 +187,16 @@ Hr CedbRecordset::MoveTo(qint64 position)
     return OnCursor([position](ResultCursor& cursor) { return cursor.MoveTo(position); });
 }
 
+std::optional<qint64> CedbRecordset::RecordId() const
+{
+    return HasCursor() ? cursor_->RecordId() : std::nullopt;
+}
+
+Hr CedbRecordset::MoveToRecord(qint64 id)
+{
+    return OnCursor([id](ResultCursor& cursor) { return cursor.MoveToRecord(id); });
+}
+
 Hr CedbRecordset::GetValue(int field, Value& value)
 {
     if (HasCursor() && !IsField(field))

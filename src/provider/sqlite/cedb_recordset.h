@@ -41,6 +41,9 @@ public:
     Hr MovePrevious() override;
     Hr MoveTo(qint64 position) override;
 
+    std::optional<qint64> RecordId() const override;
+    Hr MoveToRecord(qint64 id) override;
+
     Hr GetValue(int field, Value& value) override;
     Hr Read(const ReadRange& range, const CellSink& sink) override;
 

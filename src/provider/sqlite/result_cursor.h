@@ -3,6 +3,7 @@
 #include "provider/provider.h"
 #include "provider/sqlite/outcome.h"
 
+#include <optional>
 #include <span>
 
 namespace mirel::sqlite {
@@ -30,6 +31,9 @@ public:
     virtual Outcome MoveNext() = 0;
     virtual Outcome MovePrevious() = 0;
     virtual Outcome MoveTo(qint64 position) = 0;
+
+    virtual std::optional<qint64> RecordId() const { return {}; }
+    virtual Outcome MoveToRecord(qint64) { return {Hr::NoCurrentRecord, {}}; }
 
     virtual Outcome GetValue(int field, Value& value) = 0;
     virtual Outcome Read(const ReadRange& range, const CellSink& sink) = 0;

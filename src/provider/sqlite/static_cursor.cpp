@@ -207,6 +207,30 @@ Outcome StaticCursor::MovePrevious()
     });
 }
 
+std::optional<qint64> StaticCursor::RecordId() const
+{
+    if (place_ != Place::On || !writer_ || key_[plan_.updatableSource] == kNoRow)
+        return {};
+    return key_[plan_.updatableSource];
+}
+
+Outcome StaticCursor::MoveToRecord(qint64 id)
+{
+    if (!writer_ || plan_.sources.size() != 1)
+        return {Hr::NoCurrentRecord, {}};
+    return InRead([this, id] {
+        qint64 position = -1;
+        Outcome outcome = TakeUpChanges();
+        if (outcome.Ok())
+            outcome = CountAll();
+        if (outcome.Ok())
+            outcome = rows_->PositionOf(RecordKey(1, id), position);
+        if (!outcome.Ok() || position < 0)
+            return outcome.Ok() ? Outcome{Hr::NoCurrentRecord, StringText(Str::RecordIsGone)} : outcome;
+        return Settle(position);
+    });
+}
+
 Outcome StaticCursor::LoadRecord()
 {
     const std::vector<int> fields = AllFields(plan_.fields);

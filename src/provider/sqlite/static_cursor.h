@@ -35,6 +35,9 @@ public:
     Outcome MovePrevious() override;
     Outcome MoveTo(qint64 position) override;
 
+    std::optional<qint64> RecordId() const override;
+    Outcome MoveToRecord(qint64 id) override;
+
     Outcome GetValue(int field, Value& value) override;
     Outcome Read(const ReadRange& range, const CellSink& sink) override;
 
