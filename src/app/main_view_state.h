@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/tap.h"
+
 #include <QString>
 
 #include <array>
@@ -32,8 +34,6 @@ struct DatabaseContents {
     std::vector<MainEntry> queries;
     std::vector<MainEntry> favorites; // `table` and `missing` are filled in by MainViewState
 };
-
-enum class Tap { Single, Double };
 
 // What the main view shows: four lists, the tab in front, what is selected on each, what is searched for. No
 // window and no database in sight; the view paints this and hands it the user's actions.

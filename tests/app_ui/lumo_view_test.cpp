@@ -1,8 +1,8 @@
 #include "app/ui/lumo_view.h"
 
 #include "app/ui/compact_tab_bar.h"
-#include "app/ui/entry_list.h"
 #include "app/ui/look.h"
+#include "platform/ui/entry_list.h"
 #include "support/printing.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 #include "app/ui/keys_dialog.h"
 
-#include "app/ui/window_place.h"
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
 #include <QAction>

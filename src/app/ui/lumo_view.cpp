@@ -1,9 +1,9 @@
 #include "app/ui/lumo_view.h"
 
 #include "app/ui/compact_tab_bar.h"
-#include "app/ui/elided_label.h"
-#include "app/ui/entry_list.h"
 #include "app/ui/welcome_page.h"
+#include "platform/ui/elided_label.h"
+#include "platform/ui/entry_list.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 

@@ -2,11 +2,11 @@
 
 #include "app/table_view_options.h"
 #include "app/ui/about_box.h"
-#include "app/ui/file_choice.h"
 #include "app/ui/keys_dialog.h"
 #include "app/ui/lumo_view.h"
 #include "app/ui/shell_actions.h"
-#include "app/ui/window_place.h"
+#include "platform/ui/file_choice.h"
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/table_view.h"
 
@@ -229,23 +229,33 @@ bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
     return QMainWindow::eventFilter(watched, event);
 }
 
+QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)
+{
+    return ChooseFile(*this, {.title = title,
+                              .accept = accept,
+                              .use = use,
+                              .kind = FileKind::Database(),
+                              .near = state_.DatabasePath(),
+                              .name = {}});
+}
+
 void CMainFrame::ChooseAndOpenDatabase()
 {
-    const QString path = ChooseDatabase(*this, Str::CommandOpenDatabase, FileUse::Open, state_.DatabasePath());
+    const QString path = ChooseDatabase(Str::CommandOpenDatabase, Str::CommandOpen, FileUse::Open);
     if (!path.isEmpty() && CloseTables())
         commands_.OpenDatabase(path);
 }
 
 void CMainFrame::ChooseAndCreateDatabase()
 {
-    const QString path = ChooseDatabase(*this, Str::CommandNewDatabase, FileUse::Create, state_.DatabasePath());
+    const QString path = ChooseDatabase(Str::CommandNewDatabase, Str::CommandNew, FileUse::Create);
     if (!path.isEmpty() && CloseTables())
         commands_.NewDatabase(path);
 }
 
 void CMainFrame::ChooseAndDeleteDatabase()
 {
-    const QString path = ChooseDatabase(*this, Str::CommandDeleteDatabase, FileUse::Delete, state_.DatabasePath());
+    const QString path = ChooseDatabase(Str::CommandDeleteDatabase, Str::CommandDelete, FileUse::Delete);
     if (!path.isEmpty() && CloseTables())
         commands_.DeleteDatabase(path);
 }

@@ -2,6 +2,7 @@
 
 #include "app/main_view_commands.h"
 #include "app/shell_commands.h"
+#include "platform/ui/file_choice.h"
 
 #include <QMainWindow>
 
@@ -40,6 +41,7 @@ private:
     void LeaveOutKeysWhenSmall(QMenu* menu);
     void FillRecentMenu();
     void Run(ShellCommand id);
+    QString ChooseDatabase(Str title, Str accept, FileUse use);
     void ChooseAndOpenDatabase();
     void ChooseAndCreateDatabase();
     void ChooseAndDeleteDatabase();

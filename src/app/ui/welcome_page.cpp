@@ -1,6 +1,6 @@
 #include "app/ui/welcome_page.h"
 
-#include "app/ui/entry_list.h"
+#include "platform/ui/entry_list.h"
 #include "resources/string_table.h"
 
 #include <QDir>

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 #include <vector>
 
@@ -16,9 +17,9 @@ public:
         friend bool operator==(const Entry&, const Entry&) = default;
     };
 
-    // Files are listed whose name ends in `ending` (".cdb"), in any case. A folder that is not there gives the
-    // nearest one above it.
-    FolderChoice(const QString& folder, QString ending);
+    // Files are listed whose name ends in one of `endings` (".cdb"), in any case. A folder that is not there gives
+    // the nearest one above it.
+    FolderChoice(const QString& folder, QStringList endings);
 
     QString Folder() const { return folder_; }
     std::vector<Entry> Entries() const; // folders first, each by name; hidden ones are left out
@@ -31,7 +32,7 @@ public:
 
 private:
     QString folder_;
-    QString ending_;
+    QStringList endings_;
 };
 
 } // namespace mirel

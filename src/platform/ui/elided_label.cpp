@@ -1,4 +1,4 @@
-#include "app/ui/elided_label.h"
+#include "platform/ui/elided_label.h"
 
 #include <QPaintEvent>
 #include <QPainter>

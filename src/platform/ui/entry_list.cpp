@@ -1,4 +1,4 @@
-#include "app/ui/entry_list.h"
+#include "platform/ui/entry_list.h"
 
 #include "resources/ui/theme_icon.h"
 

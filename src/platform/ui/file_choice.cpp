@@ -1,9 +1,9 @@
-#include "app/ui/file_choice.h"
+#include "platform/ui/file_choice.h"
 
-#include "app/folder_choice.h"
-#include "app/ui/elided_label.h"
-#include "app/ui/entry_list.h"
-#include "app/ui/window_place.h"
+#include "platform/folder_choice.h"
+#include "platform/ui/elided_label.h"
+#include "platform/ui/entry_list.h"
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
@@ -23,40 +23,34 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-QString AcceptText(FileUse use)
+QString WithoutMnemonic(Str text)
 {
-    switch (use) {
-    case FileUse::Open:
-        return StringText(Str::CommandOpen);
-    case FileUse::Create:
-        return StringText(Str::CommandNew);
-    case FileUse::Delete:
-        break;
-    }
-    return StringText(Str::CommandDelete);
+    return StringText(text).remove(u'&');
 }
 
 // The file dialog of a small screen: fills the window, one list, one line for the name.
 class CFileDialog : public QDialog {
 public:
-    CFileDialog(const FolderChoice& choice, FileUse use, QWidget* parent)
+    CFileDialog(const FolderChoice& choice, const FileRequest& request, QWidget* parent)
         : QDialog(parent)
         , choice_(choice)
-        , use_(use)
+        , use_(request.use)
+        , icon_(request.kind.icon)
         , up_(new QToolButton(this))
         , folder_(new ElidedLabel(this))
         , list_(new EntryList(this))
         , name_(new QLineEdit(this))
         , buttons_(new QDialogButtonBox(QDialogButtonBox::Cancel, this))
     {
-        accept_ = buttons_->addButton(AcceptText(use), QDialogButtonBox::AcceptRole);
+        accept_ = buttons_->addButton(StringText(request.accept), QDialogButtonBox::AcceptRole);
         up_->setIcon(ThemeIcon(u"go-up"));
         up_->setToolTip(StringText(Str::FolderUp));
         up_->setAccessibleName(StringText(Str::FolderUp));
         list_->setAccessibleName(StringText(Str::FolderContents));
         name_->setPlaceholderText(StringText(Str::FileName));
         name_->setAccessibleName(StringText(Str::FileName));
-        name_->setVisible(use == FileUse::Create);
+        name_->setVisible(use_ == FileUse::Create);
+        name_->setText(request.name);
         LayOut();
         Connect();
         ShowFolder();
@@ -119,7 +113,7 @@ private:
             lines.push_back({.name = entry.name,
                              .detail = {},
                              .toolTip = {},
-                             .icon = entry.folder ? QStringView(u"folder") : QStringView(u"mirel-database")});
+                             .icon = entry.folder ? QStringView(u"folder") : icon_});
         }
         list_->SetLines(std::move(lines));
         folder_->SetText(QDir::toNativeSeparators(choice_.Folder()));
@@ -132,6 +126,7 @@ private:
 
     FolderChoice choice_;
     FileUse use_;
+    QStringView icon_;
     std::vector<FolderChoice::Entry> entries_;
     QString path_;
     QToolButton* up_;
@@ -142,29 +137,37 @@ private:
     QPushButton* accept_;
 };
 
-QString ChooseOnSmallScreen(QWidget& parent, const QString& caption, FileUse use, const FolderChoice& choice)
+QString ChooseOnSmallScreen(QWidget& parent, const FileRequest& request, const FolderChoice& choice)
 {
-    CFileDialog dialog(choice, use, &parent);
-    dialog.setWindowTitle(caption);
+    CFileDialog dialog(choice, request, &parent);
+    dialog.setWindowTitle(WithoutMnemonic(request.title));
     dialog.resize(parent.size());
     return dialog.exec() == QDialog::Accepted ? dialog.Path() : QString();
 }
 
 } // namespace
 
-QString ChooseDatabase(QWidget& parent, Str title, FileUse use, const QString& near)
+FileKind FileKind::Database()
 {
-    const QString folder = near.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
-                                          : QFileInfo(near).path();
-    const FolderChoice choice(folder, u".cdb"_s);
-    const QString caption = StringText(title).remove(u'&');
+    return {Str::DatabaseFilter, {u".cdb"_s}, u"mirel-database"};
+}
+
+QString ChooseFile(QWidget& parent, const FileRequest& request)
+{
+    const QString folder = request.near.isEmpty()
+                               ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
+                               : QFileInfo(request.near).path();
+    const FolderChoice choice(folder, request.kind.endings);
     if (IsHandheldSize(parent.size()))
-        return ChooseOnSmallScreen(parent, caption, use, choice);
-    QFileDialog dialog(&parent, caption, choice.Folder(), StringText(Str::DatabaseFilter));
-    dialog.setAcceptMode(use == FileUse::Create ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
-    dialog.setFileMode(use == FileUse::Create ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
+        return ChooseOnSmallScreen(parent, request, choice);
+    const bool create = request.use == FileUse::Create;
+    QFileDialog dialog(&parent, WithoutMnemonic(request.title), choice.Folder(), StringText(request.kind.filter));
+    dialog.setAcceptMode(create ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
+    dialog.setFileMode(create ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite);
-    dialog.setLabelText(QFileDialog::Accept, AcceptText(use).remove(u'&'));
+    dialog.setLabelText(QFileDialog::Accept, WithoutMnemonic(request.accept));
+    if (!request.name.isEmpty())
+        dialog.selectFile(request.name);
     return dialog.exec() == QDialog::Accepted ? dialog.selectedFiles().value(0) : QString();
 }
 

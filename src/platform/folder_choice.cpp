@@ -1,13 +1,15 @@
-#include "app/folder_choice.h"
+#include "platform/folder_choice.h"
 
 #include <QDir>
 #include <QFileInfo>
 
+#include <algorithm>
+
 namespace mirel {
 
-FolderChoice::FolderChoice(const QString& folder, QString ending)
+FolderChoice::FolderChoice(const QString& folder, QStringList endings)
     : folder_(QDir::cleanPath(QFileInfo(folder).absoluteFilePath()))
-    , ending_(std::move(ending))
+    , endings_(std::move(endings))
 {
     while (!QFileInfo(folder_).isDir() && CanGoUp())
         GoUp();
@@ -21,7 +23,8 @@ std::vector<FolderChoice::Entry> FolderChoice::Entries() const
     for (const QString& name : here.entryList(QDir::Dirs | QDir::NoDotAndDotDot | QDir::Readable, order))
         entries.push_back({name, true});
     for (const QString& name : here.entryList(QDir::Files, order)) {
-        if (name.endsWith(ending_, Qt::CaseInsensitive))
+        if (std::ranges::any_of(endings_,
+                                [&](const QString& ending) { return name.endsWith(ending, Qt::CaseInsensitive); }))
             entries.push_back({name, false});
     }
     return entries;

@@ -1,4 +1,4 @@
-#include "app/folder_choice.h"
+#include "platform/folder_choice.h"
 
 #include "support/printing.h"
 
@@ -39,12 +39,13 @@ private:
 
 TEST_F(FolderChoiceTest, ListsFoldersAndTheFilesOfItsKind)
 {
-    EXPECT_EQ(Names(FolderChoice(Root(), u".cdb"_s)), QStringList({u"Archive/"_s, u"A.CDB"_s, u"b.cdb"_s}));
+    EXPECT_EQ(Names(FolderChoice(Root(), {u".cdb"_s})), QStringList({u"Archive/"_s, u"A.CDB"_s, u"b.cdb"_s}));
+    EXPECT_EQ(Names(FolderChoice(Root(), {u".csv"_s, u".TXT"_s})), QStringList({u"Archive/"_s, u"notes.txt"_s}));
 }
 
 TEST_F(FolderChoiceTest, WalksDownAndUpToTheRoot)
 {
-    FolderChoice choice(Root(), u".cdb"_s);
+    FolderChoice choice(Root(), {u".cdb"_s});
     EXPECT_TRUE(choice.Enter(u"Archive"_s));
     EXPECT_EQ(choice.PathOf(u"x.cdb"_s), Root() + u"/Archive/x.cdb"_s);
     EXPECT_FALSE(choice.Enter(u"2002"_s));
@@ -59,7 +60,7 @@ TEST_F(FolderChoiceTest, WalksDownAndUpToTheRoot)
 
 TEST_F(FolderChoiceTest, StartsAboveAFolderThatIsGone)
 {
-    EXPECT_EQ(FolderChoice(Root() + u"/gone/further"_s, u".cdb"_s).Folder(), Root());
+    EXPECT_EQ(FolderChoice(Root() + u"/gone/further"_s, {u".cdb"_s}).Folder(), Root());
 }
 
 } // namespace

@@ -1,4 +1,4 @@
-#include "app/ui/window_place.h"
+#include "platform/ui/window_place.h"
 
 #include <QScreen>
 #include <QWidget>

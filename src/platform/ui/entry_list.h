@@ -1,6 +1,6 @@
 #pragma once
 
-#include "app/main_view_state.h"
+#include "platform/tap.h"
 
 #include <QAbstractListModel>
 #include <QListView>

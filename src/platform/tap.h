@@ -1,0 +1,8 @@
+#pragma once
+
+namespace mirel {
+
+// How often the stylus, or the mouse, touched the same place.
+enum class Tap { Single, Double };
+
+} // namespace mirel
