@@ -142,7 +142,8 @@ Outcome KeyedRows::GatherSlice()
                                     outcome);
     if (!slice)
         return outcome;
-    const bool isLast = quint64(lastRowId_) - quint64(nextRowId_) < sliceWidth_;
+    // In a damaged tree the least row id may be behind the greatest.
+    const bool isLast = lastRowId_ < nextRowId_ || quint64(lastRowId_) - quint64(nextRowId_) < sliceWidth_;
     const qint64 end = isLast ? lastRowId_ : nextRowId_ + qint64(sliceWidth_) - 1;
     slice.Bind(1, nextRowId_);
     slice.Bind(2, end);
