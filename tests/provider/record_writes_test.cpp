@@ -1,5 +1,6 @@
 // Changing records: one at a time, all at once, and appended in bulk.
 #include "provider/database_fixture.h"
+#include "support/small_disk.h"
 
 namespace mirel {
 namespace {
@@ -238,6 +239,87 @@ TEST_F(Appending, ChecksEachCellAndGoesOnAfterARefusedRecord)
     ASSERT_EQ(appender->Commit(), Hr::Ok);
     EXPECT_EQ(Rows(u"SELECT Name,Small,Real,Day,Flag FROM T"_s),
               (QStringList{u"Äpfel|12|1.5|2001-07-04 09:05:00|1"_s, u"~|-3|2.5|~|1"_s}));
+}
+
+// Records wait for one another on their way into the table; none may be lost or change its place over that.
+TEST_F(Appending, KeepsTheOrderOfManyRecords)
+{
+    constexpr int kRecords = 1000;
+    const auto appender = Appender({u"Memo"_s, u"Whole"_s});
+    const std::string long40K(40'000, 'x');
+    for (int i = 0; i < kRecords; ++i) {
+        const Cell cells[] = {Cell::OfText(i % 10 == 3 ? std::string_view(long40K) : "short"),
+                              Cell::Of(qint64(i))};
+        const Cell tooBig[] = {Cell::OfText("half a record"), Cell::Of(qint64(1) << 40)};
+        ASSERT_EQ(appender->Append(cells), Hr::Ok);
+        if (i % 7 == 0) {
+            ASSERT_EQ(appender->Append(tooBig), Hr::Overflow);
+        }
+    }
+    ASSERT_EQ(appender->Commit(), Hr::Ok);
+    const QStringList numbers = Rows(u"SELECT Whole FROM T"_s);
+    ASSERT_EQ(numbers.size(), kRecords);
+    for (int i = 0; i < kRecords; ++i)
+        ASSERT_EQ(numbers[i], QString::number(i));
+    EXPECT_EQ(Rows(u"SELECT COUNT(*) FROM T WHERE LEN(Memo)=40000"_s), QStringList{u"100"_s});
+}
+
+TEST_F(Appending, TellsOfTheVeryRecordThatTheFileRefuses)
+{
+    const qint64 numbers[] = {4, 5, 4, 6};
+    const struct {
+        const char* what;
+        QByteArray table;
+        size_t refused; // index among the numbers
+    } rows[] = {
+        {"a unique index", "CREATE TABLE T (Whole INTEGER); CREATE UNIQUE INDEX u ON T (Whole)", 2},
+        {"a unique column", "CREATE TABLE T (Whole INTEGER UNIQUE)", 2},
+        {"a key", "CREATE TABLE T (Whole INTEGER PRIMARY KEY)", 2},
+        {"a check", "CREATE TABLE T ([no check] TEXT, Whole INTEGER, check/**/(Whole<>5))", 1},
+        {"an index over an expression",
+         "CREATE TABLE T (Whole INTEGER); CREATE INDEX e ON T (abs(CASE Whole WHEN 5 THEN -9223372036854775807-1 "
+         "END))",
+         1},
+        {"a trigger",
+         "CREATE TABLE T (Whole INTEGER); CREATE TRIGGER no BEFORE INSERT ON T WHEN new.Whole=5 "
+         "BEGIN SELECT RAISE(ABORT,'five'); END",
+         1},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.what);
+        Outside("DROP TABLE T; " + row.table);
+        const auto appender = Appender({u"Whole"_s});
+        ASSERT_TRUE(appender);
+        QStringList expected;
+        for (size_t i = 0; i < std::size(numbers); ++i) {
+            const Cell cells[] = {Cell::Of(numbers[i])};
+            EXPECT_EQ(Failed(appender->Append(cells)), i == row.refused) << i;
+            if (i != row.refused)
+                expected += QString::number(numbers[i]);
+        }
+        EXPECT_EQ(appender->Commit(), Hr::Ok);
+        QStringList kept = Rows(u"SELECT Whole FROM T"_s);
+        expected.sort();
+        kept.sort();
+        EXPECT_EQ(kept, expected);
+    }
+}
+
+TEST_F(Appending, LeavesNothingWhereTheDiskIsFull)
+{
+    provider->CloseDatabase(path);
+    const SmallDisk disk(10);
+    const auto appender = Appender({u"Memo"_s});
+    ASSERT_TRUE(appender);
+    const std::string text(10'000, 'x');
+    const Cell cells[] = {Cell::OfText(text)};
+    int taken = 0;
+    while (taken < 1000 && !Failed(appender->Append(cells)))
+        ++taken;
+    EXPECT_LT(taken, 1000);
+    EXPECT_EQ(appender->Append(cells), Hr::DiskFull) << "no record goes in behind the ones that were lost";
+    EXPECT_EQ(appender->Commit(), Hr::DiskFull);
+    EXPECT_TRUE(Rows(u"SELECT Memo FROM T"_s).isEmpty());
 }
 
 TEST_F(Appending, LeavesNothingWithoutCommit)
