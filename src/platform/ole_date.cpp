@@ -1,6 +1,7 @@
 #include "platform/ole_date.h"
 
 #include <cmath>
+#include <cstring>
 
 namespace mirel {
 namespace {
@@ -8,6 +9,10 @@ namespace {
 constexpr qint64 kMillisecondsPerDay = 86400000;
 constexpr qint64 kOleEpoch = 693593; // 1899-12-30 counted from 0001-01-01
 constexpr qint64 kLastDay = 3652058; // 9999-12-31 counted so
+
+constexpr std::string_view kStoredForm = "0000-00-00 00:00:00.000"; // 0 stands for any digit
+constexpr size_t kStoredDay = 10;                                   // as far as the day
+constexpr size_t kStoredSecond = 19;
 
 constexpr bool IsLeap(int year)
 {
@@ -204,30 +209,51 @@ std::optional<StoredDate> StoredDateOf(double oleDays)
     return stored;
 }
 
-bool IsStoredDate(std::string_view text)
+bool HasStoredDateForm(std::string_view text)
 {
-    constexpr std::string_view kPattern = "dddd-dd-dd dd:dd:dd.ddd";
-    constexpr size_t kDate = 10;
-    constexpr size_t kSeconds = 19;
-    if (text.size() != kDate && text.size() != kSeconds && text.size() != kPattern.size())
+    if (text.size() != kStoredDay && text.size() != kStoredSecond && text.size() != kStoredForm.size())
         return false;
-    for (size_t i = 0; i < text.size(); ++i) {
-        if (kPattern[i] == 'd' ? text[i] < '0' || text[i] > '9' : text[i] != kPattern[i])
+    // Eight characters at a time. Against the form a digit becomes 0 to 9 and a sign 0; what is added carries
+    // everything else into the upper half of its byte.
+    constexpr std::string_view kAddends = "\6\6\6\6\17\6\6\17\6\6\17\6\6\17\6\6\17\6\6\17\6\6\6";
+    static_assert(kAddends.size() == kStoredForm.size());
+    const auto eightAt = [](std::string_view characters, size_t at) {
+        quint64 eight = 0;
+        std::memcpy(&eight, characters.data() + at, sizeof eight);
+        return eight;
+    };
+    const auto fits = [&](size_t at) {
+        constexpr quint64 kUpperHalves = 0xF0F0F0F0F0F0F0F0;
+        const quint64 difference = eightAt(text, at) ^ eightAt(kStoredForm, at);
+        return ((difference | (difference + eightAt(kAddends, at))) & kUpperHalves) == 0;
+    };
+    for (size_t at = 0; at + 8 < text.size(); at += 8) {
+        if (!fits(at))
             return false;
     }
+    return fits(text.size() - 8);
+}
+
+bool IsStoredDate(std::string_view text)
+{
+    if (!HasStoredDateForm(text))
+        return false;
     const auto number = [text](size_t at, size_t digits) {
         int value = 0;
         for (; digits > 0 && at < text.size(); ++at, --digits)
             value = value * 10 + (text[at] - '0');
         return value;
     };
-    const DateParts parts{number(0, 4),  number(5, 2),  number(8, 2), number(11, 2),
+    const DateParts day{.year = number(0, 4), .month = number(5, 2), .day = number(8, 2), .hour = 0};
+    if (text.size() == kStoredDay)
+        return Exists(day);
+    const DateParts parts{day.year,      day.month,     day.day,      number(11, 2),
                           number(14, 2), number(17, 2), number(20, 3)};
     if (!Exists(parts))
         return false;
-    if (text.size() == kPattern.size())
+    if (text.size() == kStoredForm.size())
         return parts.millisecond != 0;
-    return text.size() == kDate || parts.hour != 0 || parts.minute != 0 || parts.second != 0;
+    return parts.hour != 0 || parts.minute != 0 || parts.second != 0;
 }
 
 std::optional<double> OleDateFromStored(std::string_view text)

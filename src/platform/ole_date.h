@@ -39,6 +39,8 @@ struct StoredDate {
     std::string_view Text() const { return {characters.data(), size_t(length)}; }
 };
 std::optional<StoredDate> StoredDateOf(double oleDays);
+// Whether a text has that form, whether or not there is such a day or time.
+bool HasStoredDateForm(std::string_view text);
 // Whether a text is that form to the letter, and its day and time exist: bulk work stores it as it stands.
 bool IsStoredDate(std::string_view text);
 

@@ -21,34 +21,7 @@ double OleDaysOf(double daysSinceBaseDate)
     return whole < 0 ? whole - fraction : whole + fraction;
 }
 
-// Characters of `text` against `form`, where "0" stands for any digit.
-bool HasForm(std::string_view text, std::string_view form)
-{
-    if (text.size() != form.size())
-        return false;
-    for (size_t i = 0; i < form.size(); ++i) {
-        const bool fits = form[i] == '0' ? text[i] >= '0' && text[i] <= '9' : text[i] == form[i];
-        if (!fits)
-            return false;
-    }
-    return true;
-}
-
 } // namespace
-
-bool IsStoredDateForm(std::string_view text)
-{
-    switch (text.size()) {
-    case 10:
-        return HasForm(text, "0000-00-00");
-    case 19:
-        return HasForm(text, "0000-00-00 00:00:00");
-    case 23:
-        return HasForm(text, "0000-00-00 00:00:00.000");
-    default:
-        return false;
-    }
-}
 
 std::optional<StoredDate> StoredDateOfText(std::string_view text)
 {

@@ -38,7 +38,7 @@ void DateOf(sqlite3_context* context, int, sqlite3_value** arguments)
     case SQLITE_FLOAT:
         return ReturnDate(context, StoredDateOfNumber(sqlite3_value_double(value)));
     case SQLITE_TEXT:
-        if (IsStoredDateForm(TextOf(value)))
+        if (HasStoredDateForm(TextOf(value)))
             return sqlite3_result_value(context, value);
         return ReturnDate(context, StoredDateOfText(TextOf(value)));
     default:

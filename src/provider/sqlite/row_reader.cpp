@@ -8,52 +8,56 @@
 namespace mirel::sqlite {
 namespace {
 
-std::string_view TextAt(sqlite3_stmt* row, int column)
+// The values of a row are read without the checks that the library makes for each access through the statement:
+// the handle has no mutex, and nothing else runs between the step and the read.
+Cell TextOf(sqlite3_value* value)
 {
-    const auto* text = reinterpret_cast<const char*>(sqlite3_column_text(row, column));
-    return {text ? text : "", size_t(sqlite3_column_bytes(row, column))};
+    const auto* text = reinterpret_cast<const char*>(sqlite3_value_text(value));
+    return Cell::OfText({text ? text : "", size_t(sqlite3_value_bytes(value))});
 }
 
-Cell BinaryAt(sqlite3_stmt* row, int column)
+Cell BinaryOf(sqlite3_value* value)
 {
-    const auto* bytes = static_cast<const char*>(sqlite3_column_blob(row, column));
-    return Cell::OfBinary({bytes ? bytes : "", size_t(sqlite3_column_bytes(row, column))});
+    const auto* bytes = static_cast<const char*>(sqlite3_value_blob(value));
+    return Cell::OfBinary({bytes ? bytes : "", size_t(sqlite3_value_bytes(value))});
 }
 
 // As the file holds it.
-Cell StoredCell(sqlite3_stmt* row, int column)
+Cell StoredCell(sqlite3_value* value)
 {
-    switch (sqlite3_column_type(row, column)) {
+    switch (sqlite3_value_type(value)) {
     case SQLITE_INTEGER:
-        return Cell::Of(qint64(sqlite3_column_int64(row, column)));
+        return Cell::Of(qint64(sqlite3_value_int64(value)));
     case SQLITE_FLOAT:
-        return Cell::Of(sqlite3_column_double(row, column));
+        return Cell::Of(sqlite3_value_double(value));
     case SQLITE_TEXT:
-        return Cell::OfText(TextAt(row, column));
+        return TextOf(value);
     case SQLITE_BLOB:
-        return BinaryAt(row, column);
+        return BinaryOf(value);
     default:
         return {};
     }
 }
 
-Cell TextCell(sqlite3_stmt* row, int column)
+Cell TextCell(sqlite3_value* value)
 {
-    const int type = sqlite3_column_type(row, column);
-    if (type == SQLITE_TEXT)
-        return Cell::OfText(TextAt(row, column));
-    if (type == SQLITE_NULL)
+    switch (sqlite3_value_type(value)) {
+    case SQLITE_NULL:
         return {};
-    return type == SQLITE_BLOB ? BinaryAt(row, column) : Cell::OfText(TextAt(row, column));
+    case SQLITE_BLOB:
+        return BinaryOf(value);
+    default:
+        return TextOf(value);
+    }
 }
 
-Cell DateCell(sqlite3_stmt* row, int column, StoredDate& rewritten)
+Cell DateCell(sqlite3_value* value, StoredDate& rewritten)
 {
-    const Cell cell = StoredCell(row, column);
+    const Cell cell = StoredCell(value);
     std::optional<StoredDate> date;
     switch (cell.kind) {
     case Cell::Kind::Text:
-        if (IsStoredDateForm(cell.bytes))
+        if (HasStoredDateForm(cell.bytes))
             return cell;
         date = StoredDateOfText(cell.bytes);
         break;
@@ -73,9 +77,9 @@ Cell DateCell(sqlite3_stmt* row, int column, StoredDate& rewritten)
     return Cell::OfText(rewritten.Text());
 }
 
-Cell TruthCell(sqlite3_stmt* row, int column)
+Cell TruthCell(sqlite3_value* value)
 {
-    const Cell cell = StoredCell(row, column);
+    const Cell cell = StoredCell(value);
     bool truth = false;
     switch (cell.kind) {
     case Cell::Kind::Integer:
@@ -122,14 +126,15 @@ std::span<const Cell> RowReader::Read(sqlite3_stmt* row)
 
 Cell RowReader::ReadSlot(Slot& slot, sqlite3_stmt* row)
 {
+    sqlite3_value* value = sqlite3_column_value(row, slot.column);
     switch (slot.type) {
     case FieldType::Text:
     case FieldType::Memo:
-        return TextCell(row, slot.column);
+        return TextCell(value);
     case FieldType::Date:
-        return DateCell(row, slot.column, slot.date);
+        return DateCell(value, slot.date);
     case FieldType::YesNo:
-        return TruthCell(row, slot.column);
+        return TruthCell(value);
     case FieldType::None:
     case FieldType::SmallInt:
     case FieldType::Integer:
@@ -138,7 +143,7 @@ Cell RowReader::ReadSlot(Slot& slot, sqlite3_stmt* row)
     case FieldType::LongBinary:
         break;
     }
-    return StoredCell(row, slot.column);
+    return StoredCell(value);
 }
 
 Value ValueOfCell(const Cell& cell, FieldType type)
