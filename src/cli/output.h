@@ -25,7 +25,12 @@ public:
         std::copy(bytes.begin(), bytes.end(), buffer_.get() + used_); // memcpy refuses an empty view's null
         used_ += bytes.size();
     }
-    void Write(char byte) { Write(std::string_view(&byte, 1)); }
+    void Write(char byte)
+    {
+        if (used_ == kBufferBytes)
+            Flush();
+        buffer_[used_++] = byte;
+    }
     void WriteText(const QString& text);
     void WriteLine(const QString& text);
 

@@ -6,34 +6,56 @@
 
 #include <algorithm>
 #include <array>
+#include <cstring>
 #include <vector>
 
 namespace mirel::cli {
 namespace {
 
-// What ends or encloses a text, and so asks for marks around it or for an escape.
-class ByteSet {
+// Up to four bytes that a text of a line cannot hold as they are, and so asks for marks around it or for escapes.
+class SpecialBytes {
 public:
-    constexpr explicit ByteSet(std::string_view bytes)
+    constexpr explicit SpecialBytes(std::string_view bytes)
     {
-        for (const char byte : bytes)
-            holds_[static_cast<unsigned char>(byte)] = true;
+        for (size_t i = 0; i < bytes_.size(); ++i)
+            bytes_[i] = bytes[std::min(i, bytes.size() - 1)];
     }
-    constexpr bool Holds(char byte) const { return holds_[static_cast<unsigned char>(byte)]; }
-    bool HoldsAnyOf(std::string_view text) const
+
+    // Most texts hold none, so they are looked for sixteen bytes at a time.
+    bool StandIn(std::string_view text) const
     {
-        return std::ranges::any_of(text, [this](char byte) { return Holds(byte); });
+        constexpr size_t kWidth = sizeof(Block);
+        if (text.size() < kWidth)
+            return std::ranges::any_of(text, [this](char byte) { return std::ranges::count(bytes_, byte) > 0; });
+        for (size_t at = 0; at + kWidth < text.size(); at += kWidth) {
+            if (StandInBlock(text.data() + at))
+                return true;
+        }
+        return StandInBlock(text.data() + text.size() - kWidth);
     }
 
 private:
-    std::array<bool, 256> holds_{};
+    using Block = char __attribute__((vector_size(16)));
+
+    bool StandInBlock(const char* at) const
+    {
+        Block block;
+        std::memcpy(&block, at, sizeof block);
+        const auto found =
+            (block == bytes_[0]) | (block == bytes_[1]) | (block == bytes_[2]) | (block == bytes_[3]);
+        std::array<quint64, 2> halves;
+        std::memcpy(halves.data(), &found, sizeof halves);
+        return (halves[0] | halves[1]) != 0;
+    }
+
+    std::array<char, 4> bytes_{};
 };
 
 // RFC 4180's quotation: a text with a separator, a mark or a line end stands in marks, inner ones doubled.
 void WriteCsvText(Output& output, std::string_view text)
 {
-    static constexpr ByteSet kNeedMarks(",\"\r\n");
-    if (!kNeedMarks.HoldsAnyOf(text)) {
+    static constexpr SpecialBytes kNeedMarks(",\"\r\n");
+    if (!kNeedMarks.StandIn(text)) {
         output.Write(text);
         return;
     }
@@ -51,8 +73,8 @@ void WriteTsvText(Output& output, std::string_view text)
 {
     static constexpr std::string_view kEscaped = "\t\n\r\\";
     static constexpr std::string_view kLetters = "tnr\\";
-    static constexpr ByteSet kNeedEscape(kEscaped);
-    if (!kNeedEscape.HoldsAnyOf(text)) {
+    static constexpr SpecialBytes kNeedEscape(kEscaped);
+    if (!kNeedEscape.StandIn(text)) {
         output.Write(text);
         return;
     }
