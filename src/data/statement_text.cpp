@@ -27,6 +27,27 @@ qsizetype TailPosition(QStringView statement)
     return group >= 0 ? group : KeywordPosition(statement, u"ORDER");
 }
 
+struct ListPlace {
+    qsizetype begin = 0; // behind SELECT and DISTINCT
+    qsizetype from = -1; // of the FROM; -1: the statement has no such list
+    bool distinct = false;
+};
+ListPlace PlaceOfSelectList(QStringView statement)
+{
+    constexpr qsizetype kSelectSize = 6;
+    constexpr qsizetype kDistinctSize = 8;
+    const qsizetype select = KeywordPosition(statement, u"SELECT");
+    const qsizetype from = KeywordPosition(statement, u"FROM");
+    if (select < 0 || from < select + kSelectSize)
+        return {};
+    const qsizetype begin = select + kSelectSize;
+    const QStringView list = statement.sliced(begin, from - begin);
+    const qsizetype distinct = KeywordPosition(list, u"DISTINCT");
+    if (distinct < 0 || !list.first(distinct).trimmed().isEmpty())
+        return {begin, from, false};
+    return {begin + distinct + kDistinctSize, from, true};
+}
+
 } // namespace
 
 qsizetype KeywordPosition(QStringView statement, QStringView keyword)
@@ -80,15 +101,59 @@ QString WithOrder(const QString& statement, const QString& terms)
     return u"%1 ORDER BY %2"_s.arg(base, terms);
 }
 
-QString WithFields(const QString& statement, const QStringList& fields)
+QStringList SelectList(QStringView statement)
 {
-    const qsizetype from = KeywordPosition(statement, u"FROM");
-    if (from < 0)
+    const ListPlace place = PlaceOfSelectList(statement);
+    if (place.from < 0)
+        return {};
+    const QStringView list = statement.sliced(place.begin, place.from - place.begin);
+    QStringList columns;
+    qsizetype begin = 0;
+    int depth = 0;
+    for (qsizetype at = 0; at < list.size(); ++at) {
+        if (const QChar closing = ClosingOf(list[at]); !closing.isNull()) {
+            at = list.indexOf(closing, at + 1);
+            if (at < 0)
+                break;
+        } else if (list[at] == u',' && depth == 0) {
+            columns += list.sliced(begin, at - begin).trimmed().toString();
+            begin = at + 1;
+        } else {
+            depth += list[at] == u'(' ? 1 : (list[at] == u')' ? -1 : 0);
+        }
+    }
+    columns += list.sliced(begin).trimmed().toString();
+    return columns;
+}
+
+QString WithSelectList(const QString& statement, const QStringList& columns)
+{
+    const ListPlace place = PlaceOfSelectList(statement);
+    if (place.from < 0)
         return statement;
-    QStringList references;
-    for (const QString& field : fields)
-        references += FieldReference(field);
-    return u"SELECT %1 %2"_s.arg(references.join(u','), statement.sliced(from));
+    const QString head = place.distinct ? u"SELECT DISTINCT"_s : u"SELECT"_s;
+    return u"%1 %2 %3"_s.arg(head, columns.join(u','), statement.sliced(place.from));
+}
+
+bool IsBalanced(QStringView statement)
+{
+    int parentheses = 0;
+    int brackets = 0;
+    QChar quote;
+    for (const QChar c : statement) {
+        if (!quote.isNull()) {
+            if (c == quote)
+                quote = QChar();
+            continue;
+        }
+        if ((c == u')' && parentheses < 1) || (c == u']' && brackets < 1))
+            return false;
+        parentheses += c == u'(' ? 1 : (c == u')' ? -1 : 0);
+        brackets += c == u'[' ? 1 : (c == u']' ? -1 : 0);
+        if (c == u'\'' || c == u'"')
+            quote = c;
+    }
+    return parentheses == 0 && brackets == 0 && quote.isNull();
 }
 
 } // namespace mirel

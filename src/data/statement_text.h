@@ -20,8 +20,13 @@ QString WithCondition(const QString& statement, const QString& condition);
 // The statement ordered by `terms` ("[Name] ASC"), whatever its order was before.
 QString WithOrder(const QString& statement, const QString& terms);
 
-// The statement from its FROM on, with the select list replaced by these names, each written by the
-// field-reference rule.
-QString WithFields(const QString& statement, const QStringList& fields);
+// What stands between SELECT and FROM, a text a column, without DISTINCT. Empty when one of the two is missing.
+QStringList SelectList(QStringView statement);
+
+// The statement from its FROM on, with these columns as its select list, written as they are. DISTINCT stays.
+QString WithSelectList(const QString& statement, const QStringList& columns);
+
+// Whether parentheses, square brackets and quotes are closed in order. A doubled quote ends a text and begins one.
+bool IsBalanced(QStringView statement);
 
 } // namespace mirel

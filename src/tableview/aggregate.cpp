@@ -16,6 +16,17 @@ bool IsTaken(const Cell& cell)
     return cell.kind == Cell::Kind::Integer || cell.kind == Cell::Kind::Real;
 }
 
+void Take(AggregateResult& taken, double number, Aggregate kind)
+{
+    if (kind == Aggregate::Sum || kind == Aggregate::Avg)
+        taken.value += number;
+    else if (taken.values == 0)
+        taken.value = number;
+    else
+        taken.value = kind == Aggregate::Max ? std::max(taken.value, number) : std::min(taken.value, number);
+    ++taken.values;
+}
+
 } // namespace
 
 QString AggregateResult::Text(Aggregate kind) const
@@ -29,27 +40,23 @@ QString AggregateResult::Text(Aggregate kind) const
         text.chop(1);
     if (text.endsWith(u'.'))
         text.chop(1);
-    return text;
+    return text == u"-0" ? text.sliced(1) : text;
 }
 
-std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggregate kind)
+std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggregate kind,
+                                            const BulkProgress& progress)
 {
+    constexpr qint64 kRecordsPerStep = 1024; // between two looks at the progress display
     AggregateResult taken;
+    qint64 records = 0;
+    bool stopped = false;
     const auto take = [&](std::span<const Cell> cells) {
-        const Cell& cell = cells.front();
-        if (!IsTaken(cell))
-            return true;
-        const double number = NumberOf(cell);
-        if (kind == Aggregate::Sum || kind == Aggregate::Avg)
-            taken.value += number;
-        else if (taken.values == 0)
-            taken.value = number;
-        else
-            taken.value = kind == Aggregate::Max ? std::max(taken.value, number) : std::min(taken.value, number);
-        ++taken.values;
-        return true;
+        if (IsTaken(cells.front()))
+            Take(taken, NumberOf(cells.front()), kind);
+        stopped = ++records % kRecordsPerStep == 0 && progress && !progress(records);
+        return !stopped;
     };
-    if (!result.Read({.fields = {field}, .order = ReadRange::Order::Any}, take))
+    if (!result.Read({.fields = {field}, .order = ReadRange::Order::Any}, take) || stopped)
         return {};
     if (kind == Aggregate::Avg && taken.values > 0)
         taken.value /= double(taken.values);

@@ -26,8 +26,9 @@ struct AggregateResult {
     QString Text(Aggregate kind) const;
 };
 
-// Walks all records of the result; the current one stays where it is. Empty when the walk failed: the recordset's
-// last result says why.
-std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggregate kind);
+// Walks all records of the result; the current one stays where it is. Empty when the walk failed, the recordset's
+// last result then says why; and when `progress` ended it, which is no failure.
+std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggregate kind,
+                                            const BulkProgress& progress = {});
 
 } // namespace mirel

@@ -19,14 +19,13 @@ public:
 
     // Of the selected field; the result stands in the browser's editor.
     bool ShowAggregate(Aggregate kind);
-    // Both ask twice. A refused record, or Cancel, ends the run: the records before it stay changed.
+    // Both ask twice. The result is run again afterwards: it shows what is left.
     bool DeleteAll();
-    // Sets the selected field of all records to what its editor shows.
+    // Sets the selected field of all records to what its editor shows. The page stays where it is.
     bool UpdateAll();
 
 private:
-    bool Ask(const UserMessage& question, const UserMessage& again);
-    BulkProgress Follow(Progress& progress) const;
+    bool IsReady();
 
     RecordBrowser& browser_;
     UserPrompt& prompt_;

@@ -51,6 +51,24 @@ bool RecordBrowser::Open(const QString& statement)
     return Execute(statement);
 }
 
+bool RecordBrowser::OpenInstead(const QString& statement)
+{
+    const QString base = baseStatement_;
+    const QString current = statement_;
+    const QStringList conditions = conditions_;
+    const ColumnSort sort = sort_;
+    if (Open(statement))
+        return true;
+    if (writeFailed_ || base.isEmpty())
+        return false;
+    baseStatement_ = base;
+    if (Execute(current)) {
+        conditions_ = conditions;
+        sort_ = sort;
+    }
+    return false;
+}
+
 bool RecordBrowser::Rewrite(const QString& statement)
 {
     if (!WriteEdit())
@@ -164,7 +182,7 @@ bool RecordBrowser::ChangeSettings(const TableViewSettings& settings)
 
 bool RecordBrowser::CountOn(int budgetMs)
 {
-    if (!count_ && recordset_.CountStep(budgetMs))
+    if (!count_ && !working_ && recordset_.CountStep(budgetMs))
         Count();
     return count_.has_value();
 }

@@ -44,6 +44,8 @@ public:
     // Runs `statement`, which becomes the base and the current statement, and shows its first page as a list.
     // False, with nothing open, when the provider refuses it.
     bool Open(const QString& statement);
+    // The same; but when it is refused, what was shown before is shown again, with its filters and its order.
+    bool OpenInstead(const QString& statement);
     // Makes `statement`, a filter or sort put onto the current one, current. When it is refused, the one before
     // is run again.
     bool Rewrite(const QString& statement);
@@ -64,6 +66,18 @@ public:
     std::span<const ResultField> Fields() const { return recordset_.Fields(); }
     // The result itself, for the commands that work on all of its records. They leave it on the selected one.
     DbRecordset& Recordset() { return recordset_; }
+
+    // As long as one lives, a command works through the records and the window lives on beside it: whatever that
+    // asks for, nothing else reads the result meanwhile. The page is filled again afterwards where it has to be.
+    class Work {
+    public:
+        explicit Work(RecordBrowser& browser);
+        ~Work();
+        Q_DISABLE_COPY_MOVE(Work)
+
+    private:
+        RecordBrowser& browser_;
+    };
 
     // The count, where it is known; CountOn counts on for a while and returns true once it is.
     std::optional<qint64> KnownCount() const { return count_; }
@@ -140,6 +154,11 @@ public:
     };
     ColumnSort CurrentSort() const { return sort_; }
 
+    // The field as a statement names it: with its table where the result draws on more than one.
+    QString ReferenceOf(int field) const;
+    // The table that the field comes from; for an expression the result's first one.
+    QString TableOf(int field) const;
+
     // --- columns ----------------------------------------------------------------------------------------
 
     bool CanHideColumn() const;
@@ -191,7 +210,6 @@ private:
     qint64 Count();
     void Recount();
     void ReportFailure();
-    QString ReferenceOf(int field) const;
 
     // The page.
     void FillPage();
@@ -231,6 +249,8 @@ private:
     RecordPage page_;
     quint64 pageRevision_ = 0;
     quint64 columnsRevision_ = 0;
+    bool working_ = false;
+    bool fillLater_ = false; // the page was to be filled while a command worked
     int rowsPerPage_ = 1;
     qint64 topRow_ = 0;
     int selectedRow_ = -1; // in the list

@@ -11,7 +11,6 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-// With its table where the result draws on more than one.
 QString RecordBrowser::ReferenceOf(int field) const
 {
     const ResultField& shown = recordset_.Fields()[size_t(field)];
@@ -21,6 +20,16 @@ QString RecordBrowser::ReferenceOf(int field) const
                             return !other.table.isEmpty() && other.table != shown.table;
                         });
     return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+}
+
+QString RecordBrowser::TableOf(int field) const
+{
+    const std::span<const ResultField> fields = recordset_.Fields();
+    if (field >= 0 && field < FieldCount() && !fields[size_t(field)].table.isEmpty())
+        return fields[size_t(field)].table;
+    const auto first =
+        std::ranges::find_if(fields, [](const ResultField& other) { return !other.table.isEmpty(); });
+    return first == fields.end() ? QString() : first->table;
 }
 
 bool RecordBrowser::FilterByCell(CellFilter filter)

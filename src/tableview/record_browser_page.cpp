@@ -2,6 +2,7 @@
 #include "tableview/record_browser.h"
 
 #include <algorithm>
+#include <utility>
 
 // The page and the selection of the record browser.
 
@@ -84,9 +85,23 @@ bool RecordBrowser::ScrollTo(qint64 position)
     return true;
 }
 
+RecordBrowser::Work::Work(RecordBrowser& browser)
+    : browser_(browser)
+{
+    Q_ASSERT(!browser_.working_);
+    browser_.working_ = true;
+}
+
+RecordBrowser::Work::~Work()
+{
+    browser_.working_ = false;
+    if (std::exchange(browser_.fillLater_, false))
+        browser_.FillPage();
+}
+
 void RecordBrowser::TakeUpChanges()
 {
-    if (!IsOpen() || edit_.IsPending())
+    if (!IsOpen() || edit_.IsPending() || working_)
         return;
     const quint64 before = generation_;
     FillPage();
@@ -103,6 +118,10 @@ void RecordBrowser::TakeUpChanges()
 
 void RecordBrowser::FillPage()
 {
+    if (working_) {
+        fillLater_ = true;
+        return;
+    }
     const auto fill = [this] { presentation_ == Presentation::List ? FillList() : FillDetail(); };
     fill();
     if (IsOpen() && recordset_.Generation() != generation_) { // another program was here

@@ -67,11 +67,41 @@ TEST(WithOrder, ReplacesTheOrderBefore)
     EXPECT_EQ(WithOrder(u"SELECT [ORDER BY] FROM T"_s, u"c"_s), u"SELECT [ORDER BY] FROM T ORDER BY c"_s);
 }
 
-TEST(WithFields, ReplacesTheSelectListAlone)
+TEST(WithSelectList, ReplacesTheColumnsAlone)
 {
-    EXPECT_EQ(WithFields(u"SELECT * FROM T WHERE a=1"_s, {u"A"_s, u"Unit Price"_s}),
-              u"SELECT A,[Unit Price] FROM T WHERE a=1"_s);
-    EXPECT_EQ(WithFields(u"SELECT 'x FROM y', b FROM T"_s, {u"b"_s}), u"SELECT b FROM T"_s);
+    const QStringList columns = {u"A"_s, u"[Unit Price] AS P"_s};
+    EXPECT_EQ(WithSelectList(u"SELECT * FROM T WHERE a=1"_s, columns),
+              u"SELECT A,[Unit Price] AS P FROM T WHERE a=1"_s);
+    EXPECT_EQ(WithSelectList(u"select distinct A,B FROM T"_s, {u"A"_s}), u"SELECT DISTINCT A FROM T"_s);
+    EXPECT_EQ(WithSelectList(u"SELECT 'x FROM y', b FROM T"_s, {u"b"_s}), u"SELECT b FROM T"_s);
+    for (const QString& other : {u"SELECT 1"_s, u"FROM T SELECT a"_s, u"SELECTFROM T"_s, QString()})
+        EXPECT_EQ(WithSelectList(other, columns), other);
+}
+
+TEST(SelectList, IsCutAtItsOwnCommas)
+{
+    const struct {
+        QString statement;
+        QStringList columns;
+    } rows[] = {
+        {u"SELECT * FROM T"_s, {u"*"_s}},
+        {u"SELECT A, LEFT(B,2) AS [x,y] ,'a,b' FROM T"_s, {u"A"_s, u"LEFT(B,2) AS [x,y]"_s, u"'a,b'"_s}},
+        {u"SELECT DISTINCT A,B FROM T"_s, {u"A"_s, u"B"_s}},
+        {u"SELECT [DISTINCT],B FROM T"_s, {u"[DISTINCT]"_s, u"B"_s}},
+        {u"SELECT A)),B,'x FROM T"_s, {}}, // a text that never ends
+        {u"DELETE FROM T"_s, {}},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(SelectList(row.statement), row.columns) << row.statement.toStdString();
+}
+
+TEST(IsBalanced, LooksOutsideOfTexts)
+{
+    for (const QString& balanced : {u""_s, u"SELECT [x] FROM t WHERE b = ')'"_s, u"'it''s'"_s, u"([)]"_s})
+        EXPECT_TRUE(IsBalanced(balanced)) << balanced.toStdString();
+    for (const QString& unbalanced :
+         {u"SELECT * FROM t WHERE (a = 1"_s, u"a)("_s, u"[a"_s, u"a]"_s, u"'a"_s, u"\"a'"_s})
+        EXPECT_FALSE(IsBalanced(unbalanced)) << unbalanced.toStdString();
 }
 
 } // namespace

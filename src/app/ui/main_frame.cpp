@@ -29,7 +29,6 @@ const QString kFramePlace = u"frame"_s;
 const QString kTablePlace = u"table"_s;
 constexpr QSize kFrameFirstSize(760, 560);
 constexpr QSize kTableFirstSize(960, 620);
-constexpr const char* kRequestProperty = "mirelRequest"; // of a table view: the statement that it was opened for
 constexpr QSize kSmallestSize(160, 160);
 
 // The one database file that is dragged; empty when it is anything else.
@@ -191,7 +190,7 @@ void CMainFrame::Run(ShellCommand id)
 QWidget* CMainFrame::OpenTable(const TableRequest& request)
 {
     for (CTableView* open : Tables()) {
-        if (open->property(kRequestProperty) != request.statement)
+        if (open->Browser().BaseStatement() != request.statement)
             continue;
         open->show();
         open->raise();
@@ -201,11 +200,15 @@ QWidget* CMainFrame::OpenTable(const TableRequest& request)
     auto* table = new CTableView(session_.Connection(), session_.Path(), session_.Prompt(),
                                  ReadTableViewSettings(settings_), this);
     table->setAttribute(Qt::WA_DeleteOnClose);
-    table->setProperty(kRequestProperty, request.statement);
     if (!table->OpenStatement(request.title, request.statement)) {
         delete table;
         return nullptr;
     }
+    table->SetStore(session_.Store());
+    connect(table, &CTableView::queriesChanged, this, [this] {
+        commands_.Refill();
+        ShowState();
+    });
     connect(table, &CTableView::settingsChanged, this,
             [this](const TableViewSettings& options) { WriteTableViewSettings(settings_, options); });
     if (IsHandheldSize(size())) {

@@ -79,7 +79,10 @@ public:
             box_.setLabelText(what_ + u'\n' + locale.toString(done));
             box_.setValue(0);
         }
-        QCoreApplication::processEvents();
+        // Until the box stands there and blocks them, keys and taps wait: they must reach no window whose records
+        // are being worked on.
+        QCoreApplication::processEvents(box_.isVisible() ? QEventLoop::AllEvents
+                                                         : QEventLoop::ExcludeUserInputEvents);
         return !box_.wasCanceled();
     }
 

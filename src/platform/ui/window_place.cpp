@@ -32,4 +32,10 @@ bool IsHandheldSize(QSize window)
     return window.width() < kSmallestDesktop.width() || window.height() < kSmallestDesktop.height();
 }
 
+void FillSmallWindow(QWidget& dialog, const QWidget& window)
+{
+    if (IsHandheldSize(window.size()))
+        dialog.setGeometry(window.geometry());
+}
+
 } // namespace mirel

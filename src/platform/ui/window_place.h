@@ -17,5 +17,7 @@ void KeepPlace(const QWidget& window, Profile& profile, const QString& key);
 
 // Whether a window of that size is a handheld's: dialogs then fill it.
 bool IsHandheldSize(QSize window);
+// A dialog over a window of that size fills it.
+void FillSmallWindow(QWidget& dialog, const QWidget& window);
 
 } // namespace mirel

@@ -49,6 +49,7 @@ constexpr std::array kKeys = {
     KeyRow{Qt::SHIFT | Qt::Key_F2, InWindow, TableCommand::Zoom},
     KeyRow{Qt::CTRL | Qt::Key_G, InWindow, TableCommand::GoToRecord},
     KeyRow{Qt::CTRL | Qt::Key_D, InWindow, TableCommand::ToggleDetail},
+    KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_F, InWindow, TableCommand::FilterExpression},
     KeyRow{Qt::Key_F5, InWindow, TableCommand::RunAgain},
     KeyRow{Qt::Key_F6, InWindow, TableCommand::NextPane},
     KeyRow{Qt::CTRL | Qt::Key_C, InWindow, TableCommand::Copy},
@@ -84,7 +85,13 @@ constexpr std::array kActions = {
               nullptr},
     ActionRow{TableCommand::SortExpression, Str::ActionSortExpression, Str::ActionSortExpressionTip, nullptr},
     ActionRow{TableCommand::EditAll, Str::ActionEditAll, Str::ActionEditAllTip, nullptr},
+    ActionRow{TableCommand::DeleteAll, Str::ActionDeleteAll, Str::ActionDeleteAllTip, nullptr},
+    ActionRow{TableCommand::UpdateAll, Str::ActionUpdateAll, Str::ActionUpdateAllTip, nullptr},
     ActionRow{TableCommand::Aggregate, Str::ActionAggregate, Str::ActionAggregateTip, nullptr},
+    ActionRow{TableCommand::Sum, Str::ActionSum, Str::ActionSumTip, nullptr},
+    ActionRow{TableCommand::Max, Str::ActionMax, Str::ActionMaxTip, nullptr},
+    ActionRow{TableCommand::Min, Str::ActionMin, Str::ActionMinTip, nullptr},
+    ActionRow{TableCommand::Avg, Str::ActionAvg, Str::ActionAvgTip, nullptr},
     ActionRow{TableCommand::NewQuery, Str::ActionNewQuery, Str::ActionNewQueryTip, nullptr},
     ActionRow{TableCommand::OpenQuery, Str::ActionOpenQuery, Str::ActionOpenQueryTip, nullptr},
     ActionRow{TableCommand::SaveQuery, Str::ActionSaveQuery, Str::ActionSaveQueryTip, nullptr},
@@ -148,6 +155,10 @@ constexpr std::array<MenuEntry, 14> kPopupMenu = {TableCommand::FilterBySelectio
                                                   TableCommand::Copy,
                                                   TableCommand::Paste};
 
+constexpr std::array<MenuEntry, 2> kEditAllMenu = {TableCommand::DeleteAll, TableCommand::UpdateAll};
+constexpr std::array<MenuEntry, 4> kAggregateMenu = {TableCommand::Sum, TableCommand::Max, TableCommand::Min,
+                                                     TableCommand::Avg};
+
 } // namespace
 
 std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys)
@@ -174,7 +185,7 @@ std::span<const ActionRow> ActionRows()
 
 bool IsToCome(TableCommand command)
 {
-    return command >= TableCommand::FilterExpression && command <= TableCommand::Help;
+    return command >= TableCommand::NewQuery && command <= TableCommand::Help;
 }
 
 std::span<const MenuEntry> FileMenu()
@@ -190,6 +201,15 @@ std::span<const MenuEntry> ToolsMenu()
 std::span<const MenuEntry> PopupMenu()
 {
     return kPopupMenu;
+}
+
+std::span<const MenuEntry> SubmenuOf(TableCommand command)
+{
+    if (command == TableCommand::EditAll)
+        return kEditAllMenu;
+    if (command == TableCommand::Aggregate)
+        return kAggregateMenu;
+    return {};
 }
 
 } // namespace mirel

@@ -43,15 +43,21 @@ enum class TableCommand {
     RemoveFilter,
     SortAscending,
     SortDescending,
-    // Not built yet: their menu entries are there, disabled, and say what they will do.
     FilterExpression,
     SortExpression,
-    EditAll,
+    EditAll, // opens a menu of its own, as Aggregate does
+    DeleteAll,
+    UpdateAll,
     Aggregate,
-    NewQuery,
+    Sum,
+    Max,
+    Min,
+    Avg,
     OpenQuery,
     SaveQuery,
     ExportCsv,
+    // Not built yet: their menu entries are there, disabled, and say what they will do.
+    NewQuery,
     Layout,
     Help,
     FitColumn,
@@ -87,5 +93,7 @@ using MenuEntry = std::optional<TableCommand>;
 std::span<const MenuEntry> FileMenu();
 std::span<const MenuEntry> ToolsMenu();
 std::span<const MenuEntry> PopupMenu(); // on the grid
+// The menu behind an entry; empty for one that is a command itself.
+std::span<const MenuEntry> SubmenuOf(TableCommand command);
 
 } // namespace mirel

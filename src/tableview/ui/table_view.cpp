@@ -1,10 +1,12 @@
 #include "tableview/ui/table_view.h"
 
+#include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
+#include "tableview/ui/result_commands.h"
 
 #include <QApplication>
 #include <QCloseEvent>
@@ -28,6 +30,7 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
     : QMainWindow(parent)
     , browser_(connection, database, prompt, settings)
     , prompt_(prompt)
+    , resultCommands_(new ResultCommands(browser_, connection, prompt, *this))
     , stack_(new QStackedWidget(this))
     , grid_(new RecordGrid(browser_, this))
     , zoomEdit_(new QPlainTextEdit(this))
@@ -89,6 +92,8 @@ void CTableView::ConnectParts()
         browser_.SetRowsPerPage(rows);
         ShowState();
     });
+    connect(resultCommands_, &ResultCommands::queryOpened, this, [this](const QString& name) { title_ = name; });
+    connect(resultCommands_, &ResultCommands::queriesChanged, this, &CTableView::queriesChanged);
     connect(strip_, &CellStrip::commandRequested, this, &CTableView::Do);
     connect(strip_, &CellStrip::textEdited, this, [this](const QString& text) {
         browser_.EditText(text);
@@ -117,6 +122,12 @@ void CTableView::ConnectParts()
     });
 }
 
+void CTableView::SetStore(FormStore& store)
+{
+    resultCommands_->SetStore(&store);
+    ShowState();
+}
+
 bool CTableView::OpenTable(const QString& table)
 {
     return OpenStatement(table, RecordBrowser::StatementOfTable(table));
@@ -125,10 +136,8 @@ bool CTableView::OpenTable(const QString& table)
 bool CTableView::OpenStatement(const QString& title, const QString& statement)
 {
     title_ = title;
-    QApplication::setOverrideCursor(Qt::WaitCursor);
-    const bool opened = browser_.Open(statement);
-    QApplication::restoreOverrideCursor();
-    return Settle(opened);
+    const WaitCursor waiting;
+    return Settle(browser_.Open(statement));
 }
 
 // --- showing ------------------------------------------------------------------------------------------------

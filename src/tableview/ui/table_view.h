@@ -16,8 +16,10 @@ namespace mirel {
 
 class CellStrip;
 class FilterChip;
+class FormStore;
 class NavigationRow;
 class RecordGrid;
+class ResultCommands;
 
 // The window over one open result: the grid, the editor of the selected cell under it, the buttons that walk
 // through the records. It shows what its record browser holds and hands it what the user does.
@@ -36,11 +38,15 @@ public:
     bool OpenTable(const QString& table);
     bool OpenStatement(const QString& title, const QString& statement);
 
+    // Where the database keeps its saved queries, for "Open Query" and "Save As Query"; must outlive the window.
+    void SetStore(FormStore& store);
+
     const RecordBrowser& Browser() const { return browser_; }
 
 Q_SIGNALS:
     // The user has confirmed other options; they are in force already.
     void settingsChanged(const TableViewSettings& settings);
+    void queriesChanged(); // of the store
 
 protected:
     void closeEvent(QCloseEvent* event) override;
@@ -76,6 +82,7 @@ private:
     RecordBrowser browser_;
     UserPrompt& prompt_;
     QString title_;
+    ResultCommands* resultCommands_;
     QHash<TableCommand, QAction*> actions_;
     QStackedWidget* stack_;
     RecordGrid* grid_;

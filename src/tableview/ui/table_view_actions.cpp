@@ -2,11 +2,13 @@
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/record_grid.h"
+#include "tableview/ui/result_commands.h"
 #include "tableview/ui/table_view.h"
 
 #include <QAction>
 #include <QMenu>
 #include <QMenuBar>
+#include <QStackedWidget>
 
 #include <algorithm>
 #include <array>
@@ -89,10 +91,16 @@ void CTableView::FillMenu(QMenu* menu, std::span<const MenuEntry> entries)
 {
     menu->setToolTipsVisible(true);
     for (const MenuEntry entry : entries) {
-        if (entry)
-            menu->addAction(ActionOf(*entry));
-        else
+        if (!entry) {
             menu->addSeparator();
+            continue;
+        }
+        QAction* action = ActionOf(*entry);
+        menu->addAction(action);
+        if (const std::span<const MenuEntry> behind = SubmenuOf(*entry); !behind.empty() && !action->menu()) {
+            action->setMenu(new QMenu(this));
+            FillMenu(action->menu(), behind);
+        }
     }
 }
 
@@ -113,6 +121,11 @@ void CTableView::ShowActions()
           Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection, Command::FilterExcluding,
           Command::SortAscending, Command::SortDescending})
         ActionOf(command)->setEnabled(hasRecord);
+    for (const TableCommand command :
+         {Command::FilterExpression, Command::SortExpression, Command::EditAll, Command::DeleteAll,
+          Command::UpdateAll, Command::Aggregate, Command::Sum, Command::Max, Command::Min, Command::Avg,
+          Command::OpenQuery, Command::SaveQuery, Command::ExportCsv})
+        ActionOf(command)->setEnabled(resultCommands_->CanDo(command));
     ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
     for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove, Command::Paste})
         ActionOf(command)->setEnabled(browser_.CanEdit());
@@ -164,7 +177,11 @@ void CTableView::Do(TableCommand command)
     case Command::Close:
         close();
         return;
-    default: // the rest is the browser's, above
+    default: // the rest is the browser's, above, or the result's
+        if (const std::optional<bool> done = resultCommands_->Do(command)) {
+            Settle(*done);
+            stack_->currentWidget()->setFocus();
+        }
         return;
     }
 }

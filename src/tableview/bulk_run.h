@@ -1,0 +1,45 @@
+#pragma once
+
+#include "data/db_recordset.h"
+#include "platform/user_prompt.h"
+#include "tableview/aggregate.h"
+
+#include <optional>
+
+namespace mirel {
+
+// One command over all records of an open result, with its questions, its progress and the report of what fails:
+// the same for the window and the command line. Result and prompt must outlive it.
+//
+// Changes are one transaction. A refused record, or Cancel, ends the run, and the records before it stay changed;
+// any other failure, a full disk among them, changes none.
+class BulkRun {
+public:
+    BulkRun(DbRecordset& records, UserPrompt& prompt)
+        : records_(records)
+        , prompt_(prompt)
+    {
+    }
+
+    // Empty when the field cannot be summed up, which the user is told, or the walk did not come to its end.
+    std::optional<AggregateResult> Sum(int field, Aggregate kind);
+
+    // The questions, two of them before each run; false: the user does not want it.
+    bool AskDeleteAll();
+    bool AskUpdateAll(int field, const QString& shownValue);
+    // True when the run went through, or the user ended it on the way.
+    bool DeleteAll();
+    bool UpdateAll(int field, const Value& value);
+
+    // What the last run has changed, as far as it was told.
+    qint64 RecordsDone() const { return done_; }
+
+private:
+    bool Run(Str what, qint64 total, const std::function<bool(const BulkProgress&)>& work);
+
+    DbRecordset& records_;
+    UserPrompt& prompt_;
+    qint64 done_ = 0;
+};
+
+} // namespace mirel

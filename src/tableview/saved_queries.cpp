@@ -1,0 +1,115 @@
+#include "tableview/saved_queries.h"
+
+#include "data/catalog.h"
+#include "data/statement_text.h"
+#include "resources/string_table.h"
+#include "tableview/record_browser.h"
+
+namespace mirel {
+
+using namespace Qt::StringLiterals;
+
+QStringList SavedQueries::Names() const
+{
+    QStringList names;
+    for (const QueryDef& query : store_.Queries())
+        names += query.name.Text();
+    return names;
+}
+
+std::optional<QString> SavedQueries::StatementOf(QStringView name) const
+{
+    const QueryDef* query = std::as_const(store_).FindQuery(name);
+    return query ? std::optional(query->text.Text()) : std::nullopt;
+}
+
+bool SavedQueries::AskIfUnbalanced(const QString& statement)
+{
+    return IsBalanced(statement) ||
+           prompt_.AskYesNo({Str::UnbalancedQuestion,
+                             {StringText(Str::StatementUnbalanced), StringText(Str::ContinueQuestion)}});
+}
+
+bool SavedQueries::Save(const QString& name, const QString& table, const QString& statement, OnExisting existing)
+{
+    QueryDef query;
+    query.SetName(name);
+    query.SetTableName(table);
+    query.SetText(statement);
+    const QString kept = query.name.Text();
+    if (kept.trimmed().isEmpty())
+        return false;
+    // Whether the name is taken is known for certain only under the store's lock, and nobody is asked there.
+    bool replace = existing == OnExisting::Replace;
+    for (;;) {
+        bool taken = false;
+        const bool saved = store_.Apply([&](FormStore& store) {
+            QueryDef* before = store.FindQuery(kept);
+            taken = before && !replace;
+            if (taken)
+                return false;
+            if (before) {
+                before->SetTableName(table);
+                before->SetText(statement);
+            } else {
+                store.AddQuery(query);
+            }
+            return true;
+        });
+        if (saved)
+            return true;
+        if (!taken) {
+            ReportFailure();
+            return false;
+        }
+        if (!prompt_.AskYesNo({Str::QueryExists, {kept}}))
+            return false;
+        replace = true;
+    }
+}
+
+bool SavedQueries::Remove(const QString& name)
+{
+    bool found = false;
+    const bool removed = store_.Apply([&](FormStore& store) { return found = store.RemoveQuery(name); });
+    if (removed)
+        return true;
+    if (found || !store_.LastError().isEmpty())
+        ReportFailure();
+    else
+        prompt_.Show({Str::NoSuchQuery, {name}});
+    return false;
+}
+
+void SavedQueries::ReportFailure()
+{
+    if (CanSave())
+        prompt_.ShowError(store_.LastError());
+    else
+        prompt_.Show({Str::StoreMissing, {}});
+}
+
+QString ShownStatement(const RecordBrowser& browser)
+{
+    const QString& statement = browser.Statement();
+    const QStringList written = SelectList(statement);
+    const std::span<const ResultField> fields = browser.Fields();
+    QStringList shown;
+    for (int i = 0; i < browser.FieldCount(); ++i) {
+        const ResultField& field = fields[size_t(i)];
+        if (!browser.IsVisible(i))
+            continue;
+        if (!field.column.isEmpty()) {
+            const bool renamed = field.name.compare(field.column, Qt::CaseInsensitive) != 0;
+            shown += renamed ? u"%1 AS %2"_s.arg(browser.ReferenceOf(i), FieldReference(field.name))
+                             : browser.ReferenceOf(i);
+        } else if (written.size() == browser.FieldCount()) {
+            shown += written[i];
+        } else {
+            return statement; // an expression beside a "*": there is no name to say it by
+        }
+    }
+    return shown.size() == browser.FieldCount() ? statement : WithSelectList(statement, shown);
+}
+
+} // namespace mirel

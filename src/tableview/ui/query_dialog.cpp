@@ -1,0 +1,38 @@
+#include "tableview/ui/query_dialog.h"
+
+#include "resources/string_table.h"
+
+#include <QDialogButtonBox>
+#include <QLabel>
+#include <QListWidget>
+#include <QVBoxLayout>
+
+namespace mirel {
+
+CQueryDialog::CQueryDialog(const QStringList& names, QWidget* parent)
+    : QDialog(parent)
+    , list_(new QListWidget(this))
+{
+    setWindowTitle(StringText(Str::OpenQueryTitle));
+    list_->addItems(names);
+    list_->setCurrentRow(0);
+    auto* label = new QLabel(StringText(Str::OpenQueryPrompt), this);
+    label->setBuddy(list_);
+    label->setWordWrap(true);
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    auto* column = new QVBoxLayout(this);
+    column->addWidget(label);
+    column->addWidget(list_, 1);
+    column->addWidget(buttons);
+    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    connect(list_, &QListWidget::itemActivated, this, &QDialog::accept);
+    list_->setFocus();
+}
+
+QString CQueryDialog::Chosen() const
+{
+    return list_->currentItem() ? list_->currentItem()->text() : QString();
+}
+
+} // namespace mirel

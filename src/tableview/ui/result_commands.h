@@ -1,0 +1,50 @@
+#pragma once
+
+#include "data/db_connection.h"
+#include "platform/user_prompt.h"
+#include "tableview/record_browser.h"
+#include "tableview/ui/table_command.h"
+
+#include <QObject>
+
+#include <optional>
+
+class QWidget;
+
+namespace mirel {
+
+class FormStore;
+
+// The commands of the table view that work on its result as a whole: filters and sorts put together in a dialog,
+// sums, "Edit All", saved queries, the export. All that it is given must outlive it.
+class ResultCommands : public QObject {
+    Q_OBJECT
+
+public:
+    ResultCommands(RecordBrowser& browser, DbConnection& connection, UserPrompt& prompt, QWidget& view);
+
+    // Where the database keeps its saved queries; null: nowhere.
+    void SetStore(FormStore* store) { store_ = store; }
+
+    bool CanDo(TableCommand command) const;
+    // Empty: it is none of these commands. Otherwise whether it was carried out.
+    std::optional<bool> Do(TableCommand command);
+
+Q_SIGNALS:
+    void queryOpened(const QString& name);
+    void queriesChanged();
+
+private:
+    bool FilterByExpression();
+    bool SortByExpression();
+    bool OpenQuery();
+    bool SaveQuery();
+
+    RecordBrowser& browser_;
+    DbConnection& connection_;
+    UserPrompt& prompt_;
+    QWidget& view_;
+    FormStore* store_ = nullptr;
+};
+
+} // namespace mirel
