@@ -11,7 +11,8 @@
 
 #include <algorithm>
 
-// The result, its edits and its records; the page and the selection are in record_browser_page.cpp.
+// The result and the editor; the page and the selection are in record_browser_page.cpp, what is written in
+// record_browser_changes.cpp.
 
 namespace mirel {
 namespace {
@@ -25,7 +26,8 @@ constexpr int kFirstCountMs = 3;
 
 RecordBrowser::RecordBrowser(DbConnection& connection, QString database, UserPrompt& prompt,
                              TableViewSettings settings)
-    : recordset_(connection)
+    : connection_(connection)
+    , recordset_(connection)
     , prompt_(prompt)
     , database_(std::move(database))
     , settings_(std::move(settings))
@@ -291,87 +293,12 @@ QString RecordBrowser::SelectedText() const
     return edit_.Kind() == EditorKind::Check ? settings_.words.Of(edit_.IsChecked()) : edit_.Text();
 }
 
-bool RecordBrowser::WriteEdit()
-{
-    if (!edit_.IsPending())
-        return true;
-    if (!recordset_.Update(selectedField_, edit_.Stored())) {
-        writeError_ = ProviderErrorText(&recordset_, recordset_.LastResult(), recordset_.ErrorContext());
-        writeFailed_ = true;
-        return false;
-    }
-    generation_ = recordset_.Generation();
-    writeFailed_ = false;
-    edit_.Load(recordset_.FieldValue(selectedField_), TypeOfField(selectedField_),
-               recordset_.FieldSize(selectedField_));
-    RefreshCell();
-    return true;
-}
-
 void RecordBrowser::ShowWriteError()
 {
     if (!writeFailed_)
         return;
     writeFailed_ = false;
     prompt_.ShowError(writeError_);
-}
-
-// --- records ------------------------------------------------------------------------------------------------
-
-// Only what a new record does not have by itself: the store fills in its own keys and defaults.
-std::vector<FieldChange> RecordBrowser::NewRecordValues() const
-{
-    const std::optional<double> today = OleDate(QDate::currentDate().startOfDay());
-    std::vector<FieldChange> values;
-    for (int field = 0; field < FieldCount(); ++field) {
-        if (!IsWritable(field))
-            continue;
-        if (TypeOfField(field) == FieldType::Date && today)
-            values.push_back({field, Value::Date(*today)});
-        else if (TypeOfField(field) == FieldType::YesNo)
-            values.push_back({field, Value::Bool(false)});
-    }
-    return values;
-}
-
-bool RecordBrowser::AddRecord()
-{
-    if (!IsOpen() || FieldCount() == 0 || !WriteEdit())
-        return false;
-    if (!recordset_.AddNew(NewRecordValues())) {
-        ReportFailure();
-        return false;
-    }
-    count_.reset();
-    const qint64 added = Count() - 1;
-    const std::vector<int> fields = VisibleFields();
-    selectedField_ = fields.front();
-    topFieldRow_ = 0;
-    topRow_ = HighestTopRow();
-    ShowRecord(added);
-    FillPage();
-    LoadEditor();
-    return true;
-}
-
-bool RecordBrowser::DeleteRecord()
-{
-    const qint64 record = SelectedRecord();
-    if (record < 0 || !WriteEdit())
-        return false;
-    if (settings_.confirmDelete && !prompt_.AskYesNo({Str::DeleteRecordQuestion, {}}))
-        return false;
-    if (!recordset_.Delete()) {
-        ReportFailure();
-        RunAgain();
-        return false;
-    }
-    count_.reset();
-    topRow_ = std::min(topRow_, HighestTopRow());
-    ShowRecord(std::min(record, Count() - 1));
-    FillPage();
-    LoadEditor();
-    return true;
 }
 
 } // namespace mirel

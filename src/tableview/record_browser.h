@@ -3,13 +3,16 @@
 #include "data/db_recordset.h"
 #include "data/filter_condition.h"
 #include "platform/user_prompt.h"
+#include "tableview/cell_block.h"
 #include "tableview/cell_edit.h"
 #include "tableview/record_page.h"
 #include "tableview/table_view_settings.h"
+#include "tableview/undo_log.h"
 
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <optional>
 #include <vector>
 
@@ -129,9 +132,27 @@ public:
     bool MoveToNextCell();
     bool MoveToPreviousCell();
 
+    // To any cell of the result, with no more scrolling than it takes to show it. Does nothing where the field
+    // has no column.
+    bool GoToCell(qint64 record, int field);
+
     // "2/10000"; "2/…" while the count is unknown. The second: while the scroll bar is dragged to `position`.
     QString CounterText() const;
     QString CounterTextAt(qint64 position) const;
+
+    // --- blocks of cells, in the list -----------------------------------------------------------------------
+
+    // The selected cells: the block, or the selected cell alone; empty without a selection. A block ends with the
+    // next move.
+    CellBlock Block() const;
+    bool HasBlock() const { return block_.has_value(); }
+    // Moves the selected cell, and selects all cells between it and where the block began.
+    bool Extend(const std::function<bool(RecordBrowser&)>& move);
+    bool ExtendToCell(int row, int column);
+    void SelectBlock(const CellBlock& block); // what of it there is; the selected cell stays
+    void SelectAllCells();
+    void SelectWholeRecords(); // those that have selected cells
+    void SelectWholeColumns();
 
     // --- filters and sorts: rewrites of the current statement ---------------------------------------------
 
@@ -166,12 +187,14 @@ public:
     bool HideColumn(); // the selected one
     bool ShowAllColumns();
     bool IsVisible(int field) const { return visible_[size_t(field)]; }
+    std::vector<int> VisibleFields() const;
 
     // --- the editor of the selected cell ------------------------------------------------------------------
 
     QString FieldLabel() const; // "Name:"; empty without a selection
     const CellEdit& Edit() const { return edit_; }
     bool CanEdit() const;
+    bool IsWritable(int field) const;
     bool HasPendingEdit() const { return edit_.IsPending(); }
     // Each makes a pending edit; on a cell that cannot be edited it does nothing.
     void EditText(const QString& text);
@@ -195,6 +218,21 @@ public:
 
     bool AddRecord();
     bool DeleteRecord();
+
+    // What a change of many records came to. Where it stopped early, the records before are written.
+    struct ManyChanged {
+        qint64 records = 0;    // written
+        QString failure;       // why it stopped; empty: it did not, or the user asked for it
+        int refusedField = -1; // whose value was refused; -1: it was no single one
+    };
+    // Writes `count` records from `first` on, as one step to undo; those behind the last are added. `values` is
+    // asked for each, counting from 0. Values are refused rather than cut, whatever an editor would do.
+    ManyChanged ChangeRecords(qint64 first, qint64 count,
+                              const std::function<std::vector<FieldChange>(qint64)>& values, Progress& progress);
+
+    // A pending edit goes first; then what was written, added and deleted, step by step.
+    bool CanUndo() const { return edit_.IsPending() || undo_.CanUndo(); }
+    bool Undo();
 
 private:
     struct ListState {
@@ -227,11 +265,17 @@ private:
     bool MoveToRecord(qint64 record); // stops at either end
     int SelectedFieldOrFirstVisible() const;
     bool MovePages(int direction);
-    std::vector<int> VisibleFields() const;
+    void CollapseBlock();
 
-    bool IsWritable(int field) const;
+    // The records.
     std::vector<FieldChange> NewRecordValues() const;
+    bool ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step& step);
+    bool AddOne(std::vector<FieldChange> values, UndoLog::Step& step);
+    std::optional<RecordChange> NewChange(RecordChange::Kind kind) const; // none: it cannot be undone
+    void NoteAdded(UndoLog::Step& step) const;
+    void NoteDeleted(UndoLog::Step& step);
 
+    DbConnection& connection_;
     DbRecordset recordset_;
     UserPrompt& prompt_;
     QString database_;
@@ -258,11 +302,15 @@ private:
     qint64 detailRecord_ = -1;
     int topFieldRow_ = 0;
     ListState listState_; // while the detail is shown
+    std::optional<CellBlock> block_;
+    CellPlace blockStart_;
+    bool extending_ = false;
 
     CellEdit edit_;
     QString shownLabel_; // of a text in the editor that is none of the record's
     bool writeFailed_ = false;
     QString writeError_;
+    UndoLog undo_;
 };
 
 } // namespace mirel

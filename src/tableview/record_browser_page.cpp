@@ -237,6 +237,7 @@ qint64 RecordBrowser::SelectedRecord() const
 void RecordBrowser::LoadEditor()
 {
     const qint64 record = SelectedRecord();
+    CollapseBlock();
     writeFailed_ = false;
     shownLabel_.clear();
     const bool stands = IsOpen() && record >= 0 && selectedField_ >= 0 && recordset_.MoveTo(record) &&
@@ -269,6 +270,7 @@ bool RecordBrowser::SelectCell(int row, int column)
         return true;
     const bool list = presentation_ == Presentation::List;
     const int field = list ? page_.columns[size_t(column)].field : topFieldRow_ + row;
+    CollapseBlock();
     if (row == SelectedRow() && field == selectedField_)
         return true;
     if (!WriteEdit())
@@ -288,6 +290,7 @@ bool RecordBrowser::MoveToRecord(qint64 record)
     if (presentation_ == Presentation::Detail || record > lastOnPage)
         record = std::min(record, Count() - 1);
     record = std::max<qint64>(record, 0);
+    CollapseBlock();
     if (record == SelectedRecord())
         return true;
     const qint64 top = topRow_;
@@ -330,6 +333,18 @@ bool RecordBrowser::GoToRecord(qint64 number)
     FillPage();
     LoadEditor();
     return true;
+}
+
+bool RecordBrowser::GoToCell(qint64 record, int field)
+{
+    const bool list = presentation_ == Presentation::List;
+    if (record < 0 || field < 0 || field >= FieldCount() || (list && !IsVisible(field)))
+        return true;
+    if (!MoveToRecord(record))
+        return false;
+    if (list)
+        return SelectCell(selectedRow_, page_.ColumnOfField(field));
+    return MoveRows(field - selectedField_);
 }
 
 bool RecordBrowser::MoveRows(qint64 rows)
@@ -478,6 +493,7 @@ bool RecordBrowser::ShowAllColumns()
     visible_.assign(visible_.size(), true);
     RebuildColumns();
     FillPage();
+    CollapseBlock();
     return true;
 }
 
