@@ -27,7 +27,7 @@ bool CellEdit::IsKeptWhole() const
 void CellEdit::SetText(const QString& text)
 {
     text_ = text;
-    pending_ = true;
+    pending_ = text_ != loadedText_; // typed back to what it was
 }
 
 void CellEdit::SetChecked(bool checked)
@@ -42,6 +42,7 @@ void CellEdit::Clear()
         SetChecked(false);
     else
         SetText(QString());
+    pending_ = true; // an empty text becomes NULL
 }
 
 void CellEdit::Revert()

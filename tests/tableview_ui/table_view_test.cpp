@@ -12,6 +12,8 @@
 #include <QCheckBox>
 #include <QClipboard>
 #include <QLineEdit>
+#include <QMimeData>
+#include <QMouseEvent>
 #include <QPlainTextEdit>
 #include <QScrollBar>
 #include <QTest>
@@ -157,6 +159,76 @@ TEST_F(TableView, AddsDeletesRepeatsAndCopiesByKey)
     prompt.answers = {true};
     QTest::keyClick(&view, Qt::Key_Delete, Qt::ControlModifier);
     EXPECT_EQ(browser.CounterText(), u"25/25"_s);
+}
+
+TEST_F(TableView, SelectsBlocksByKeyAndByMouse)
+{
+    Press(Qt::Key_Down, Qt::ShiftModifier);
+    Press(Qt::Key_Right, Qt::ShiftModifier);
+    EXPECT_EQ(browser.Block(), (CellBlock{0, 1, 0, 1}));
+    Press(Qt::Key_Escape);
+    EXPECT_FALSE(browser.HasBlock());
+
+    const QPoint from = grid->CellRect(2, 1).center();
+    const QPoint to = grid->CellRect(4, 2).center();
+    QTest::mousePress(grid->viewport(), Qt::LeftButton, {}, from);
+    QTest::mouseMove(grid->viewport(), to);
+    QMouseEvent move(QEvent::MouseMove, to, grid->viewport()->mapToGlobal(to), Qt::NoButton, Qt::LeftButton, {});
+    QApplication::sendEvent(grid->viewport(), &move);
+    QTest::mouseRelease(grid->viewport(), Qt::LeftButton, {}, to);
+    EXPECT_EQ(browser.Block(), (CellBlock{2, 4, 1, 2}));
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, Qt::ShiftModifier, grid->CellRect(0, 0).center());
+    EXPECT_EQ(browser.Block(), (CellBlock{0, 2, 0, 1})) << "from where it began";
+    QTest::mousePress(grid->viewport(), Qt::RightButton, {}, from);
+    EXPECT_TRUE(browser.HasBlock()) << "its popup menu is for all of it";
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, from);
+    EXPECT_FALSE(browser.HasBlock());
+}
+
+TEST_F(TableView, CopiesPastesAndUndoesByKey)
+{
+    Press(Qt::Key_Down, Qt::ShiftModifier);
+    Press(Qt::Key_Right, Qt::ShiftModifier);
+    QTest::keyClick(&view, Qt::Key_C, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(QApplication::clipboard()->text(), u"Name\tAge\nP1\t21\nP2\t22"_s);
+    QTest::keyClick(&view, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_TRUE(QApplication::clipboard()->mimeData()->hasHtml());
+    Press(Qt::Key_Down);
+    Press(Qt::Key_Left);
+    QTest::keyClick(&view, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(browser.Block(), (CellBlock{2, 3, 0, 1}));
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=22 AND Note='note 4'"_s), u"P2"_s);
+    Press(Qt::Key_Delete);
+    EXPECT_EQ(Stored(u"SELECT Note FROM People WHERE Age IS NULL AND Name IS NULL"_s), u"note 3"_s);
+    QTest::keyClick(&view, Qt::Key_Z, Qt::ControlModifier);
+    QTest::keyClick(&view, Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=24"_s), u"P4"_s);
+    EXPECT_FALSE(ActionOf(Str::ActionUndo)->isEnabled());
+}
+
+TEST_F(TableView, CopiesATextOfSeveralLinesAsOneCell)
+{
+    Run(u"UPDATE People SET Note='one\ntwo' WHERE Name='P1'"_s);
+    QTest::keyClick(&view, Qt::Key_F5);
+    Press(Qt::Key_End);
+    QTest::keyClick(&view, Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(QApplication::clipboard()->text(), u"one\ntwo"_s);
+    Press(Qt::Key_Down);
+    QTest::keyClick(&view, Qt::Key_V, Qt::ControlModifier);
+    EXPECT_EQ(browser.Edit().Text(), u"one\ntwo"_s);
+    EXPECT_TRUE(browser.HasPendingEdit());
+}
+
+TEST_F(TableView, LeavesCtrlZToTheEditorWhileItHasSomethingToUndo)
+{
+    Press(Qt::Key_Delete);
+    Press(Qt::Key_Tab);
+    Press(Qt::Key_F2);
+    Type(u"5"_s);
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Line()->text(), u"21"_s);
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=21"_s), u"P1"_s);
 }
 
 TEST_F(TableView, ScrollsTheWholeResultWithItsBar)

@@ -186,6 +186,12 @@ void CellStrip::ShowCalendar()
 
 bool CellStrip::eventFilter(QObject* watched, QEvent* event)
 {
+    // With nothing of its own to undo the line leaves the key to the window.
+    if (event->type() == QEvent::ShortcutOverride && watched == line_ && !line_->isUndoAvailable() &&
+        static_cast<QKeyEvent*>(event)->matches(QKeySequence::Undo)) {
+        event->ignore();
+        return true;
+    }
     if (event->type() != QEvent::KeyPress)
         return QWidget::eventFilter(watched, event);
     const auto* key = static_cast<QKeyEvent*>(event);

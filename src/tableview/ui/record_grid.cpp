@@ -224,7 +224,9 @@ void RecordGrid::PaintRow(QPainter& painter, int row, const QRect& dirty)
     const QRect band(0, row * rowHeightPx_, viewport()->width(), rowHeightPx_);
     if (!band.intersects(dirty))
         return;
-    if (row == browser_.SelectedRow()) {
+    if (browser_.HasBlock()) {
+        PaintBlock(painter, row, band);
+    } else if (row == browser_.SelectedRow()) {
         const QRect filled = band.intersected(QRect(0, 0, CellRect(row, layout_.Count() - 1).right(), height()));
         painter.fillRect(filled,
                          Blend(palette().color(QPalette::Highlight), palette().color(QPalette::Base), 0.2));
@@ -234,6 +236,16 @@ void RecordGrid::PaintRow(QPainter& painter, int row, const QRect& dirty)
         if (rect.intersects(dirty))
             PaintCell(painter, row, column, rect);
     }
+}
+
+void RecordGrid::PaintBlock(QPainter& painter, int row, const QRect& band) const
+{
+    const CellBlock block = browser_.Block();
+    if (!block.Contains({browser_.ScrollPosition() + row, block.firstColumn}))
+        return;
+    QRect filled = CellRect(row, block.firstColumn).united(CellRect(row, block.lastColumn));
+    filled = filled.intersected(band);
+    painter.fillRect(filled, Blend(palette().color(QPalette::Highlight), palette().color(QPalette::Base), 0.3));
 }
 
 void RecordGrid::PaintCell(QPainter& painter, int row, int column, const QRect& rect)
@@ -322,34 +334,92 @@ void RecordGrid::keyPressEvent(QKeyEvent* event)
         event->ignore();
 }
 
-bool RecordGrid::PressCell(const QPoint& position)
+std::optional<QPoint> RecordGrid::CellAt(const QPoint& position) const
 {
     const int row = RowAt(position.y());
     const int column = layout_.ColumnAt(position.x() + horizontalScrollBar()->value());
     if (row < 0 || row >= browser_.Page().RowCount() || column < 0)
-        return false;
-    Q_EMIT cellPressed(row, column);
-    return true;
+        return {};
+    return QPoint(column, row);
+}
+
+bool RecordGrid::PressCell(const QPoint& position)
+{
+    const std::optional<QPoint> cell = CellAt(position);
+    if (cell)
+        Q_EMIT cellPressed(cell->y(), cell->x());
+    return cell.has_value();
 }
 
 void RecordGrid::mousePressEvent(QMouseEvent* event)
 {
     const QPoint at = event->position().toPoint();
-    if (!PressCell(at) || event->button() != Qt::LeftButton || browser_.Settings().holdTimeMs <= 0)
+    const std::optional<QPoint> cell = CellAt(at);
+    if (!cell)
         return;
-    holdAt_ = at;
-    hold_.start(browser_.Settings().holdTimeMs, this);
+    const bool isLeft = event->button() == Qt::LeftButton;
+    const CellPlace place{browser_.ScrollPosition() + cell->y(), cell->x()};
+    if (!isLeft && browser_.HasBlock() && browser_.Block().Contains(place))
+        return; // its menu is the block's
+    if (isLeft && event->modifiers() == Qt::ShiftModifier)
+        Q_EMIT cellReached(cell->y(), cell->x());
+    else
+        Q_EMIT cellPressed(cell->y(), cell->x());
+    if (!isLeft)
+        return;
+    pressedAt_ = at;
+    // A finger's drag scrolls; only a mouse selects with it.
+    dragging_ = event->source() == Qt::MouseEventNotSynthesized;
+    if (browser_.Settings().holdTimeMs > 0)
+        hold_.start(browser_.Settings().holdTimeMs, this);
 }
 
 void RecordGrid::mouseMoveEvent(QMouseEvent* event)
 {
-    if ((event->position().toPoint() - holdAt_).manhattanLength() >= QApplication::startDragDistance())
+    const QPoint at = event->position().toPoint();
+    if (hold_.isActive()) {
+        if ((at - pressedAt_).manhattanLength() < QApplication::startDragDistance())
+            return;
         hold_.stop();
+    }
+    if (dragging_ && (event->buttons() & Qt::LeftButton))
+        DragTo(at);
+}
+
+void RecordGrid::DragTo(const QPoint& position)
+{
+    constexpr int kDragOnMs = 60;
+    dragAt_ = position;
+    const QRect cells(0, 0, viewport()->width(), browser_.RowsPerPage() * rowHeightPx_);
+    if (!cells.contains(position) && !dragOn_.isActive())
+        dragOn_.start(kDragOnMs, this);
+    const QPoint inside(std::clamp(position.x(), 0, viewport()->width() - 1),
+                        std::clamp(position.y(), 0, cells.bottom()));
+    if (const std::optional<QPoint> cell = CellAt(inside))
+        Q_EMIT cellReached(cell->y(), cell->x());
+}
+
+// Beyond an edge the selection goes on growing, and the page follows it.
+void RecordGrid::DragOnward()
+{
+    const int bottom = browser_.RowsPerPage() * rowHeightPx_;
+    if (dragAt_.y() < 0)
+        Q_EMIT commandRequested(TableCommand::ExtendUp);
+    else if (dragAt_.y() >= bottom)
+        Q_EMIT commandRequested(TableCommand::ExtendDown);
+    if (dragAt_.x() < 0)
+        Q_EMIT commandRequested(TableCommand::ExtendLeft);
+    else if (dragAt_.x() >= viewport()->width())
+        Q_EMIT commandRequested(TableCommand::ExtendRight);
+    if (QRect(0, 0, viewport()->width(), bottom).contains(dragAt_))
+        dragOn_.stop();
 }
 
 void RecordGrid::mouseReleaseEvent(QMouseEvent*)
 {
     hold_.stop();
+    dragOn_.stop();
+    dragging_ = false;
 }
 
 void RecordGrid::mouseDoubleClickEvent(QMouseEvent* event)
@@ -372,12 +442,15 @@ void RecordGrid::contextMenuEvent(QContextMenuEvent* event)
 
 void RecordGrid::timerEvent(QTimerEvent* event)
 {
-    if (event->timerId() != hold_.timerId()) {
+    if (event->timerId() == dragOn_.timerId()) {
+        DragOnward();
+    } else if (event->timerId() == hold_.timerId()) {
+        hold_.stop();
+        dragging_ = false;
+        Q_EMIT popupRequested(viewport()->mapToGlobal(pressedAt_));
+    } else {
         QAbstractScrollArea::timerEvent(event);
-        return;
     }
-    hold_.stop();
-    Q_EMIT popupRequested(viewport()->mapToGlobal(holdAt_));
 }
 
 void RecordGrid::scrollContentsBy(int dx, int)
@@ -408,6 +481,7 @@ bool RecordGrid::viewportEvent(QEvent* event)
     }
     if (event->type() == QEvent::Scroll) {
         hold_.stop();
+        dragging_ = false;
         const auto* scroll = static_cast<QScrollEvent*>(event);
         horizontalScrollBar()->setValue(int(scroll->contentPos().x()));
         Q_EMIT scrollRequested(qint64(scroll->contentPos().y() / rowHeightPx_));

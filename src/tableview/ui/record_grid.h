@@ -38,6 +38,7 @@ Q_SIGNALS:
     void commandRequested(TableCommand command);
     void textTyped(const QString& text);
     void cellPressed(int row, int column);
+    void cellReached(int row, int column); // by a drag of the mouse, or pressed with Shift
     void cellDoubleTapped();
     void popupRequested(const QPoint& globalPosition);
     void headerTapped(int column);
@@ -69,9 +70,14 @@ private:
     void UpdateScrollBars();
     void ScrollToSelectedColumn();
     int RowAt(int y) const { return rowHeightPx_ > 0 ? y / rowHeightPx_ : -1; }
+    // The cell there, in rows and columns of the page; empty: there is none.
+    std::optional<QPoint> CellAt(const QPoint& position) const;
     bool PressCell(const QPoint& position); // false: there is none
+    void DragTo(const QPoint& position);
+    void DragOnward();
 
     void PaintRow(QPainter& painter, int row, const QRect& dirty);
+    void PaintBlock(QPainter& painter, int row, const QRect& band) const;
     void PaintCell(QPainter& painter, int row, int column, const QRect& rect);
     void PaintGridLines(QPainter& painter, const QRect& dirty) const;
     void PaintSelection(QPainter& painter) const;
@@ -87,7 +93,10 @@ private:
     int shownColumn_ = -1;
     bool syncing_ = false;
     QBasicTimer hold_;
-    QPoint holdAt_;
+    QPoint pressedAt_;
+    bool dragging_ = false;
+    QBasicTimer dragOn_; // while the mouse is dragged beyond the cells
+    QPoint dragAt_;
 };
 
 } // namespace mirel

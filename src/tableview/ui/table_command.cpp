@@ -29,6 +29,19 @@ constexpr std::array kKeys = {
     KeyRow{Qt::Key_End, InGrid, TableCommand::LastColumn},
     KeyRow{Qt::CTRL | Qt::Key_Home, InGrid, TableCommand::First},
     KeyRow{Qt::CTRL | Qt::Key_End, InGrid, TableCommand::Last},
+    KeyRow{Qt::SHIFT | Qt::Key_Up, InGrid, TableCommand::ExtendUp},
+    KeyRow{Qt::SHIFT | Qt::Key_Down, InGrid, TableCommand::ExtendDown},
+    KeyRow{Qt::SHIFT | Qt::Key_PageUp, InGrid, TableCommand::ExtendPageUp},
+    KeyRow{Qt::SHIFT | Qt::Key_PageDown, InGrid, TableCommand::ExtendPageDown},
+    KeyRow{Qt::SHIFT | Qt::Key_Left, InGrid, TableCommand::ExtendLeft},
+    KeyRow{Qt::SHIFT | Qt::Key_Right, InGrid, TableCommand::ExtendRight},
+    KeyRow{Qt::SHIFT | Qt::Key_Home, InGrid, TableCommand::ExtendToFirstColumn},
+    KeyRow{Qt::SHIFT | Qt::Key_End, InGrid, TableCommand::ExtendToLastColumn},
+    KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_Home, InGrid, TableCommand::ExtendToFirst},
+    KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_End, InGrid, TableCommand::ExtendToLast},
+    KeyRow{Qt::SHIFT | Qt::Key_Space, InGrid, TableCommand::SelectRecords},
+    KeyRow{Qt::CTRL | Qt::Key_Space, InGrid, TableCommand::SelectColumns},
+    KeyRow{Qt::CTRL | Qt::Key_A, InWindow, TableCommand::SelectAll},
     KeyRow{Qt::CTRL | Qt::Key_PageUp, InGrid | InEditor, TableCommand::Previous},
     KeyRow{Qt::CTRL | Qt::Key_PageDown, InGrid | InEditor, TableCommand::Next},
     KeyRow{Qt::Key_Tab, InGrid | InEditor, TableCommand::NextCell},
@@ -52,7 +65,9 @@ constexpr std::array kKeys = {
     KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_F, InWindow, TableCommand::FilterExpression},
     KeyRow{Qt::Key_F5, InWindow, TableCommand::RunAgain},
     KeyRow{Qt::Key_F6, InWindow, TableCommand::NextPane},
+    KeyRow{Qt::CTRL | Qt::Key_Z, InWindow, TableCommand::Undo},
     KeyRow{Qt::CTRL | Qt::Key_C, InWindow, TableCommand::Copy},
+    KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_C, InWindow, TableCommand::CopyWithNames},
     KeyRow{Qt::CTRL | Qt::Key_V, InWindow, TableCommand::Paste},
     KeyRow{Qt::CTRL | Qt::Key_W, InWindow, TableCommand::Close},
 };
@@ -98,6 +113,11 @@ constexpr std::array kActions = {
     ActionRow{TableCommand::ExportCsv, Str::ActionExportCsv, Str::ActionExportCsvTip, nullptr},
     ActionRow{TableCommand::Layout, Str::ActionLayout, Str::ActionLayoutTip, nullptr},
     ActionRow{TableCommand::Help, Str::ActionHelp, Str::ActionHelpTip, nullptr},
+    ActionRow{TableCommand::Undo, Str::ActionUndo, Str::ActionUndoTip, u"edit-undo"},
+    ActionRow{TableCommand::CopyWithNames, Str::ActionCopyWithNames, Str::ActionCopyWithNamesTip, nullptr},
+    ActionRow{TableCommand::SelectAll, Str::ActionSelectAll, Str::ActionSelectAllTip, nullptr},
+    ActionRow{TableCommand::SelectRecords, Str::ActionSelectRecords, Str::ActionSelectRecordsTip, nullptr},
+    ActionRow{TableCommand::SelectColumns, Str::ActionSelectColumns, Str::ActionSelectColumnsTip, nullptr},
     ActionRow{TableCommand::Copy, Str::ActionCopy, Str::ActionCopyTip, u"edit-copy"},
     ActionRow{TableCommand::Paste, Str::ActionPaste, Str::ActionPasteTip, u"edit-paste"},
     ActionRow{TableCommand::Options, Str::ActionOptions, Str::ActionOptionsTip, u"configure"},
@@ -123,6 +143,10 @@ constexpr std::array<MenuEntry, 16> kFileMenu = {TableCommand::InsertDateTime,
                                                  TableCommand::Help,
                                                  kLine,
                                                  TableCommand::Close};
+constexpr std::array<MenuEntry, 9> kEditMenu = {
+    TableCommand::Undo,         kLine, TableCommand::Copy,      TableCommand::CopyWithNames,
+    TableCommand::Paste,        kLine, TableCommand::SelectAll, TableCommand::SelectRecords,
+    TableCommand::SelectColumns};
 constexpr std::array<MenuEntry, 17> kToolsMenu = {TableCommand::NewRecord,
                                                   TableCommand::DeleteRecord,
                                                   TableCommand::ToggleDetail,
@@ -191,6 +215,11 @@ bool IsToCome(TableCommand command)
 std::span<const MenuEntry> FileMenu()
 {
     return kFileMenu;
+}
+
+std::span<const MenuEntry> EditMenu()
+{
+    return kEditMenu;
 }
 
 std::span<const MenuEntry> ToolsMenu()

@@ -23,6 +23,19 @@ enum class TableCommand {
     ColumnRight,
     FirstColumn,
     LastColumn,
+    ExtendUp,
+    ExtendDown,
+    ExtendPageUp,
+    ExtendPageDown,
+    ExtendLeft,
+    ExtendRight,
+    ExtendToFirstColumn,
+    ExtendToLastColumn,
+    ExtendToFirst,
+    ExtendToLast,
+    SelectAll,
+    SelectRecords,
+    SelectColumns,
     NextCell,
     PreviousCell,
     EditCell,
@@ -36,7 +49,9 @@ enum class TableCommand {
     GoToRecord,
     ToggleDetail,
     RunAgain,
+    Undo,
     Copy,
+    CopyWithNames,
     Paste,
     FilterBySelection,
     FilterExcluding,
@@ -91,6 +106,7 @@ bool IsToCome(TableCommand command);
 // The menus, in groups: an empty entry is a line between two.
 using MenuEntry = std::optional<TableCommand>;
 std::span<const MenuEntry> FileMenu();
+std::span<const MenuEntry> EditMenu();
 std::span<const MenuEntry> ToolsMenu();
 std::span<const MenuEntry> PopupMenu(); // on the grid
 // The menu behind an entry; empty for one that is a command itself.

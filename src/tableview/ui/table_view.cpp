@@ -30,6 +30,7 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
     : QMainWindow(parent)
     , browser_(connection, database, prompt, settings)
     , prompt_(prompt)
+    , blocks_(browser_, prompt)
     , resultCommands_(new ResultCommands(browser_, connection, prompt, *this))
     , stack_(new QStackedWidget(this))
     , grid_(new RecordGrid(browser_, this))
@@ -81,6 +82,8 @@ void CTableView::ConnectParts()
     connect(grid_, &RecordGrid::textTyped, this, [this](const QString& text) { Edit(&text); });
     connect(grid_, &RecordGrid::cellPressed, this,
             [this](int row, int cell) { Settle(browser_.SelectCell(row, cell)); });
+    connect(grid_, &RecordGrid::cellReached, this,
+            [this](int row, int cell) { Settle(browser_.ExtendToCell(row, cell)); });
     connect(grid_, &RecordGrid::cellDoubleTapped, this, [this] { Edit(nullptr); });
     connect(grid_, &RecordGrid::popupRequested, this, &CTableView::ShowPopup);
     connect(grid_, &RecordGrid::headerTapped, this, [this](int column) { Settle(browser_.TapHeader(column)); });

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "tableview/block_commands.h"
 #include "tableview/record_browser.h"
 #include "tableview/ui/table_command.h"
 
@@ -70,8 +71,9 @@ private:
 
     void Edit(const QString* typed); // null: as the cell is
     void Revert();
-    void Copy();
+    void Copy(FieldNames names);
     void Paste();
+    void Clear();
     void GoTo();
     void ChooseOptions();
     void FocusNextPane();
@@ -81,6 +83,7 @@ private:
 
     RecordBrowser browser_;
     UserPrompt& prompt_;
+    BlockCommands blocks_;
     QString title_;
     ResultCommands* resultCommands_;
     QHash<TableCommand, QAction*> actions_;

@@ -20,6 +20,18 @@ namespace {
 
 using Command = TableCommand;
 
+template <int Count>
+bool Rows(RecordBrowser& browser)
+{
+    return browser.MoveRows(Count);
+}
+
+template <int Count>
+bool Columns(RecordBrowser& browser)
+{
+    return browser.MoveColumns(Count);
+}
+
 // What the browser does by itself.
 struct BrowserCall {
     Command command;
@@ -38,9 +50,24 @@ constexpr std::array kBrowserCalls = {
     BrowserCall{Command::ColumnRight, [](RecordBrowser& b) { return b.MoveColumns(1); }},
     BrowserCall{Command::FirstColumn, [](RecordBrowser& b) { return b.MoveToFirstColumn(); }},
     BrowserCall{Command::LastColumn, [](RecordBrowser& b) { return b.MoveToLastColumn(); }},
+    BrowserCall{Command::ExtendUp, [](RecordBrowser& b) { return b.Extend(Rows<-1>); }},
+    BrowserCall{Command::ExtendDown, [](RecordBrowser& b) { return b.Extend(Rows<1>); }},
+    BrowserCall{Command::ExtendPageUp, [](RecordBrowser& b) { return b.Extend(&RecordBrowser::PageUp); }},
+    BrowserCall{Command::ExtendPageDown, [](RecordBrowser& b) { return b.Extend(&RecordBrowser::PageDown); }},
+    BrowserCall{Command::ExtendLeft, [](RecordBrowser& b) { return b.Extend(Columns<-1>); }},
+    BrowserCall{Command::ExtendRight, [](RecordBrowser& b) { return b.Extend(Columns<1>); }},
+    BrowserCall{Command::ExtendToFirstColumn,
+                [](RecordBrowser& b) { return b.Extend(&RecordBrowser::MoveToFirstColumn); }},
+    BrowserCall{Command::ExtendToLastColumn,
+                [](RecordBrowser& b) { return b.Extend(&RecordBrowser::MoveToLastColumn); }},
+    BrowserCall{Command::ExtendToFirst, [](RecordBrowser& b) { return b.Extend(&RecordBrowser::GoToFirst); }},
+    BrowserCall{Command::ExtendToLast, [](RecordBrowser& b) { return b.Extend(&RecordBrowser::GoToLast); }},
+    BrowserCall{Command::SelectAll, [](RecordBrowser& b) { return b.SelectAllCells(), true; }},
+    BrowserCall{Command::SelectRecords, [](RecordBrowser& b) { return b.SelectWholeRecords(), true; }},
+    BrowserCall{Command::SelectColumns, [](RecordBrowser& b) { return b.SelectWholeColumns(), true; }},
+    BrowserCall{Command::Undo, [](RecordBrowser& b) { return b.Undo(); }},
     BrowserCall{Command::NextCell, [](RecordBrowser& b) { return b.MoveToNextCell(); }},
     BrowserCall{Command::PreviousCell, [](RecordBrowser& b) { return b.MoveToPreviousCell(); }},
-    BrowserCall{Command::ClearCell, [](RecordBrowser& b) { return b.ClearCell(), true; }},
     BrowserCall{Command::RepeatAbove, [](RecordBrowser& b) { return b.RepeatAbove(), true; }},
     BrowserCall{Command::InsertDateTime, [](RecordBrowser& b) { return b.InsertCurrentDateTime(), true; }},
     BrowserCall{Command::NewRecord, [](RecordBrowser& b) { return b.AddRecord(); }},
@@ -84,6 +111,7 @@ void CTableView::CreateActions()
 void CTableView::CreateMenus()
 {
     FillMenu(menuBar()->addMenu(StringText(Str::MenuFile)), FileMenu());
+    FillMenu(menuBar()->addMenu(StringText(Str::MenuEdit)), EditMenu());
     FillMenu(menuBar()->addMenu(StringText(Str::MenuTools)), ToolsMenu());
 }
 
@@ -118,8 +146,8 @@ void CTableView::ShowActions()
     const bool hasRecord = browser_.SelectedRecord() >= 0;
     for (const TableCommand command :
          {Command::First, Command::Previous, Command::Next, Command::Last, Command::GoToRecord, Command::Copy,
-          Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection, Command::FilterExcluding,
-          Command::SortAscending, Command::SortDescending})
+          Command::CopyWithNames, Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection,
+          Command::FilterExcluding, Command::SortAscending, Command::SortDescending})
         ActionOf(command)->setEnabled(hasRecord);
     for (const TableCommand command :
          {Command::FilterExpression, Command::SortExpression, Command::EditAll, Command::DeleteAll,
@@ -127,8 +155,10 @@ void CTableView::ShowActions()
           Command::OpenQuery, Command::SaveQuery, Command::ExportCsv})
         ActionOf(command)->setEnabled(resultCommands_->CanDo(command));
     ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
-    for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove, Command::Paste})
+    for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove})
         ActionOf(command)->setEnabled(browser_.CanEdit());
+    ActionOf(Command::Paste)->setEnabled(browser_.CanUpdate());
+    ActionOf(Command::Undo)->setEnabled(browser_.CanUndo());
     ActionOf(Command::NewRecord)->setEnabled(browser_.CanUpdate());
     ActionOf(Command::DeleteRecord)->setEnabled(hasRecord && browser_.CanUpdate());
     ActionOf(Command::HideColumn)->setEnabled(browser_.CanHideColumn());
@@ -137,6 +167,8 @@ void CTableView::ShowActions()
     ActionOf(Command::Zoom)->setText(StringText(zoomed_ ? Str::ZoomBack : Str::ZoomIn));
 
     const bool list = browser_.CurrentPresentation() == Presentation::List;
+    for (const TableCommand command : {Command::SelectAll, Command::SelectRecords, Command::SelectColumns})
+        ActionOf(command)->setEnabled(hasRecord && list);
     QAction* detail = ActionOf(Command::ToggleDetail);
     detail->setEnabled(browser_.IsOpen());
     detail->setText(StringText(list ? Str::ActionDetail : Str::ActionList));
@@ -163,7 +195,11 @@ void CTableView::Do(TableCommand command)
     case Command::GoToRecord:
         return GoTo();
     case Command::Copy:
-        return Copy();
+        return Copy(FieldNames::Without);
+    case Command::CopyWithNames:
+        return Copy(FieldNames::With);
+    case Command::ClearCell:
+        return Clear();
     case Command::Paste:
         return Paste();
     case Command::FitColumn:

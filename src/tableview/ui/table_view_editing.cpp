@@ -7,6 +7,7 @@
 
 #include <QClipboard>
 #include <QGuiApplication>
+#include <QMimeData>
 #include <QPlainTextEdit>
 #include <QStackedWidget>
 
@@ -15,6 +16,12 @@
 namespace mirel {
 
 using Command = TableCommand;
+
+namespace {
+
+const QString kCellsFormat = QStringLiteral("application/x-mirel-cells");
+
+} // namespace
 
 void CTableView::Edit(const QString* typed)
 {
@@ -35,6 +42,8 @@ void CTableView::Edit(const QString* typed)
 
 void CTableView::Revert()
 {
+    if (!browser_.HasPendingEdit())
+        browser_.SelectBlock({});
     browser_.RevertEdit();
     ShowState();
     if (stack_->currentWidget() == zoomEdit_)
@@ -43,17 +52,46 @@ void CTableView::Revert()
         grid_->setFocus();
 }
 
-void CTableView::Copy()
+// Beside the words that any program takes, the cells as we read them back: a text of several lines is one cell.
+void CTableView::Copy(FieldNames names)
 {
-    QGuiApplication::clipboard()->setText(browser_.SelectedText());
+    constexpr qsizetype kMostHtmlCells = 200'000;
+    if (browser_.HasBlock() && !Settle(browser_.WriteEdit()))
+        return;
+    const std::optional<TextRows> rows = blocks_.Copy(names);
+    if (!rows)
+        return;
+    const QString text = TextOfRows(*rows);
+    const bool isOne = rows->size() == 1 && rows->front().size() == 1;
+    auto* copied = new QMimeData;
+    copied->setText(isOne ? rows->front().front() : text);
+    copied->setData(kCellsFormat, text.toUtf8());
+    if (!isOne && qsizetype(rows->size()) * rows->front().size() <= kMostHtmlCells)
+        copied->setHtml(HtmlOfRows(*rows));
+    QGuiApplication::clipboard()->setMimeData(copied);
 }
 
 void CTableView::Paste()
 {
-    QString text = QGuiApplication::clipboard()->text();
-    if (text.endsWith(u'\n')) // a cell copied elsewhere comes as a line
-        text.chop(1);
-    browser_.EditText(text);
+    const QMimeData* copied = QGuiApplication::clipboard()->mimeData();
+    const bool isOwn = copied->hasFormat(kCellsFormat);
+    if (!isOwn && !copied->hasText())
+        return;
+    const TextRows rows = RowsOfText(isOwn ? QString::fromUtf8(copied->data(kCellsFormat)) : copied->text());
+    const bool isOne = rows.size() == 1 && rows.front().size() == 1;
+    if (isOne && !browser_.HasBlock() && browser_.CanEdit() && browser_.Edit().Kind() != EditorKind::Check)
+        browser_.EditText(rows.front().front()); // pending: Escape gives the old value back
+    else
+        Settle(blocks_.Paste(rows));
+    ShowState();
+}
+
+void CTableView::Clear()
+{
+    if (browser_.HasBlock())
+        Settle(blocks_.Clear());
+    else
+        browser_.ClearCell();
     ShowState();
 }
 
