@@ -37,6 +37,13 @@ public:
     virtual ~UserPrompt() = default;
 
     virtual bool AskYesNo(const UserMessage& question) = 0;
+    // A yes/no question that offers one more answer, in the words of `third`. Who cannot offer it asks yes or no.
+    enum class Answer { No, Yes, Third };
+    virtual Answer AskYesNoOr(const UserMessage& question, const UserMessage& third)
+    {
+        (void)third;
+        return AskYesNo(question) ? Answer::Yes : Answer::No;
+    }
     virtual void Show(const UserMessage& message) = 0;
     // A text whose words are not one row of the string table: a failure of the provider, with its context.
     virtual void ShowError(const QString& text) = 0;
