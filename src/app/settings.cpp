@@ -52,6 +52,8 @@ constexpr std::array kSettings = {
                u"sort by tapping a column header"},
     SettingRow{Setting::FormViewConfirmSave, u"FormView", u"confirmSave", Integer, u"1",
                u"ask before saving changes"},
+    SettingRow{Setting::FormViewSaveAnswer, u"FormView", u"saveAsThirdAnswer", Integer, u"0",
+               u"that question can be answered by saving, too"},
     SettingRow{Setting::FormViewUpdateAggregate, u"FormView", u"updateAggregate", Integer, u"0",
                u"bring aggregate fields up to date"},
     SettingRow{Setting::FormViewYesNo, u"FormView", u"yesnoString", YesNo, u"Yes/No",

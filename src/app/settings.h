@@ -41,6 +41,7 @@ enum class Setting {
     FormViewHoldingTime,
     FormViewSortColumn,
     FormViewConfirmSave,
+    FormViewSaveAnswer,
     FormViewUpdateAggregate,
     FormViewYesNo,
 };

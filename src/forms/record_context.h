@@ -20,6 +20,7 @@ public:
     RecordContext(DbRecordset& records, YesNoWords words, ControlTexts controlTexts);
 
     void ResultChanged();
+    void SetWords(YesNoWords words) { words_ = std::move(words); }
 
     void BeginEvaluation() override;
     qint64 Position() override;

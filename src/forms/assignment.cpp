@@ -1,0 +1,115 @@
+#include "forms/assignment.h"
+
+#include "data/catalog.h"
+#include "expr/evaluator.h"
+#include "expr/expr_parser.h"
+#include "platform/user_locale.h"
+#include "provider/conversion.h"
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+// The language's rule for Yes/No: the first character decides.
+bool IsTrueText(QStringView text)
+{
+    return !text.isEmpty() && (text[0] == u'1' || text[0] == u'T' || text[0] == u't');
+}
+
+// What the expression comes to, before it is made to fit the field.
+struct Result {
+    QString text;
+    const ExprNode* node = nullptr; // null: the text alone, as a control shows it
+
+    bool IsNumber() const { return node && !node->null && !node->isText; }
+    bool IsDate() const { return node && !node->null && node->isText && node->fieldType == FieldType::Date; }
+    bool IsYesNoField() const { return node && !node->null && node->fieldType == FieldType::YesNo; }
+};
+
+Result Evaluated(FieldAssignment& assignment, EvalContext& context, const TextOfControl& controlText)
+{
+    if (!assignment.controlName.isEmpty())
+        return {controlText(assignment.controlName), nullptr};
+    if (!assignment.tree)
+        return {};
+    EvaluateExpression(context, *assignment.tree);
+    return {ShownText(*assignment.tree), assignment.tree.get()};
+}
+
+bool TruthOf(const Result& result)
+{
+    return result.IsYesNoField() ? result.node->valueNumber != 0 : IsTrueText(result.text.trimmed());
+}
+
+Value Unconverted(const Result& result, FieldType type)
+{
+    if (type == FieldType::YesNo)
+        return Value::Bool(TruthOf(result));
+    if (IsText(type))
+        return result.text.isEmpty() ? Value::Null() : Value::Text(result.text);
+    const QString text = result.text.trimmed();
+    if (text.isEmpty())
+        return Value::Null();
+    if (type == FieldType::Double && result.IsNumber())
+        return Value::Double(result.node->valueNumber);
+    if (type == FieldType::Date && result.IsDate())
+        return Value::Date(result.node->valueNumber);
+    return Value::Text(text);
+}
+
+// Whether the text may stand bare among the values of an INSERT: it can then say nothing but a number.
+bool IsBareNumber(const QString& text)
+{
+    Value number;
+    return !text.isEmpty() && !Failed(ConvertForColumn(Value::Text(text), FieldType::Double, -1, number));
+}
+
+} // namespace
+
+FieldAssignment ParseAssignment(const SourceAssignment& source)
+{
+    FieldAssignment assignment;
+    assignment.target = SplitTarget(source.target);
+    assignment.tree = ParseExpression(source.value, ExprMode::Condition);
+    if (assignment.tree && assignment.tree->code == OpCode::Control)
+        assignment.controlName = assignment.tree->text;
+    return assignment;
+}
+
+void CollectControlNames(const ExprNode& tree, QStringList& names)
+{
+    if (tree.code == OpCode::Control)
+        names += tree.text;
+    for (const ExprTree& argument : tree.args) {
+        if (argument)
+            CollectControlNames(*argument, names);
+    }
+}
+
+Hr ValueToStore(FieldAssignment& assignment, EvalContext& context, const TextOfControl& controlText, Value& value)
+{
+    const Result result = Evaluated(assignment, context, controlText);
+    return ConvertForColumn(Unconverted(result, assignment.type), assignment.type, assignment.size, value);
+}
+
+QString LiteralToInsert(FieldAssignment& assignment, EvalContext& context, const TextOfControl& controlText)
+{
+    if (IsBinary(assignment.type) || assignment.type == FieldType::None)
+        return {};
+    const Result result = Evaluated(assignment, context, controlText);
+    if (IsText(assignment.type))
+        return QuoteText(result.text);
+    const QString text = result.text.trimmed();
+    if (text.isEmpty())
+        return u"NULL"_s;
+    if (assignment.type == FieldType::Date)
+        return QuoteText(text);
+    if (assignment.type == FieldType::YesNo && result.IsYesNoField())
+        return TruthOf(result) ? u"1"_s : u"0"_s;
+    if (assignment.type == FieldType::Double && result.IsNumber())
+        return NumberText(result.node->valueNumber);
+    return IsBareNumber(text) ? text : QuoteText(text); // quoted, for the store to read or to refuse
+}
+
+} // namespace mirel

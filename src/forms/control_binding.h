@@ -1,0 +1,50 @@
+#pragma once
+
+#include "expr/expr_node.h"
+#include "forms/control_source.h"
+#include "forms/form_context.h"
+#include "forms/form_records.h"
+
+#include <QString>
+
+#include <vector>
+
+namespace mirel {
+
+// What a control computes: the trees of its ControlSource, made once when the form is opened.
+struct ControlBinding {
+    struct Column {
+        QString name;
+        ExprTree tree; // null: the column is empty
+    };
+    struct Aggregate {
+        ExprNode* node; // in `tree`
+    };
+
+    ExprTree tree; // null: the control shows what is put into it
+    bool wholeResult = false;
+    std::vector<Aggregate> aggregates; // the outermost ones of `tree`
+    std::vector<Column> columns;       // of a list
+    DropDownSource dropDown;
+    bool isMaybeItem = false; // of a drop-down box: `tree` is an item instead, where no field bears its name
+
+    QString recordText; // what the record gave it last
+    bool recordTicked = false;
+    qint64 shownRecord = -1;
+};
+
+ControlBinding BindControl(const ControlDef& control);
+
+// The result's column when the tree is a field's name and nothing else; -1 otherwise.
+int ColumnOf(const ExprNode* tree, EvalContext& context);
+// The column that the control shows: that of its tree, and for a check box the field that its condition
+// compares. -1: none, or more than that.
+int ShownColumn(const ControlBinding& binding, ControlType type, FormContext& context);
+
+// The tree's value on the context's record as a control shows it. A field alone shows its number as the store
+// has it, not through six decimals: saving it back changes nothing.
+QString TextOnRecord(ExprNode& tree, EvalContext& context);
+// Whether a check box is ticked: its condition holds, or its value is the true word or a number other than 0.
+bool HoldsOnRecord(ExprNode& tree, EvalContext& context);
+
+} // namespace mirel

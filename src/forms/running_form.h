@@ -1,0 +1,211 @@
+#pragma once
+
+#include "data/db_connection.h"
+#include "data/db_recordset.h"
+#include "data/filter_condition.h"
+#include "forms/assignment.h"
+#include "forms/control_binding.h"
+#include "forms/control_run.h"
+#include "forms/form_host.h"
+#include "forms/form_query.h"
+#include "forms/form_result.h"
+#include "forms/form_store.h"
+#include "forms/form_view_settings.h"
+#include "platform/user_prompt.h"
+
+#include <QDateTime>
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+#include <functional>
+#include <optional>
+#include <span>
+#include <vector>
+
+namespace mirel {
+
+// What a running form works with. All of it must outlive the form.
+struct FormEnvironment {
+    DbConnection& connection;
+    QString database;       // the file's full path
+    const FormStore& store; // where CALL FORM looks
+    UserPrompt& prompt;
+    FormHost& host;
+    FormViewSettings settings;
+    QString activeTable; // the table that the main view has active: an insert button's; may be empty
+    std::function<QDateTime()> clock = &QDateTime::currentDateTime;
+};
+
+enum class SortOrder { Ascending, Descending };
+
+// A form as it runs: its controls with what they show, an open result and a current record in it, and all that
+// the user can do with them; without a window.
+//
+// Controls count from 0 in the form's list order; records and rows count from 0. The result stands on the current
+// record at all times. A failure of the provider is reported through the prompt before the call returns; a
+// result that could not be opened is then closed, and the controls are empty.
+//
+// A call that leaves the current record asks first when the record is dirty; the user's No stops it, and nothing
+// has changed then.
+class RunningForm {
+public:
+    // How a call ended. Stopped: the user said No. Failed: it could not be done, and the user was told where
+    // there is something to tell.
+    enum class Outcome { Done, Stopped, Failed };
+
+    RunningForm(FormCall call, FormEnvironment environment);
+    ~RunningForm();
+    Q_DISABLE_COPY_MOVE(RunningForm)
+
+    // Opens the first result and shows its first record, or the one that the call names. Once, before all else.
+    // False when the result could not be opened; the form runs all the same.
+    bool Open();
+
+    const FormDef& Form() const { return form_; }
+    QString Title() const { return form_.name.Text(); }
+    const FormViewSettings& Settings() const { return environment_.settings; }
+    void ChangeSettings(const FormViewSettings& settings);
+
+    // --- what is shown ------------------------------------------------------------------------------------
+
+    std::span<const ControlRun> Controls() const { return controls_; }
+    int FindControl(QStringView name) const; // the first that can hold a value, else the first; -1: none
+    // Grows with every change of any control, and of what is told below.
+    quint64 Revision() const { return revision_; }
+
+    bool HasResult() const { return result_.IsOpen(); }
+    qint64 RecordCount() const { return result_.Count(); }   // -1: no result
+    qint64 CurrentRecord() const { return result_.Index(); } // -1: none
+    QString CounterText() const;                             // "3/12", "0/0"; empty without a result
+    bool IsDirty() const { return dirty_; }
+    bool CanUpdate() const;
+    const QString& CurrentQuery() const { return result_.Query(); }
+
+    // The texts of a list's rows, a QStringList a row, uncut. Fewer than asked for at the end.
+    std::vector<QStringList> ListRows(int control, qint64 first, int count);
+
+    // --- what the user does to controls -------------------------------------------------------------------
+
+    void SetText(int control, const QString& text); // edit boxes and drop-down boxes
+    void SetTicked(int control, bool ticked);       // check boxes
+    Outcome SelectListRow(int control, qint64 row);
+    // Orders the result by the column's field, and the other way round with the next tap on the same column. Does
+    // nothing on an expression.
+    Outcome TapListHeader(int control, int column);
+    Outcome PressButton(int control);
+    // Reads the items of a drop-down box anew, before its list is shown: its query may name other controls.
+    void RefreshItems(int control);
+    // The button that saves; -1: the form has none.
+    int FirstUpdateButton() const;
+
+    // --- moving, adding, deleting -------------------------------------------------------------------------
+
+    Outcome GoToFirst();
+    Outcome GoToPrevious(); // on the first record it is Done and stays
+    Outcome GoToNext();     // on the last one it has Failed
+    Outcome GoToLast();
+    Outcome GoToRecord(qint64 record);
+    Outcome AddRecord();
+    Outcome DeleteRecord();
+    // Asks about unsaved changes, tells the host what changed and that it is to close.
+    Outcome Close();
+    // Asks about unsaved changes alone. True: whoever asked may go on.
+    bool LeaveRecordCheck();
+
+    // --- time ---------------------------------------------------------------------------------------------
+
+    bool HasClock() const; // then call Tick once a second
+    void Tick();
+
+    void RecomputeAggregates();
+
+    // --- filter and sort of the result ----------------------------------------------------------------------
+
+    // The result's field that a control shows; -1: none, or an expression.
+    int FieldOfControl(int control) const;
+    // By what the current record holds in the control's field. Do nothing where there is no such field.
+    Outcome FilterByControl(int control, CellFilter filter);
+    Outcome SortByControl(int control, SortOrder order);
+    Outcome AddCondition(const QString& condition);
+    Outcome SortByTerms(const QString& terms);
+    bool IsFiltered() const { return !result_.Conditions().isEmpty(); }
+    const QStringList& Conditions() const { return result_.Conditions(); }
+    Outcome RemoveFilter(); // back to the query that was run, its order included
+
+    // --- the result as records: for the list, zoom and detail modes -----------------------------------------
+
+    std::span<const ResultField> Fields() const { return result_.Records().Fields(); }
+    QString FieldText(int field) const; // of the current record, uncut, as the grid shows it
+
+private:
+    enum class Clearing { Record, Aggregates };
+
+    // Making the controls.
+    void BuildControls();
+    void MarkUpdateReferences();
+    QStringList ItemsOf(const ControlBinding& binding, bool& failed);
+    void FillDropDown(size_t control, bool& failed);
+    void FillDropDowns();
+
+    // The result.
+    bool OpenFirstResult();
+    bool MayRun(const QString& statement);
+    Outcome RunQuery(const QString& query, qint64 record);
+    Outcome LeaveAndMoveTo(qint64 record);
+    // Runs `rewrite` on the result after the leave-record check, and shows what came of it.
+    template <typename Rewrite>
+    Outcome Rearrange(Rewrite rewrite);
+    Outcome SortByField(int field, SortOrder order);
+    bool NewRecordValues(std::vector<FieldChange>& values);
+    void DataHasChanged();
+    void ReportRefusedField(int field, Hr hr);
+
+    // Showing.
+    void ShowRecord();
+    void ShowResult(); // aggregates and lists as well
+    void ShowControl(size_t control);
+    void ShowText(ControlRun& control, const QString& text);
+    void ShowTicked(ControlRun& control, bool ticked);
+    void ShowList(ControlRun& control);
+    void ClearControls(Clearing what); // those that show the record, or those that show the whole result
+    void Touch(ControlRun& control);
+    void MarkEdited(ControlRun& control, bool edited);
+    void ForgetEdits();
+
+    // Controls by name.
+    bool Is(int control, ControlType type) const;
+    int FindInput(QStringView name) const; // -1: no control of that name holds a value
+    QString ControlText(QStringView name) const;
+    ControlTextOf TextsForQueries() const;
+
+    // Buttons.
+    Outcome RunButton(const ControlDef& button);
+    Outcome RunSelect(const ControlDef& button);
+    Outcome RunUpdate(const ControlDef& button, qint64 first, qint64 last);
+    Outcome RunInsert(const ControlDef& button);
+    Outcome RunCallForm(const ControlDef& button);
+    Outcome RunClearForm();
+    Outcome RunRecalc();
+    std::vector<FieldAssignment> AssignmentsOf(const ControlDef& button);
+    int FieldOfTarget(const TargetName& target);
+    bool UpdateInBulk(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
+    bool UpdateRecords(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
+    bool UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written);
+    bool IsUntouched(const FieldAssignment& assignment) const;
+    void TellDataChanged();
+
+    FormDef form_;
+    QString callQuery_;
+    qint64 callRecord_;
+    FormEnvironment environment_;
+    std::vector<ControlRun> controls_;
+    std::vector<ControlBinding> bindings_; // one a control
+    QHash<QString, int> inputs_;           // controls by name, those that hold a value first
+    FormResult result_;
+    bool dirty_ = false;
+    bool dataChanged_ = false;
+    quint64 revision_ = 0;
+};
+
+} // namespace mirel
