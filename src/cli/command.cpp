@@ -17,6 +17,8 @@ constexpr std::array kImportOptions = {
 };
 constexpr std::array kEvalOptions = {Opt::Database, Opt::Source, Opt::Record, Opt::All,    Opt::Condition,
                                      Opt::Control,  Opt::Format, Opt::Tree,   Opt::Explain};
+constexpr std::array kShowOptions = {Opt::Query, Opt::Record, Opt::Set, Opt::Press, Opt::Yes, Opt::Format};
+constexpr std::array kNameOptions = {Opt::Name};
 constexpr std::array kImportNeeds = {Opt::Table};
 
 constexpr std::array kCommands = {
@@ -33,6 +35,29 @@ constexpr std::array kCommands = {
     CommandDef{"fields", "DB TABLE", "list the fields of a table", kFormatOptions, {}, RunFields},
     CommandDef{"import", "DB FILE", "read a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
     CommandDef{"eval", "EXPRESSION", "the value of an expression", kEvalOptions, {}, RunEval, "text|json"},
+    CommandDef{"forms list",
+               "DB",
+               "list the forms with their tables and numbers of controls",
+               kFormatOptions,
+               {},
+               RunFormsList},
+    CommandDef{"forms default", "DB TABLE", "make the default form of a table", {}, {}, RunFormsDefault},
+    CommandDef{"forms show",
+               "DB NAME",
+               "run a form: set controls, press buttons, print what it shows",
+               kShowOptions,
+               {},
+               RunFormsShow,
+               "table|json"},
+    CommandDef{"forms dump",
+               "DB-OR-FILE",
+               "print all that a database's forms or a form file hold, as JSON",
+               {},
+               {},
+               RunFormsDump},
+    CommandDef{"forms export", "DB NAME FILE", "write a form file", kDropOptions, {}, RunFormsExport},
+    CommandDef{"forms import", "DB FILE", "add the form of a form file", kNameOptions, {}, RunFormsImport},
+    CommandDef{"forms delete", "DB NAME", "delete a form", kDropOptions, kDropOptions, RunFormsDelete},
     CommandDef{"config get", "SECTION KEY", "print a setting", {}, {}, RunConfigGet},
     CommandDef{"config set", "SECTION KEY VALUE", "change a setting", {}, {}, RunConfigSet},
 };

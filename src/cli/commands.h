@@ -21,6 +21,17 @@ ExitStatus RunImport(Run& run);
 // eval_command.cpp
 ExitStatus RunEval(Run& run);
 
+// form_commands.cpp
+ExitStatus RunFormsList(Run& run);
+ExitStatus RunFormsDefault(Run& run);
+ExitStatus RunFormsDump(Run& run);
+ExitStatus RunFormsExport(Run& run);
+ExitStatus RunFormsImport(Run& run);
+ExitStatus RunFormsDelete(Run& run);
+
+// form_show_command.cpp
+ExitStatus RunFormsShow(Run& run);
+
 // config_commands.cpp
 ExitStatus RunConfigGet(Run& run);
 ExitStatus RunConfigSet(Run& run);

@@ -37,6 +37,10 @@ enum class Opt {
     Control,
     Tree,
     Explain,
+    Query,
+    Set,
+    Press,
+    Name,
 };
 
 // What an option's value has to be; a value that is not is refused before the command runs.

@@ -198,9 +198,12 @@ int RunningForm::FindInput(QStringView name) const
 QString RunningForm::ControlText(QStringView name) const
 {
     const int found = FindInput(name);
-    if (found < 0)
-        return {};
-    const ControlRun& control = controls_[size_t(found)];
+    return found < 0 ? QString() : ShownText(found);
+}
+
+QString RunningForm::ShownText(int index) const
+{
+    const ControlRun& control = controls_[size_t(index)];
     if (control.type == ControlType::CheckBox)
         return control.ticked ? u"1"_s : u"0"_s;
     return control.text;

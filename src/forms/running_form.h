@@ -71,6 +71,8 @@ public:
 
     std::span<const ControlRun> Controls() const { return controls_; }
     int FindControl(QStringView name) const; // the first that can hold a value, else the first; -1: none
+    // What a control holds as one text: "1" or "0" for a check box, nothing for a list.
+    QString ShownText(int control) const;
     // Grows with every change of any control, and of what is told below.
     quint64 Revision() const { return revision_; }
 

@@ -1,0 +1,36 @@
+#include "forms/form_file.h"
+
+#include "forms/form_store.h"
+#include "resources/string_table.h"
+
+namespace mirel {
+
+bool ExportForm(const FormDef& form, const QString& path, QString& error)
+{
+    FormStore file(path);
+    FormDef copy;
+    copy.CopyFrom(form);
+    file.AddForm(std::move(copy));
+    if (file.Save())
+        return true;
+    error = file.LastError();
+    return false;
+}
+
+std::optional<FormDef> ImportForm(const QString& path, QString& error)
+{
+    FormStore file(path);
+    if (!file.Load()) {
+        error = file.LastError();
+        return {};
+    }
+    if (file.Forms().empty()) {
+        error = StringText(Str::FormFileIsEmpty, {path});
+        return {};
+    }
+    FormDef form;
+    form.CopyFrom(file.Forms().front());
+    return form;
+}
+
+} // namespace mirel
