@@ -6,6 +6,7 @@
 #include "app/ui/lumo_view.h"
 #include "app/ui/shell_actions.h"
 #include "platform/ui/file_choice.h"
+#include "platform/ui/menu_keys.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/table_view.h"
@@ -80,7 +81,7 @@ void CMainFrame::MakeMenus()
                                                {ShellMenu::Help, help}};
     for (const auto& [id, menu] : menus) {
         menu->setToolTipsVisible(true); // they say why an entry cannot be chosen
-        LeaveOutKeysWhenSmall(menu);
+        LeaveOutKeysWhenSmall(*menu, *this);
     }
     for (const ShellCommandDef& definition : ShellCommands()) {
         const auto menu = menus.find(definition.menu);
@@ -94,16 +95,6 @@ void CMainFrame::MakeMenus()
     }
     database->addMenu(recentMenu_);
     connect(recentMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
-}
-
-// On a handheld a menu with its column of keys is wider than the screen.
-void CMainFrame::LeaveOutKeysWhenSmall(QMenu* menu)
-{
-    connect(menu, &QMenu::aboutToShow, this, [this, menu] {
-        if (IsHandheldSize(size()))
-            actions_->HideKeys(menu->actions());
-    });
-    connect(menu, &QMenu::aboutToHide, actions_, &ShellActions::ShowKeys);
 }
 
 void CMainFrame::FillRecentMenu()

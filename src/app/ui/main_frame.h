@@ -38,7 +38,6 @@ protected:
 
 private:
     void MakeMenus();
-    void LeaveOutKeysWhenSmall(QMenu* menu);
     void FillRecentMenu();
     void Run(ShellCommand id);
     QString ChooseDatabase(Str title, Str accept, FileUse use);

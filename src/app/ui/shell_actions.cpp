@@ -23,21 +23,9 @@ ShellActions::ShellActions(QObject* parent)
         action->setCheckable(id == ShellCommand::OpenByDoubleClicking);
         action->setMenuRole(QAction::NoRole);
         connect(action, &QAction::triggered, this, [this, id] { Q_EMIT Given(id); });
+        action->setShortcut(QKeySequence(TextOf(definition.keys), QKeySequence::PortableText));
         actions_.emplace(id, action);
     }
-    ShowKeys();
-}
-
-void ShellActions::HideKeys(const QList<QAction*>& actions)
-{
-    for (QAction* action : actions)
-        action->setShortcut({});
-}
-
-void ShellActions::ShowKeys()
-{
-    for (const ShellCommandDef& definition : ShellCommands())
-        Of(definition.id)->setShortcut(QKeySequence(TextOf(definition.keys), QKeySequence::PortableText));
 }
 
 void ShellActions::Follow(const MainViewState& state)

@@ -18,10 +18,6 @@ public:
     QAction* Of(ShellCommand id) const { return actions_.at(id); }
     void Follow(const MainViewState& state);
 
-    // Takes these actions' keys away for a while, and gives all back.
-    void HideKeys(const QList<QAction*>& actions);
-    void ShowKeys();
-
 Q_SIGNALS:
     void Given(mirel::ShellCommand id);
 

@@ -1,6 +1,7 @@
 #include "tableview/ui/field_chooser.h"
 
 #include "resources/string_table.h"
+#include "tableview/ui/pick_box.h"
 
 #include <QComboBox>
 #include <QFormLayout>
@@ -10,11 +11,11 @@
 
 namespace mirel {
 
-FieldChooser::FieldChooser(FieldLists& lists, QWidget* parent)
+FieldChooser::FieldChooser(FieldLists& lists, Use use, QWidget* parent)
     : QWidget(parent)
     , lists_(lists)
     , tables_(new QComboBox(this))
-    , fields_(new QComboBox(this))
+    , fields_(use == Use::ToPick ? new PickBox(this) : new QComboBox(this))
 {
     auto* form = new QFormLayout(this);
     form->setContentsMargins({});

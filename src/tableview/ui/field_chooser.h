@@ -14,7 +14,9 @@ class FieldChooser : public QWidget {
     Q_OBJECT
 
 public:
-    FieldChooser(FieldLists& lists, QWidget* parent);
+    // ToPick: fields are taken into a text, each time anew (see PickBox); else one of them is chosen.
+    enum class Use { ToChoose, ToPick };
+    FieldChooser(FieldLists& lists, Use use, QWidget* parent);
 
     QString Table() const;
     QString Field() const;

@@ -2,9 +2,11 @@
 
 #include "data/catalog.h"
 #include "platform/ole_date.h"
+#include "platform/ui/scrolled_page.h"
 #include "platform/user_locale.h"
 #include "resources/string_table.h"
 #include "tableview/ui/field_chooser.h"
+#include "tableview/ui/pick_box.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -15,7 +17,6 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPlainTextEdit>
-#include <QScrollArea>
 #include <QStackedWidget>
 #include <QTabWidget>
 #include <QTimer>
@@ -33,10 +34,9 @@ const QStringList kExpressionOperators = {u"="_s,  u"<>"_s,      u">"_s,       u
                                           u"IN"_s, u"BETWEEN"_s, u"IS TRUE"_s, u"IS FALSE"_s};
 const QStringList kExpressionWords = {u"AND"_s, u"OR"_s, u"NOT"_s};
 
-// A box from which words are typed into the expression; it shows what it is for, never what was taken last.
 QComboBox* WordBox(const QStringList& words, QWidget* parent)
 {
-    auto* box = new QComboBox(parent);
+    auto* box = new PickBox(parent);
     box->addItems(words);
     return box;
 }
@@ -107,8 +107,8 @@ void FilterTerm::FocusValue()
 {
     QWidget* const value = values_->isEnabled() ? values_->currentWidget() : operators_;
     value->setFocus(Qt::TabFocusReason);
-    if (value == text_)
-        text_->selectAll();
+    text_->end(false);
+    text_->home(true); // all of it, and its beginning in sight
 }
 
 CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QString& field,
@@ -116,7 +116,7 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
     : QDialog(parent)
     , lists_(lists)
     , tabs_(new QTabWidget(this))
-    , field_(new FieldChooser(lists, this))
+    , field_(new FieldChooser(lists, FieldChooser::Use::ToChoose, this))
     , single_(new FilterTerm(this))
     , fromTo_(new QCheckBox(StringText(Str::FilterFromTo), this))
     , from_(new FilterTerm(this))
@@ -125,8 +125,9 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
 {
     setWindowTitle(StringText(Str::FilterTitle));
     field_->Choose(table, field);
-    tabs_->addTab(BasicPage(), StringText(Str::FilterBasic));
-    tabs_->addTab(AdvancedPage(), StringText(Str::FilterAdvanced));
+    tabs_->addTab(Scrolled(BasicPage()), StringText(Str::FilterBasic));
+    tabs_->addTab(Scrolled(AdvancedPage()), StringText(Str::FilterAdvanced));
+    tabs_->setUsesScrollButtons(false);
 
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
@@ -164,11 +165,14 @@ QWidget* CFilterDialog::BasicPage()
 QWidget* CFilterDialog::AdvancedPage()
 {
     auto* page = new QWidget(this);
-    auto* chooser = new FieldChooser(lists_, page);
+    auto* chooser = new FieldChooser(lists_, FieldChooser::Use::ToPick, page);
     chooser->Choose(field_->Table(), field_->Field());
     QComboBox* const operators = WordBox(kExpressionOperators, page);
     QComboBox* const words = WordBox(kExpressionWords, page);
     expression_->setTabChangesFocus(true);
+    expression_->setMinimumHeight(5 * fontMetrics().lineSpacing());
+    expression_->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored); // it takes what is left
+    expression_->setAccessibleName(StringText(Str::FilterPrompt));
 
     auto* form = new QFormLayout(page);
     form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
@@ -195,9 +199,6 @@ void CFilterDialog::TakeField()
     single_->SetType(type, FilterKind::Single);
     from_->SetType(type, FilterKind::Range);
     to_->SetType(type, FilterKind::Range);
-    if (to_->isEnabled())
-        to_->SetOperator(u"<="_s);
-    from_->SetOperator(u">="_s);
 }
 
 void CFilterDialog::ShowRange(bool fromTo)
@@ -205,8 +206,14 @@ void CFilterDialog::ShowRange(bool fromTo)
     single_->setEnabled(!fromTo);
     from_->setEnabled(fromTo);
     to_->setEnabled(fromTo);
-    if (fromTo)
-        from_->FocusValue();
+    if (!fromTo)
+        return;
+    // From "=" to "=" is what nobody means.
+    if (from_->Operator() == u"=" && to_->Operator() == u"=") {
+        from_->SetOperator(u">="_s);
+        to_->SetOperator(u"<="_s);
+    }
+    from_->FocusValue();
 }
 
 FilterDraft CFilterDialog::Draft() const

@@ -3,8 +3,8 @@
 #include "data/filter_condition.h"
 #include "resources/string_table.h"
 #include "tableview/ui/field_chooser.h"
+#include "tableview/ui/pick_box.h"
 
-#include <QComboBox>
 #include <QDialogButtonBox>
 #include <QFormLayout>
 #include <QLineEdit>
@@ -19,9 +19,9 @@ CSortDialog::CSortDialog(FieldLists& lists, const QString& table, QWidget* paren
     , terms_(new QLineEdit(this))
 {
     setWindowTitle(StringText(Str::SortTitle));
-    auto* chooser = new FieldChooser(lists, this);
+    auto* chooser = new FieldChooser(lists, FieldChooser::Use::ToPick, this);
     chooser->Choose(table, {});
-    auto* directions = new QComboBox(this);
+    auto* directions = new PickBox(this);
     directions->addItems({u"ASC"_s, u"DESC"_s});
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
 

@@ -1,3 +1,4 @@
+#include "platform/ui/menu_keys.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
@@ -118,6 +119,7 @@ void CTableView::CreateMenus()
 void CTableView::FillMenu(QMenu* menu, std::span<const MenuEntry> entries)
 {
     menu->setToolTipsVisible(true);
+    LeaveOutKeysWhenSmall(*menu, *this);
     for (const MenuEntry entry : entries) {
         if (!entry) {
             menu->addSeparator();
