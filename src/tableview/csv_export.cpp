@@ -1,6 +1,11 @@
 #include "tableview/csv_export.h"
 
+#include "data/provider_error.h"
+#include "resources/string_table.h"
+
 #include <QBuffer>
+#include <QDir>
+#include <QSaveFile>
 
 namespace mirel {
 namespace {
@@ -37,6 +42,35 @@ CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, 
     if (!writer.Finish())
         result.ending = Ending::WriteFailed;
     return result;
+}
+
+bool ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path, OnStop onStop,
+                   UserPrompt& prompt)
+{
+    using Ending = CsvExportResult::Ending;
+    QSaveFile file(path);
+    if (!file.open(QIODevice::WriteOnly)) {
+        prompt.Show({Str::FileCreationFail, {QDir::toNativeSeparators(path)}});
+        return false;
+    }
+    CsvExportResult result;
+    {
+        const std::unique_ptr<Progress> progress =
+            prompt.StartProgress({Str::ExportingRecords, {}}, source.RecordCount());
+        result = ExportCsv(source, options, file, progress.get());
+    } // the display goes before a message comes
+    if (result.ending == Ending::ReadFailed) {
+        ReportProviderError(prompt, &source, source.LastResult());
+        return false;
+    }
+    if (result.ending == Ending::Stopped && onStop == OnStop::Discard)
+        return false;
+    if (result.ending == Ending::WriteFailed || !file.commit()) {
+        prompt.Show({Str::FileWriteFail, {QDir::toNativeSeparators(path), file.errorString()}});
+        return false;
+    }
+    prompt.Show({Str::RecordsExported, {QString::number(result.records)}});
+    return true;
 }
 
 QStringList PreviewCsv(DbRecordset& source, const CsvExportOptions& options, int maxLines)

@@ -27,6 +27,14 @@ struct CsvExportResult {
 CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
                           Progress* progress);
 
+enum class OnStop { KeepWritten, Discard };
+
+// The same into a file, with progress and the messages of its end. An existing file is replaced in one step once
+// the new one is whole, or, when the user stops it and `onStop` says so, holds what was written up to there. On
+// false nothing was written: why was told, and the file is as it was before.
+bool ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path, OnStop onStop,
+                   UserPrompt& prompt);
+
 // The first lines of the file that ExportCsv would write, at most `maxLines`, and a line "....." when there are
 // more records than that.
 QStringList PreviewCsv(DbRecordset& source, const CsvExportOptions& options, int maxLines = 10);

@@ -24,6 +24,17 @@ QByteArray Utf8Of(QChar character)
 
 } // namespace
 
+void CsvExportOptions::SetDateOrder(DateOrder order)
+{
+    const DateFormat usual;
+    const bool chosen = dates.dateSeparator != 0 || dates.timeSeparator != 0;
+    dates.order = order;
+    if (order == DateOrder::Locale || chosen)
+        return;
+    dates.dateSeparator = usual.dateSeparator;
+    dates.timeSeparator = usual.timeSeparator;
+}
+
 CsvWriter::CsvWriter(QIODevice& device, const CsvExportOptions& options, std::span<const ResultField> fields)
     : device_(device)
     , options_(options)

@@ -23,6 +23,11 @@ struct CsvExportOptions {
     bool doubledQuotes = false;    // a quotation mark inside a text is doubled; else it is written as it is, and
                                    // a reader of the file must cope with it
     QByteArray encoding = "UTF-8"; // what it lacks is written as "?"
+
+    // Another order than the user's own brings "-" and ":" along where no separators were chosen yet.
+    void SetDateOrder(DateOrder order);
+
+    friend bool operator==(const CsvExportOptions&, const CsvExportOptions&) = default;
 };
 
 // Writes records as lines of a CSV file: a text in quotation marks, numbers bare, Yes/No as 1 and 0, NULL and

@@ -5,6 +5,7 @@
 #include "resources/string_table.h"
 #include "tableview/bulk_commands.h"
 #include "tableview/saved_queries.h"
+#include "tableview/ui/export_wizard.h"
 #include "tableview/ui/filter_dialog.h"
 #include "tableview/ui/query_dialog.h"
 #include "tableview/ui/sort_dialog.h"
@@ -33,6 +34,7 @@ bool ResultCommands::CanDo(TableCommand command) const
     case Command::Max:
     case Command::Min:
     case Command::Avg:
+    case Command::ExportCsv:
         return hasRecord;
     case Command::EditAll:
     case Command::DeleteAll:
@@ -72,6 +74,8 @@ std::optional<bool> ResultCommands::Do(TableCommand command)
         return OpenQuery();
     case Command::SaveQuery:
         return SaveQuery();
+    case Command::ExportCsv:
+        return Export();
     default: // none of these
         return std::nullopt;
     }
@@ -139,6 +143,23 @@ bool ResultCommands::SaveQuery()
     if (!SavedQueries(*store_, prompt_).Save(*name, table, ShownStatement(browser_)))
         return true;
     Q_EMIT queriesChanged();
+    return true;
+}
+
+bool ResultCommands::Export()
+{
+    if (!browser_.WriteEdit())
+        return false;
+    ExportDraft draft(connection_, browser_.Database(), prompt_);
+    {
+        const WaitCursor waiting;
+        if (!draft.SetSource(browser_.Statement()))
+            return true;
+        draft.RecordCount();
+    }
+    CExportWizard wizard(draft, title_, browser_.Database(), &view_);
+    FillSmallWindow(wizard, view_);
+    wizard.exec();
     return true;
 }
 

@@ -23,6 +23,8 @@ class ResultCommands : public QObject {
 public:
     ResultCommands(RecordBrowser& browser, DbConnection& connection, UserPrompt& prompt, QWidget& view);
 
+    // What the view calls its result.
+    void SetTitle(const QString& title) { title_ = title; }
     // Where the database keeps its saved queries; null: nowhere.
     void SetStore(FormStore* store) { store_ = store; }
 
@@ -39,12 +41,14 @@ private:
     bool SortByExpression();
     bool OpenQuery();
     bool SaveQuery();
+    bool Export();
 
     RecordBrowser& browser_;
     DbConnection& connection_;
     UserPrompt& prompt_;
     QWidget& view_;
     FormStore* store_ = nullptr;
+    QString title_;
 };
 
 } // namespace mirel

@@ -95,7 +95,7 @@ void CTableView::ConnectParts()
         browser_.SetRowsPerPage(rows);
         ShowState();
     });
-    connect(resultCommands_, &ResultCommands::queryOpened, this, [this](const QString& name) { title_ = name; });
+    connect(resultCommands_, &ResultCommands::queryOpened, this, &CTableView::SetTitle);
     connect(resultCommands_, &ResultCommands::queriesChanged, this, &CTableView::queriesChanged);
     connect(strip_, &CellStrip::commandRequested, this, &CTableView::Do);
     connect(strip_, &CellStrip::textEdited, this, [this](const QString& text) {
@@ -131,6 +131,12 @@ void CTableView::SetStore(FormStore& store)
     ShowState();
 }
 
+void CTableView::SetTitle(const QString& title)
+{
+    title_ = title;
+    resultCommands_->SetTitle(title);
+}
+
 bool CTableView::OpenTable(const QString& table)
 {
     return OpenStatement(table, RecordBrowser::StatementOfTable(table));
@@ -138,7 +144,7 @@ bool CTableView::OpenTable(const QString& table)
 
 bool CTableView::OpenStatement(const QString& title, const QString& statement)
 {
-    title_ = title;
+    SetTitle(title);
     const WaitCursor waiting;
     return Settle(browser_.Open(statement));
 }

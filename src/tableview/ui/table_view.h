@@ -54,6 +54,7 @@ protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
+    void SetTitle(const QString& title);
     void LayOut();
     void CreateActions();
     void CreateMenus();

@@ -1,0 +1,262 @@
+#include "tableview/ui/export_wizard.h"
+
+#include "platform/ui/elided_label.h"
+#include "platform/ui/file_choice.h"
+#include "platform/ui/window_place.h"
+#include "resources/string_table.h"
+#include "tableview/ui/csv_options_dialog.h"
+
+#include <QCheckBox>
+#include <QDialogButtonBox>
+#include <QDir>
+#include <QGridLayout>
+#include <QHeaderView>
+#include <QLabel>
+#include <QListWidget>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QScreen>
+#include <QStackedWidget>
+#include <QTreeWidget>
+#include <QVBoxLayout>
+
+#include <array>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr QSize kFirstSize(600, 440);
+
+struct Step {
+    Str title;
+    Str goOn; // what the forward button says
+};
+constexpr std::array kSteps = {Step{Str::ExportStepSource, Str::WizardNext},
+                               Step{Str::ExportStepSeparator, Str::ExportRun}};
+
+struct Separator {
+    QChar character;
+    Str text;
+};
+constexpr std::array kSeparators = {
+    Separator{u'\t', Str::CsvSeparatorTab},
+    Separator{u';', Str::CsvSeparatorSemicolon},
+    Separator{u',', Str::CsvSeparatorComma},
+    Separator{u' ', Str::CsvSeparatorSpace},
+};
+
+QTreeWidget* FieldList(const std::vector<ExportDraft::Field>& fields, QWidget* parent)
+{
+    auto* list = new QTreeWidget(parent);
+    list->setRootIsDecorated(false);
+    list->setUniformRowHeights(true);
+    list->setHeaderLabels(
+        {StringText(Str::ExportFieldName), StringText(Str::ExportFieldType), StringText(Str::ExportFieldData)});
+    for (const ExportDraft::Field& field : fields)
+        list->addTopLevelItem(new QTreeWidgetItem({field.name, field.type, field.firstData}));
+    for (int column = 0; column < 2; ++column)
+        list->resizeColumnToContents(column);
+    list->setAccessibleName(StringText(Str::ExportSource));
+    return list;
+}
+
+// A table may be called what no file can be.
+QString FileNameOf(QString name)
+{
+    return name.replace(u'/', u'_') + u".csv"_s;
+}
+
+} // namespace
+
+CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, QWidget* parent)
+    : QDialog(parent)
+    , draft_(draft)
+    , name_(std::move(name))
+    , near_(std::move(near))
+    , heading_(new QLabel(this))
+    , pages_(new QStackedWidget(this))
+    , path_(new ElidedLabel(this))
+    , preview_(new QListWidget(this))
+    , back_(new QPushButton(StringText(Str::WizardBack), this))
+    , next_(new QPushButton(this))
+{
+    setWindowTitle(StringText(Str::ExportTitle));
+    pages_->addWidget(SourcePage());
+    pages_->addWidget(SeparatorPage());
+    LayOut();
+    ShowStep(0);
+}
+
+void CExportWizard::LayOut()
+{
+    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), this);
+    QFont bold = heading_->font();
+    bold.setBold(true);
+    heading_->setFont(bold);
+    heading_->setWordWrap(true);
+    auto* buttons = new QHBoxLayout;
+    buttons->addWidget(cancel);
+    buttons->addStretch(1);
+    buttons->addWidget(back_);
+    buttons->addWidget(next_);
+    auto* column = new QVBoxLayout(this);
+    column->addWidget(heading_);
+    column->addWidget(pages_, 1);
+    column->addLayout(buttons);
+    for (QPushButton* button : {cancel, back_, next_}) { // three of them stand side by side on a small screen
+        button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
+        button->setMinimumWidth(4 * fontMetrics().height());
+    }
+    next_->setDefault(true);
+    for (QPushButton* button : {cancel, back_})
+        button->setAutoDefault(false);
+    connect(cancel, &QPushButton::clicked, this, &QDialog::reject);
+    connect(back_, &QPushButton::clicked, this, [this] { ShowStep(0); });
+    connect(next_, &QPushButton::clicked, this, &CExportWizard::GoOn);
+    resize(kFirstSize.boundedTo(screen()->availableSize()));
+}
+
+QWidget* CExportWizard::SourcePage()
+{
+    auto* page = new QWidget(this);
+    auto* source = new ElidedLabel(page);
+    source->SetText(draft_.Source());
+    source->setToolTip(draft_.Source());
+    auto* query = new QPushButton(StringText(Str::ExportQuery), page);
+    query->setEnabled(false);
+    query->setToolTip(StringText(Str::ExportQueryTip));
+    auto* saveAs = new QPushButton(StringText(Str::ExportSaveAs), page);
+    saveAs->setToolTip(StringText(Str::ExportSaveAsTip));
+    saveAs->setAutoDefault(false);
+    auto* count = new QLabel(StringText(Str::RecordsSelected, {QString::number(draft_.RecordCount())}), page);
+    connect(saveAs, &QPushButton::clicked, this, &CExportWizard::ChoosePath);
+
+    auto* grid = new QGridLayout(page);
+    grid->setContentsMargins({});
+    grid->addWidget(new QLabel(StringText(Str::ExportSource), page), 0, 0, 1, 2);
+    grid->addWidget(source, 1, 0);
+    grid->addWidget(query, 1, 1);
+    grid->addWidget(FieldList(draft_.Fields(), page), 2, 0, 1, 2);
+    grid->addWidget(count, 3, 0, 1, 2);
+    grid->addWidget(new QLabel(StringText(Str::ExportDestination), page), 4, 0, 1, 2);
+    grid->addWidget(path_, 5, 0);
+    grid->addWidget(saveAs, 5, 1);
+    grid->setColumnStretch(0, 1);
+    grid->setRowStretch(2, 1);
+    return page;
+}
+
+QWidget* CExportWizard::SeparatorPage()
+{
+    auto* page = new QWidget(this);
+    auto* header = new QCheckBox(StringText(Str::CsvHeader), page);
+    auto* advanced = new QPushButton(StringText(Str::CsvAdvanced), page);
+    advanced->setAutoDefault(false);
+    auto* title = new QLabel(StringText(Str::CsvPreview), page);
+    title->setBuddy(preview_);
+    preview_->setSelectionMode(QAbstractItemView::NoSelection);
+    preview_->setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
+    preview_->setAccessibleName(StringText(Str::CsvPreview));
+    header->setChecked(draft_.Options().header);
+    connect(header, &QCheckBox::toggled, this, [this](bool on) {
+        draft_.Options().header = on;
+        ShowPreview();
+    });
+    connect(advanced, &QPushButton::clicked, this, &CExportWizard::ChooseOptions);
+
+    auto* column = new QVBoxLayout(page);
+    column->setContentsMargins({});
+    column->addWidget(Separators(page));
+    column->addWidget(header);
+    auto* row = new QHBoxLayout;
+    row->addWidget(title, 1);
+    row->addWidget(advanced);
+    column->addLayout(row);
+    column->addWidget(preview_, 1);
+    return page;
+}
+
+QWidget* CExportWizard::Separators(QWidget* page)
+{
+    auto* group = new QWidget(page);
+    auto* grid = new QGridLayout(group);
+    grid->setContentsMargins({});
+    for (size_t i = 0; i < kSeparators.size(); ++i) {
+        const Separator& separator = kSeparators[i];
+        auto* button = new QRadioButton(StringText(separator.text), group);
+        button->setChecked(draft_.Options().separator == separator.character);
+        connect(button, &QRadioButton::toggled, this, [this, character = separator.character](bool on) {
+            if (!on)
+                return;
+            draft_.Options().separator = character;
+            ShowPreview();
+        });
+        grid->addWidget(button, int(i / 2), int(i % 2));
+    }
+    return group;
+}
+
+void CExportWizard::ShowStep(int step)
+{
+    pages_->setCurrentIndex(step);
+    const Step& shown = kSteps[size_t(step)];
+    heading_->setText(StringText(
+        Str::WizardStep, {StringText(shown.title), QString::number(step + 1), QString::number(kSteps.size())}));
+    next_->setText(StringText(shown.goOn));
+    back_->setEnabled(step > 0);
+    ShowState();
+    if (step > 0)
+        ShowPreview();
+    if (next_->isEnabled())
+        next_->setFocus();
+}
+
+void CExportWizard::ShowState()
+{
+    const QString path = QDir::toNativeSeparators(draft_.Path());
+    path_->SetText(path.isEmpty() ? QString() : StringText(Str::ExportPath, {path}));
+    path_->setToolTip(path);
+    next_->setEnabled(draft_.CanRun());
+}
+
+void CExportWizard::ShowPreview()
+{
+    preview_->clear();
+    preview_->addItems(draft_.Preview());
+}
+
+void CExportWizard::ChoosePath()
+{
+    const QString path = draft_.Path().isEmpty() ? near_ : draft_.Path();
+    draft_.ChoosePath(ChooseFile(*this, {.title = Str::ExportSaveAs,
+                                         .accept = Str::ExportSaveAs,
+                                         .use = FileUse::Create,
+                                         .kind = {Str::CsvFilter, {u".csv"_s, u".txt"_s}, u"document-export"},
+                                         .near = path,
+                                         .name = FileNameOf(name_)}));
+    ShowState();
+    if (next_->isEnabled())
+        next_->setFocus();
+}
+
+void CExportWizard::ChooseOptions()
+{
+    CCsvOptionsDialog dialog(draft_.Options(), this);
+    FillSmallWindow(dialog, *this);
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    draft_.Options() = dialog.Chosen();
+    ShowPreview();
+}
+
+void CExportWizard::GoOn()
+{
+    if (pages_->currentIndex() == 0)
+        ShowStep(1);
+    else if (draft_.Run())
+        accept();
+}
+
+} // namespace mirel

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "tableview/export_draft.h"
+
+#include <QDialog>
+
+#include <vector>
+
+class QLabel;
+class QListWidget;
+class QPushButton;
+class QRadioButton;
+class QCheckBox;
+class QStackedWidget;
+
+namespace mirel {
+
+class ElidedLabel;
+
+// "Export": the two steps of writing a result as a CSV file, over the draft, which must outlive it.
+class CExportWizard : public QDialog {
+    Q_OBJECT
+
+public:
+    // `name` is what the result is called: the file's name begins with it. `near` is a path in the folder where
+    // the user begins to look for a place.
+    CExportWizard(ExportDraft& draft, QString name, QString near, QWidget* parent);
+
+private:
+    QWidget* SourcePage();
+    QWidget* SeparatorPage();
+    QWidget* Separators(QWidget* page);
+    void LayOut();
+    void ShowStep(int step); // from 0
+    void ShowState();
+    void ShowPreview();
+    void ChoosePath();
+    void ChooseOptions();
+    void GoOn();
+
+    ExportDraft& draft_;
+    QString name_;
+    QString near_;
+    QLabel* heading_;
+    QStackedWidget* pages_;
+    ElidedLabel* path_;
+    QListWidget* preview_;
+    QPushButton* back_;
+    QPushButton* next_;
+};
+
+} // namespace mirel
