@@ -83,18 +83,21 @@ int ColumnOf(const ExprNode* tree, EvalContext& context)
     return tree && tree->code == OpCode::Field ? context.FindColumn(tree->text) : -1;
 }
 
+const ExprNode* ShownField(const ControlBinding& binding, ControlType type)
+{
+    const ExprNode* tree = binding.wholeResult ? nullptr : binding.tree.get();
+    if (tree && type == ControlType::CheckBox) {
+        if (tree->code == OpCode::Where)
+            tree = tree->args[1] ? tree->args[1].get() : tree->args[0].get();
+        if (tree && tree->kind == NodeKind::Condition)
+            tree = tree->args[0].get();
+    }
+    return tree && tree->code == OpCode::Field ? tree : nullptr;
+}
+
 int ShownColumn(const ControlBinding& binding, ControlType type, FormContext& context)
 {
-    const ExprNode* tree = binding.tree.get();
-    if (!tree || binding.wholeResult)
-        return -1;
-    if (type != ControlType::CheckBox)
-        return ColumnOf(tree, context);
-    if (tree->code == OpCode::Where)
-        tree = tree->args[1] ? tree->args[1].get() : tree->args[0].get();
-    if (tree && tree->kind == NodeKind::Condition && tree->args[0] && tree->args[0]->code == OpCode::Field)
-        tree = tree->args[0].get();
-    const int column = ColumnOf(tree, context);
+    const int column = ColumnOf(ShownField(binding, type), context);
     return column < context.FieldCount() ? column : column - context.FieldCount();
 }
 

@@ -37,8 +37,10 @@ ControlBinding BindControl(const ControlDef& control);
 
 // The result's column when the tree is a field's name and nothing else; -1 otherwise.
 int ColumnOf(const ExprNode* tree, EvalContext& context);
-// The column that the control shows: that of its tree, and for a check box the field that its condition
-// compares. -1: none, or more than that.
+// The field that the control shows: its tree when that is a field's name and nothing else, and for a check box the
+// field that its condition compares. Null: none.
+const ExprNode* ShownField(const ControlBinding& binding, ControlType type);
+// The same as a column of the result; -1: none.
 int ShownColumn(const ControlBinding& binding, ControlType type, FormContext& context);
 
 // The tree's value on the context's record as a control shows it. A field alone shows its number as the store

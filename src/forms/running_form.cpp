@@ -80,8 +80,7 @@ void RunningForm::BuildControls()
         for (const ControlBinding::Column& column : binding.columns)
             control.columns += column.name;
         control.isClock = IsClock(control, binding);
-        control.keepsInput = definition.fieldBound != 0 ||
-                             (binding.tree && !binding.wholeResult && binding.tree->code == OpCode::Field);
+        control.keepsInput = definition.fieldBound != 0 || ShownField(binding, definition.type);
         controls_.push_back(std::move(control));
         bindings_.push_back(std::move(binding));
     }
