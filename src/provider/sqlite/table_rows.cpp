@@ -22,8 +22,14 @@ Outcome TableRows::Extend(qint64 wanted, const QDeadlineTimer& until)
     Outcome outcome;
     if (!index_.LastSample() && !IsComplete())
         outcome = Begin();
+    if (!outcome.Ok() || IsComplete() || Known() >= wanted)
+        return outcome;
+    Statement next = file_.Prepare(
+        Select(rowId_, " WHERE @>=?1 ORDER BY @ LIMIT 1 OFFSET " + QByteArray::number(RowIdIndex::kStep)),
+        outcome);
     while (outcome.Ok() && !IsComplete() && Known() < wanted) {
-        outcome = AddSample();
+        outcome = AddSample(next);
+        next.Reset();
         if (until.hasExpired())
             break;
     }
@@ -44,14 +50,8 @@ Outcome TableRows::Begin()
     return file_.OutcomeOf(result);
 }
 
-Outcome TableRows::AddSample()
+Outcome TableRows::AddSample(Statement& next)
 {
-    Outcome outcome;
-    Statement next = file_.Prepare(
-        Select(rowId_, " WHERE @>=?1 ORDER BY @ LIMIT 1 OFFSET " + QByteArray::number(RowIdIndex::kStep)),
-        outcome);
-    if (!next)
-        return outcome;
     next.Bind(1, *index_.LastSample());
     const int result = next.Step();
     if (result == SQLITE_DONE)

@@ -29,7 +29,7 @@ public:
 
 private:
     Outcome Begin();
-    Outcome AddSample();
+    Outcome AddSample(Statement& next); // a statement that finds the one behind
     Outcome Finish();
     // "SELECT what FROM the table " + rest, with "@" in `rest` standing for the row id.
     QByteArray Select(const QByteArray& what, const QByteArray& rest) const;

@@ -1,6 +1,9 @@
 #include "provider/sqlite/text_sort.h"
 
+#include <QtEndian>
+
 #include <algorithm>
+#include <array>
 #include <functional>
 
 namespace mirel::sqlite {
@@ -10,12 +13,17 @@ constexpr size_t kMostBytes = size_t(192) << 20;
 constexpr size_t kMostEntries = size_t(4) << 20;
 constexpr size_t kRecent = 1 << 15;
 
-quint64 PrefixOf(std::string_view key)
+constexpr size_t kPieceBytes = 8;
+constexpr int kMostPieces = 32; // then texts are compared as a whole
+constexpr size_t kFewEntries = 6;
+
+// Eight bytes as a number, zeros behind the key's end.
+quint64 PieceOf(std::string_view key, int piece)
 {
-    quint64 prefix = 0;
-    for (size_t i = 0; i < 8; ++i)
-        prefix = prefix << 8 | (i < key.size() ? quint8(key[i]) : 0);
-    return prefix;
+    const std::string_view bytes = key.substr(std::min(key.size(), size_t(piece) * kPieceBytes), kPieceBytes);
+    std::array<char, kPieceBytes> padded{};
+    std::ranges::copy(bytes, padded.begin());
+    return qFromBigEndian<quint64>(padded.data());
 }
 
 } // namespace
@@ -24,9 +32,10 @@ bool TextSort::Store(std::string_view text, quint32& index)
 {
     if (recent_.empty())
         recent_.resize(kRecent);
-    quint32& recent = recent_[std::hash<std::string_view>()(text) % kRecent];
-    if (recent > 0 && TextOf(stored_[recent - 1]) == text) {
-        index = recent - 1;
+    const size_t hash = std::hash<std::string_view>()(text);
+    Recent& recent = recent_[hash % kRecent];
+    if (recent.index >= 0 && recent.hash == hash && TextOf(stored_[size_t(recent.index)]) == text) {
+        index = quint32(recent.index);
         return true;
     }
     const std::span<const uint8_t> key = keys_.KeyOf(text);
@@ -36,7 +45,7 @@ bool TextSort::Store(std::string_view text, quint32& index)
     stored_.push_back({quint32(arena_.size()), quint32(key.size()), quint32(text.size())});
     arena_.append(reinterpret_cast<const char*>(key.data()), key.size());
     arena_.append(text);
-    recent = index + 1;
+    recent = {hash, qint64(index)};
     return true;
 }
 
@@ -49,39 +58,62 @@ bool TextSort::Add(qint64 rowId, std::optional<std::string_view> text)
     quint32 index = 0;
     if (entries_.size() >= kMostEntries || !Store(*text, index))
         return false;
-    const Stored& stored = stored_[index];
-    entries_.push_back({PrefixOf(std::string_view(arena_).substr(stored.at, stored.keySize)), rowId, index});
+    entries_.push_back({0, rowId, index});
     return true;
-}
-
-std::string_view TextSort::KeyBehindPrefix(const Stored& stored) const
-{
-    const std::string_view key = std::string_view(arena_).substr(stored.at, stored.keySize);
-    return key.size() > 8 ? key.substr(8) : std::string_view();
 }
 
 int TextSort::Compare(const Entry& a, const Entry& b) const
 {
-    if (a.prefix != b.prefix)
-        return a.prefix < b.prefix ? -1 : 1;
     if (a.stored == b.stored)
         return 0;
     const Stored& left = stored_[a.stored];
     const Stored& right = stored_[b.stored];
-    if (const int keys = KeyBehindPrefix(left).compare(KeyBehindPrefix(right)); keys != 0)
+    if (const int keys = KeyOf(left).compare(KeyOf(right)); keys != 0)
         return keys;
     return TextOf(left).compare(TextOf(right));
 }
 
-std::vector<qint64> TextSort::Finish(bool descending)
+void TextSort::SortWhole(std::span<Entry> entries, bool descending) const
 {
-    std::ranges::sort(nulls_);
-    std::ranges::sort(entries_, [this, descending](const Entry& a, const Entry& b) {
+    std::ranges::sort(entries, [this, descending](const Entry& a, const Entry& b) {
         const int order = Compare(a, b);
         if (order != 0)
             return descending ? order > 0 : order < 0;
         return a.rowId < b.rowId;
     });
+}
+
+void TextSort::SortFrom(int piece, std::span<Entry> entries, bool descending)
+{
+    const auto isSameText = [first = entries.front().stored](const Entry& entry) { return entry.stored == first; };
+    if (entries.size() <= kFewEntries || piece == kMostPieces || std::ranges::all_of(entries, isSameText))
+        return SortWhole(entries, descending);
+    size_t longest = 0;
+    for (Entry& entry : entries) {
+        const std::string_view key = KeyOf(stored_[entry.stored]);
+        longest = std::max(longest, key.size());
+        entry.piece = PieceOf(key, piece);
+        if (descending)
+            entry.piece = ~entry.piece;
+    }
+    std::ranges::sort(entries, {}, &Entry::piece);
+    const bool isLast = longest <= size_t(piece + 1) * kPieceBytes;
+    for (size_t from = 0, to = 0; from < entries.size(); from = to) {
+        while (to < entries.size() && entries[to].piece == entries[from].piece)
+            ++to;
+        const std::span<Entry> same = entries.subspan(from, to - from);
+        if (isLast)
+            SortWhole(same, descending);
+        else if (same.size() > 1)
+            SortFrom(piece + 1, same, descending);
+    }
+}
+
+std::vector<qint64> TextSort::Finish(bool descending)
+{
+    std::ranges::sort(nulls_);
+    if (!entries_.empty())
+        SortFrom(0, entries_, descending);
     std::vector<qint64> rowIds;
     rowIds.reserve(entries_.size() + nulls_.size());
     if (!descending)

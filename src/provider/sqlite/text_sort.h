@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -14,7 +15,8 @@ namespace mirel::sqlite {
 
 // Puts the row ids of one table in the order of a text column: by the user's language without regard to case,
 // then by the exact text, then by row id; NULL first. Does what "ORDER BY sortkey(x), x, rowid" does in half
-// the time, because each different text is made a key of only once and eight bytes of it mostly decide.
+// the time, because each different text is made a key of only once, and keys are compared as numbers: by their
+// first eight bytes, those with the same eight by the next ones, and so on.
 class TextSort {
 public:
     // False when memory for it should not be taken; the engine's own sorting, which uses files, is for that.
@@ -29,17 +31,23 @@ private:
         quint32 textSize = 0;
     };
     struct Entry {
-        quint64 prefix; // the first eight bytes of the key, as a number
+        quint64 piece; // eight bytes of the key as a number that sorts as wanted
         qint64 rowId;
         quint32 stored; // index in stored_
     };
 
     bool Store(std::string_view text, quint32& index);
-    std::string_view KeyBehindPrefix(const Stored& stored) const;
+    std::string_view KeyOf(const Stored& stored) const
+    {
+        return std::string_view(arena_).substr(stored.at, stored.keySize);
+    }
     std::string_view TextOf(const Stored& stored) const
     {
         return std::string_view(arena_).substr(stored.at + stored.keySize, stored.textSize);
     }
+    // Entries whose keys are the same up to piece number `piece`.
+    void SortFrom(int piece, std::span<Entry> entries, bool descending);
+    void SortWhole(std::span<Entry> entries, bool descending) const;
     int Compare(const Entry& a, const Entry& b) const;
 
     SortKeys keys_;
@@ -47,7 +55,12 @@ private:
     std::vector<Stored> stored_;
     std::vector<Entry> entries_;
     std::vector<qint64> nulls_;
-    std::vector<quint32> recent_; // by a hash of the text: index in stored_ + 1, 0 for none
+    // By a hash of the text. The hash is kept, so that a text is looked at only where it is likely the same.
+    struct Recent {
+        size_t hash = 0;
+        qint64 index = -1; // in stored_; -1: none
+    };
+    std::vector<Recent> recent_;
 };
 
 } // namespace mirel::sqlite
