@@ -10,6 +10,7 @@
 #include <QProcess>
 #include <QRandomGenerator>
 #include <QTemporaryDir>
+#include <QtEndian>
 
 #include <csignal>
 #include <sys/wait.h>
@@ -119,6 +120,50 @@ TEST_F(Kill, LeavesATableInItsOldShapeOrItsNew)
                    EXPECT_EQ(file.Text("SELECT count(*) FROM T").toInt(), kRecords);
                    EXPECT_EQ(file.Text("SELECT count(*) FROM sqlite_schema WHERE type='index'"), u"1"_s);
                });
+}
+
+// The file's own count of the transactions that were written to it.
+quint32 Transactions(const QString& path)
+{
+    constexpr qint64 kChangeCounterAt = 24;
+    QFile file(path);
+    EXPECT_TRUE(file.open(QIODevice::ReadOnly) && file.seek(kChangeCounterAt));
+    return qFromBigEndian<quint32>(file.read(4).constData());
+}
+
+TEST_F(Kill, LeavesAMillionRecordsWhereAMoveOfTheirColumnWasUnderWay)
+{
+    const QString path = Path(u"million.cdb"_s);
+    QFile::copy(Path(u"empty.cdb"_s), path);
+    SqliteFile(path).Run("WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<1000000) "
+                         "INSERT INTO T(rowid,A,B) SELECT n*2,'name '||n,n FROM s");
+    const QByteArray kSums = "SELECT count(*)||' '||sum(rowid*B)||' '||sum(length(A)) FROM T";
+    const QString sums = SqliteFile(path).Text(kSums);
+    const quint32 transactions = Transactions(path);
+    const QStringList move = {u"sql"_s, path, u"ALTER TABLE T MOVE B BEFORE A"_s};
+
+    QProcess process;
+    process.start(QStringLiteral(MIREL_CLI), move);
+    ASSERT_TRUE(process.waitForStarted());
+    while (!QFile::exists(path + u"-journal"_s) && !process.waitForFinished(1)) {
+    }
+    ::usleep(100'000); // rows are being written now
+    ::kill(pid_t(process.processId()), SIGKILL);
+    ASSERT_TRUE(process.waitForFinished(60000));
+    ASSERT_EQ(process.exitStatus(), QProcess::CrashExit) << "it was done before it was killed";
+    {
+        SqliteFile file(path);
+        EXPECT_EQ(file.Column("SELECT name FROM pragma_table_info('T')").join(u','), u"A,B,C"_s);
+        EXPECT_EQ(file.Text(kSums), sums);
+        EXPECT_EQ(file.Text("PRAGMA quick_check"), u"ok"_s);
+    }
+    EXPECT_EQ(Transactions(path), transactions);
+
+    Run(move);
+    SqliteFile file(path);
+    EXPECT_EQ(file.Column("SELECT name FROM pragma_table_info('T')").join(u','), u"B,A,C"_s);
+    EXPECT_EQ(file.Text(kSums), sums);
+    EXPECT_EQ(Transactions(path), transactions + 1);
 }
 
 FormStore StoreOf(const QString& path, int queries)
