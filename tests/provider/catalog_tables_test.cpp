@@ -34,5 +34,15 @@ TEST_F(CatalogTables, LeadFromATableToTheIndexOfAField)
     EXPECT_EQ(Rows(indexes.arg(table, field)), QStringList{u"idx|3"_s}) << "numbers survive renaming";
 }
 
+// The engine folds A to Z alone, so that files from elsewhere may hold both of these.
+TEST_F(CatalogTables, GiveFieldsThatDifferByTheCaseOfAnUmlautNumbersOfTheirOwn)
+{
+    Outside("CREATE TABLE Umlauts (\xC3\xA4 INTEGER, \xC3\x84 INTEGER)");
+    const QString table = Rows(u"SELECT TableID FROM MSysTables WHERE TableName='Umlauts'"_s).value(0);
+    QStringList fields = Rows(u"SELECT FieldID FROM MSysFields WHERE TableID="_s + table);
+    EXPECT_EQ(fields.size(), 2);
+    EXPECT_EQ(fields.removeDuplicates(), 0);
+}
+
 } // namespace
 } // namespace mirel

@@ -23,7 +23,7 @@ void SchemaIds::RenameTable(const QString& table, const QString& newName)
         if (key.startsWith(fieldsOf))
             Move(key, KeyOf(newName, key.mid(fieldsOf.size())));
     }
-    Move(table.toLower(), newName.toLower());
+    Move(table, newName);
 }
 
 } // namespace mirel::sqlite
