@@ -11,16 +11,25 @@ class FreedPagesStay {
 public:
     explicit FreedPagesStay(DatabaseFile& file)
         : file_(file)
-        , was_(file.Number("PRAGMA secure_delete"))
+        , was_(Ask("PRAGMA secure_delete"))
     {
-        (void)file_.Number("PRAGMA secure_delete=0");
+        Ask("PRAGMA secure_delete=0");
     }
-    ~FreedPagesStay() { (void)file_.Number("PRAGMA secure_delete=" + QByteArray::number(was_)); }
+    ~FreedPagesStay() { Ask("PRAGMA secure_delete=" + QByteArray::number(was_)); }
     Q_DISABLE_COPY_MOVE(FreedPagesStay)
 
 private:
+    // The engine obeys, and takes the answer, when it prepares the statement: one that was kept would do nothing.
+    int Ask(const QByteArray& pragma) const
+    {
+        sqlite3_stmt* raw = nullptr;
+        sqlite3_prepare_v2(file_.Handle(), pragma.constData(), int(pragma.size()), &raw, nullptr);
+        const StatementPtr statement(raw);
+        return sqlite3_step(raw) == SQLITE_ROW ? sqlite3_column_int(raw, 0) : 0;
+    }
+
     DatabaseFile& file_;
-    qint64 was_;
+    int was_;
 };
 
 // What a record or its value may be refused for, as opposed to a file that cannot be written.
