@@ -199,6 +199,20 @@ TEST_F(BulkWrites, AreOneTransactionBetweenBeginAndEnd)
     EXPECT_TRUE(Failed(provider->EndBulk(path))) << "there is none to end";
 }
 
+// In files from elsewhere a column can be the row id itself.
+TEST_F(BulkWrites, OfAKeyLeaveTheCursorOnRecordsThatAreThere)
+{
+    Outside("CREATE TABLE K (Id INTEGER PRIMARY KEY, Name TEXT); INSERT INTO K VALUES (1,'a'),(2,'b')");
+    const auto cursor = Open(u"K"_s);
+    ASSERT_EQ(cursor->RecordCount(), 2);
+    EXPECT_EQ(cursor->UpdateAll(0, Value::Integer(7), {}), Hr::IntegrityViolation) << "only one can be 7";
+    EXPECT_EQ(Read(*cursor), (QStringList{u"2|b"_s, u"7|a"_s}));
+    EXPECT_EQ(Read(*cursor, {.first = 1, .count = 1}), QStringList{u"7|a"_s});
+    EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"b"_s)) << "at the position of the record that went";
+    ASSERT_EQ(cursor->MoveNext(), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor, 0), Value::Integer(7));
+}
+
 class Appending : public RecordWrites {
 protected:
     std::unique_ptr<RecordAppender> Appender(const QStringList& columns, Hr expected = Hr::Ok)

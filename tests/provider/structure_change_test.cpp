@@ -31,7 +31,8 @@ protected:
         sqlite3* handle = nullptr;
         sqlite3_stmt* statement = nullptr;
         sqlite3_open(QFile::encodeName(path).constData(), &handle);
-        sqlite3_prepare_v2(handle, "SELECT group_concat(id) FROM (SELECT rowid AS id FROM T ORDER BY rowid)", -1, &statement, nullptr);
+        sqlite3_prepare_v2(handle, "SELECT group_concat(id) FROM (SELECT rowid AS id FROM T ORDER BY rowid)", -1,
+                           &statement, nullptr);
         sqlite3_step(statement);
         const QByteArray ids(reinterpret_cast<const char*>(sqlite3_column_text(statement, 0)));
         sqlite3_finalize(statement);

@@ -40,6 +40,18 @@ protected:
     OtherProgram other{path};
 };
 
+TEST_F(TwoPrograms, AValueIsThatOfNowWithoutAMove)
+{
+    const auto cursor = Open(u"T"_s);
+    EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"name 1"_s));
+    other.Run("UPDATE T SET Name='another' WHERE N=1");
+    QElapsedTimer waiting;
+    waiting.start();
+    while (FieldOf(*cursor, 1) != Value::Text(u"another"_s) && !waiting.hasExpired(5000)) {
+    }
+    EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"another"_s));
+}
+
 TEST_F(TwoPrograms, AResultTakesUpWhatTheOtherCommitted)
 {
     const struct {

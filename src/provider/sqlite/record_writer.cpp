@@ -22,6 +22,12 @@ QByteArray RecordWriter::ColumnOf(int field) const
     return QuoteName(fields_[size_t(field)].column);
 }
 
+bool RecordWriter::MovesRecords(int field) const
+{
+    return file_.Number("SELECT count(*) FROM pragma_table_info(" + QuoteText(name_) +
+                        ") WHERE pk>0 AND name=" + QuoteText(fields_[size_t(field)].column)) > 0;
+}
+
 Outcome RecordWriter::Convert(const FieldChange& change, Value& converted) const
 {
     const ResultField& field = fields_[size_t(change.field)];

@@ -22,6 +22,8 @@ public:
     // Ends with ReadOnly for an expression, BadLiteral or Overflow for what does not fit.
     Outcome Convert(const FieldChange& change, Value& converted) const;
     QByteArray ColumnOf(int field) const;
+    // Whether the field may be the row id under a name of its own, so that records move when it is written.
+    bool MovesRecords(int field) const;
     const QString& TableName() const { return name_; }
     const QByteArray& Table() const { return table_; } // as SQL
     const QByteArray& RowId() const { return rowId_; } // its alias

@@ -13,6 +13,9 @@ namespace mirel::sqlite {
 namespace {
 
 const QDeadlineTimer kNoHurry(QDeadlineTimer::Forever);
+// How old a value may be: asking what others have written costs as much as reading a record, and a form reads
+// fifty values of one.
+constexpr qint64 kFreshMs = 50;
 
 } // namespace
 
@@ -236,23 +239,39 @@ Outcome StaticCursor::LoadRecord()
     const std::vector<int> fields = AllFields(plan_.fields);
     values_.clear();
     Outcome outcome = InRead([&] {
+        Outcome read = ReadVersion(valuesVersion_);
+        if (!read.Ok())
+            return read;
         return rows_->ReadRecord(key_, fields, [this](std::span<const Cell> cells) {
             for (size_t i = 0; i < cells.size(); ++i)
                 values_.push_back(ValueOfCell(cells[i], plan_.fields[i].type));
             return false;
         });
     });
+    sinceLook_.start();
     valuesAsOf_ = sqlite3_total_changes64(file_->Handle());
     if (outcome.Ok() && values_.empty())
         return {Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
     return outcome;
 }
 
+// Whether others may have changed the record since its values were read.
+bool StaticCursor::HaveValuesAged()
+{
+    if (valuesAsOf_ != sqlite3_total_changes64(file_->Handle()))
+        return true;
+    if (!sinceLook_.hasExpired(kFreshMs))
+        return false;
+    sinceLook_.start();
+    Version now;
+    return ReadVersion(now).Ok() && now != valuesVersion_;
+}
+
 Outcome StaticCursor::GetValue(int field, Value& value)
 {
     if (place_ != Place::On)
         return {Hr::NoCurrentRecord, {}};
-    if (values_.empty() || valuesAsOf_ != sqlite3_total_changes64(file_->Handle())) {
+    if (values_.empty() || HaveValuesAged()) {
         if (Outcome outcome = LoadRecord(); !outcome.Ok())
             return outcome;
     }
@@ -330,9 +349,14 @@ Outcome StaticCursor::UpdateAll(int field, const Value& value, const BulkProgres
         return outcome;
     const BulkRanges ranges = rows_->RangesFor(plan_.updatableSource);
     BulkChange change(*file_, *writer_, plan_.sources[size_t(plan_.updatableSource)].alias);
+    const bool movesRecords = writer_->MovesRecords(field);
     outcome = change.Update(ranges, {field, value}, progress);
     AdoptOwnChange();
-    return outcome;
+    if (!movesRecords)
+        return outcome;
+    file_->NoteChange(writer_->TableName());
+    const Outcome restarted = InRead([this] { return Restart(); });
+    return outcome.Ok() ? restarted : outcome;
 }
 
 Outcome StaticCursor::DeleteAll(const BulkProgress& progress)

@@ -7,6 +7,8 @@
 #include "provider/sqlite/result_cursor.h"
 #include "provider/sqlite/result_rows.h"
 
+#include <QElapsedTimer>
+
 #include <memory>
 #include <optional>
 
@@ -68,6 +70,7 @@ private:
     Outcome CountAll();
     Outcome CountAnew(); // all, as they are now
     Outcome LoadRecord();
+    bool HaveValuesAged();
     qint64& RowIdOfCurrent() { return key_[plan_.updatableSource]; }
     void AdoptOwnChange();
 
@@ -84,6 +87,8 @@ private:
     RecordKey key_;             // of the current record
     std::vector<Value> values_; // of the current record, once one was asked for
     qint64 valuesAsOf_ = -1;    // the handle's count of changes when they were read
+    Version valuesVersion_;     // and what others had written by then
+    QElapsedTimer sinceLook_;   // when that was last compared
 };
 
 } // namespace mirel::sqlite
