@@ -1,0 +1,171 @@
+// What windows cost, on the offscreen platform:
+//
+// mirel-bench-window bare PICTURE         a window with a menu, painted into a PNG file: what Qt itself takes
+// mirel-bench-window grid PICTURE ROWS    the same with a QTableView over so many rows
+// mirel-bench-window page DATABASE        turning pages of the table Birds, against a QTableView in turns; prints
+//                                         a line as mirel-bench-engine does
+#include "tableview/record_browser.h"
+#include "tableview/ui/record_grid.h"
+
+#include <QAbstractTableModel>
+#include <QApplication>
+#include <QHeaderView>
+#include <QImage>
+#include <QLabel>
+#include <QMainWindow>
+#include <QMenuBar>
+#include <QScrollBar>
+#include <QTableView>
+
+#include <algorithm>
+#include <cmath>
+#include <cstdio>
+#include <ctime>
+
+using namespace mirel;
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr QSize kWindowSize(1100, 700);
+constexpr int kRows = 30;
+constexpr int kColumns = 10;
+
+[[noreturn]] void Fail(const QString& what)
+{
+    std::fprintf(stderr, "%s\n", what.toUtf8().constData());
+    std::exit(1);
+}
+
+// As many rows as asked for, without holding them.
+class NumberModel : public QAbstractTableModel {
+public:
+    explicit NumberModel(int rows)
+        : rows_(rows)
+    {
+    }
+    int rowCount(const QModelIndex&) const override { return rows_; }
+    int columnCount(const QModelIndex&) const override { return kColumns; }
+    QVariant data(const QModelIndex& index, int role) const override
+    {
+        return role == Qt::DisplayRole ? QVariant(u"%1, column %2"_s.arg(index.row()).arg(index.column()))
+                                       : QVariant();
+    }
+
+private:
+    int rows_;
+};
+
+// The texts of a table's first records, in memory: what a view has to show without having to read it.
+class TextModel : public QAbstractTableModel {
+public:
+    explicit TextModel(RecordBrowser& browser)
+    {
+        browser.SetRowsPerPage(kRows * 20);
+        browser.GoToFirst();
+        page_ = browser.Page();
+    }
+    int rowCount(const QModelIndex&) const override { return page_.RowCount(); }
+    int columnCount(const QModelIndex&) const override { return page_.ColumnCount(); }
+    QVariant data(const QModelIndex& index, int role) const override
+    {
+        return role == Qt::DisplayRole ? QVariant(page_.At(index.row(), index.column()).text) : QVariant();
+    }
+
+private:
+    RecordPage page_;
+};
+
+int Paint(QWidget* content, const QString& picture)
+{
+    QMainWindow window;
+    QMenu* menu = window.menuBar()->addMenu(u"File"_s);
+    for (const QString& entry : {u"Open"_s, u"Close"_s, u"Quit"_s})
+        menu->addAction(entry);
+    window.setCentralWidget(content);
+    window.resize(kWindowSize);
+    window.show();
+    QCoreApplication::processEvents();
+    return window.grab().save(picture, "PNG") ? 0 : 1;
+}
+
+double ProcessorMs()
+{
+    timespec now{};
+    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
+    return double(now.tv_sec) * 1e3 + double(now.tv_nsec) / 1e6;
+}
+
+class SilentPrompt : public UserPrompt {
+public:
+    bool AskYesNo(const UserMessage&) override { return false; }
+    void Show(const UserMessage& message) override { Fail(message.Text()); }
+    void ShowError(const QString& text) override { Fail(text); }
+    std::optional<QString> AskText(const UserMessage&, const UserMessage&, const QString&) override { return {}; }
+    std::unique_ptr<Progress> StartProgress(const UserMessage&, qint64) override { return {}; }
+};
+
+int TurnPages(const QString& database)
+{
+    DbConnection connection;
+    SilentPrompt prompt;
+    RecordBrowser browser(connection, database, prompt, {});
+    if (!browser.Open(RecordBrowser::StatementOfTable(u"Birds")))
+        return 1;
+    TextModel model(browser);
+    QTableView table;
+    table.setModel(&model);
+    browser.SetRowsPerPage(kRows);
+    RecordGrid grid(browser, nullptr);
+    grid.ShowState();
+    const int rowHeight = grid.CellRect(0, 0).height();
+    grid.resize(kWindowSize.width(), (kRows + 2) * rowHeight);
+    table.verticalHeader()->setDefaultSectionSize(rowHeight);
+    table.resize(grid.size());
+    for (QWidget* widget : {static_cast<QWidget*>(&grid), static_cast<QWidget*>(&table)}) {
+        widget->setAttribute(Qt::WA_DontShowOnScreen);
+        widget->show();
+    }
+    QImage image(grid.size(), QImage::Format_RGB32);
+    double best = HUGE_VAL;
+    double theirBest = HUGE_VAL;
+    constexpr int kPages = 200;
+    browser.GoToFirst();
+    for (int page = 0; page < kPages; ++page) {
+        double begin = ProcessorMs();
+        browser.PageDown();
+        grid.ShowState();
+        grid.render(&image);
+        best = std::min(best, ProcessorMs() - begin);
+
+        begin = ProcessorMs();
+        table.verticalScrollBar()->setValue(page % 19 * kRows);
+        table.resizeColumnsToContents();
+        table.render(&image);
+        theirBest = std::min(theirBest, ProcessorMs() - begin);
+    }
+    std::printf("turn a page of %d x %d cells, columns fitted\t%.4f\t%.4f\t%.4f\t%.4f\t-\t3.5 ms; QTableView\n",
+                kRows, model.columnCount({}), best, theirBest, best, theirBest);
+    return 0;
+}
+
+} // namespace
+
+int main(int argc, char** argv)
+{
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(argc, argv);
+    const QStringList words = QApplication::arguments();
+    const QString what = words.value(1);
+    if (what == u"bare")
+        return Paint(new QLabel(u"A window"_s), words.value(2));
+    if (what == u"grid") {
+        NumberModel model(words.value(3).toInt());
+        auto* table = new QTableView;
+        table->setModel(&model);
+        return Paint(table, words.value(2));
+    }
+    if (what == u"page")
+        return TurnPages(words.value(2));
+    Fail(u"mirel-bench-window bare|grid|page …"_s);
+}
