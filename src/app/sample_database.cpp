@@ -1,5 +1,6 @@
 #include "app/sample_database.h"
 
+#include "app/sample_forms.h"
 #include "csvimport/csv_import.h"
 #include "resources/string_table.h"
 
@@ -65,7 +66,7 @@ constexpr std::array kQueries = {
                 u"INNER JOIN Contacts ON Orders.Customer = Contacts.Name ORDER BY Orders.Number"},
 };
 
-const QStringList kFavorites = {u"table:Bird Strikes"_s, u"query:Strikes by species"_s};
+const QStringList kFavorites = {u"table:Bird Strikes"_s, u"query:Strikes by species"_s, u"form:Strikes"_s};
 
 CsvFormat FormatOfTheFiles()
 {
@@ -164,8 +165,8 @@ bool SampleDatabase::Open(DatabaseSession& session) const
     }
     if (!session.Open(path_))
         return false;
-    // Without queries and favorites it is a sample all the same.
-    (void)session.Store().Apply([](FormStore& store) { return AddQueries(store), true; });
+    // Without queries, forms and favorites it is a sample all the same.
+    (void)session.Store().Apply([](FormStore& store) { return AddQueries(store), AddSampleForms(store), true; });
     (void)session.SetFavorites(kFavorites);
     return true;
 }

@@ -30,19 +30,34 @@ void CollectAggregates(ExprNode& node, std::vector<ControlBinding::Aggregate>& a
     }
 }
 
-// The text that is parsed for what the control shows; empty: it shows what is put into it.
-QString ShownSource(const ControlDef& control, const ControlBinding& binding)
+ExprTree OwnField(const ControlDef& control)
 {
-    const bool isDropDown = control.type == ControlType::DropDownBox;
-    if (control.type != ControlType::EditBox && control.type != ControlType::CheckBox && !isDropDown)
-        return {};
-    if (control.hasSource != 0) {
-        const QString source = isDropDown ? binding.dropDown.data : control.source.Text();
-        const bool isItems = isDropDown && DropDownItems(source).size() != 1;
-        if (!source.isEmpty() && !isItems)
-            return source;
+    return control.fieldBound != 0 ? ParseExpression(u'[' + control.name.Text() + u']', ExprMode::Condition)
+                                   : nullptr;
+}
+
+// The expression of a drop-down box's data: more than one item is none. A single name may be an item all the same,
+// where no field bears it; then the box shows its own field.
+void BindDropDown(const ControlDef& control, ControlBinding& binding)
+{
+    binding.dropDown = SplitDropDown(control.source.Text());
+    const bool isOne = control.hasSource != 0 && DropDownItems(binding.dropDown.data).size() == 1;
+    binding.tree = isOne ? ParseExpression(binding.dropDown.data, ExprMode::Condition) : nullptr;
+    if (!binding.tree) {
+        binding.tree = OwnField(control);
+    } else if (binding.tree->kind == NodeKind::Operand) {
+        binding.isMaybeItem = true;
+        binding.ownField = OwnField(control);
     }
-    return control.fieldBound != 0 ? u'[' + control.name.Text() + u']' : QString();
+}
+
+void BindSource(const ControlDef& control, ControlBinding& binding)
+{
+    binding.tree = control.hasSource != 0 ? ParseExpression(control.source.Text(), ExprMode::Condition) : nullptr;
+    if (!binding.tree)
+        binding.tree = OwnField(control);
+    if (binding.tree && control.type == ControlType::CheckBox)
+        CompareYesNoAsNumber(*binding.tree);
 }
 
 std::vector<ControlBinding::Column> BindColumns(const ControlDef& control)
@@ -64,18 +79,20 @@ ControlBinding BindControl(const ControlDef& control)
     ControlBinding binding;
     if (control.type == ControlType::List)
         binding.columns = BindColumns(control);
-    if (control.type == ControlType::DropDownBox)
-        binding.dropDown = SplitDropDown(control.source.Text());
-    binding.tree = ParseExpression(ShownSource(control, binding), ExprMode::Condition);
-    if (!binding.tree)
-        return binding;
-    if (control.type == ControlType::CheckBox)
-        CompareYesNoAsNumber(*binding.tree);
-    binding.isMaybeItem = control.type == ControlType::DropDownBox && control.hasSource != 0 &&
-                          !binding.dropDown.data.isEmpty() && binding.tree->kind == NodeKind::Operand;
-    binding.wholeResult = control.sourceScope == SourceScope::WholeResult;
-    CollectAggregates(*binding.tree, binding.aggregates);
+    else if (control.type == ControlType::DropDownBox)
+        BindDropDown(control, binding);
+    else if (control.type == ControlType::EditBox || control.type == ControlType::CheckBox)
+        BindSource(control, binding);
+    if (binding.tree) {
+        binding.wholeResult = control.sourceScope == SourceScope::WholeResult;
+        CollectAggregates(*binding.tree, binding.aggregates);
+    }
     return binding;
+}
+
+bool IsItem(const ControlBinding& binding, EvalContext& context)
+{
+    return binding.isMaybeItem && ColumnOf(binding.tree.get(), context) < 0;
 }
 
 int ColumnOf(const ExprNode* tree, EvalContext& context)
@@ -97,7 +114,8 @@ const ExprNode* ShownField(const ControlBinding& binding, ControlType type)
 
 int ShownColumn(const ControlBinding& binding, ControlType type, FormContext& context)
 {
-    const int column = ColumnOf(ShownField(binding, type), context);
+    const ExprNode* shown = IsItem(binding, context) ? binding.ownField.get() : ShownField(binding, type);
+    const int column = ColumnOf(shown, context);
     return column < context.FieldCount() ? column : column - context.FieldCount();
 }
 

@@ -26,7 +26,9 @@ struct ControlBinding {
     std::vector<Aggregate> aggregates; // the outermost ones of `tree`
     std::vector<Column> columns;       // of a list
     DropDownSource dropDown;
-    bool isMaybeItem = false; // of a drop-down box: `tree` is an item instead, where no field bears its name
+    // Of a drop-down box whose data is one name: the name is an item where no field bears it, see IsItem.
+    bool isMaybeItem = false;
+    ExprTree ownField; // what such a box then shows; null: what is put into it
 
     QString recordText; // what the record gave it last
     bool recordTicked = false;
@@ -34,6 +36,9 @@ struct ControlBinding {
 };
 
 ControlBinding BindControl(const ControlDef& control);
+
+// Whether `tree`, in this result, is a drop-down box's item and not what the box shows.
+bool IsItem(const ControlBinding& binding, EvalContext& context);
 
 // The result's column when the tree is a field's name and nothing else; -1 otherwise.
 int ColumnOf(const ExprNode* tree, EvalContext& context);

@@ -113,9 +113,8 @@ void RunningForm::MarkUpdateReferences()
 
 QStringList RunningForm::ItemsOf(const ControlBinding& binding, bool& failed)
 {
-    QStringList items = binding.isMaybeItem && ColumnOf(binding.tree.get(), result_.Context()) >= 0
-                            ? QStringList()
-                            : DropDownItems(binding.dropDown.data);
+    const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, result_.Context());
+    QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
     items.removeDuplicates();
     if (binding.dropDown.query.isEmpty())
         return items;
@@ -239,13 +238,14 @@ void RunningForm::ShowControl(size_t index)
 {
     ControlRun& control = controls_[index];
     ControlBinding& binding = bindings_[index];
-    if (binding.isMaybeItem && ColumnOf(binding.tree.get(), result_.Context()) < 0)
+    const ExprTree& tree = IsItem(binding, result_.Context()) ? binding.ownField : binding.tree;
+    if (!tree)
         return;
     if (control.type == ControlType::CheckBox) {
-        binding.recordTicked = HoldsOnRecord(*binding.tree, result_.Context());
+        binding.recordTicked = HoldsOnRecord(*tree, result_.Context());
         ShowTicked(control, binding.recordTicked);
     } else {
-        binding.recordText = TextOnRecord(*binding.tree, result_.Context());
+        binding.recordText = TextOnRecord(*tree, result_.Context());
         ShowText(control, binding.recordText);
     }
     binding.shownRecord = result_.Index();

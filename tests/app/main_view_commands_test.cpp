@@ -193,7 +193,7 @@ TEST_F(MainViewCommandsTest, TheSampleIsMadeOnceAndIsTheUsersFromThenOn)
     ASSERT_TRUE(program_->commands.OpenSample()) << prompt_.shown.join(u'\n').toStdString();
     EXPECT_EQ(program_->Names(MainTab::Table),
               QStringList({u"Airports"_s, u"Bird Strikes"_s, u"Contacts"_s, u"Orders"_s}));
-    EXPECT_EQ(program_->Names(MainTab::Favorites).size(), 2);
+    EXPECT_EQ(program_->Names(MainTab::Favorites).size(), 3);
     for (const MainEntry& favorite : program_->state.Entries(MainTab::Favorites))
         EXPECT_FALSE(favorite.missing) << favorite.name.toStdString();
 

@@ -148,6 +148,10 @@ TEST_F(RunningFormTest, FillsDropDownsFromDataAndQueries)
     form.DropDown(u"Name", u"x;y").Last().fieldBound = 1;
     form.DropDown(u"field", u"Birds.Name").Last().hasSource = 1;
     form.DropDown(u"one", u"single").Last().hasSource = 1;
+    form.DropDown(u"Price", u"free").Last().hasSource = 1;
+    form.Last().fieldBound = 1;
+    form.DropDown(u"Notes", u"a;b").Last().hasSource = 1;
+    form.Last().fieldBound = 1;
     Start(form);
     const auto items = [this](QStringView name) { return running->Controls()[size_t(Control(name))].items; };
     EXPECT_EQ(items(u"data"), (QStringList{u"red"_s, u"green"_s, u"blue"_s}));
@@ -161,6 +165,10 @@ TEST_F(RunningFormTest, FillsDropDownsFromDataAndQueries)
     EXPECT_EQ(Text(u"field"), u"Osprey"_s);
     EXPECT_EQ(items(u"field"), QStringList());
     EXPECT_EQ(items(u"one"), QStringList{u"single"_s});
+    EXPECT_EQ(items(u"Price"), QStringList{u"free"_s});
+    EXPECT_EQ(Text(u"Price"), u"1.5"_s);
+    EXPECT_EQ(items(u"Notes"), (QStringList{u"a"_s, u"b"_s}));
+    EXPECT_EQ(Text(u"Notes"), u"one"_s);
 }
 
 TEST_F(RunningFormTest, IsDirtyByWhatWouldBeLost)
