@@ -20,6 +20,11 @@ constexpr std::array kEvalOptions = {Opt::Database, Opt::Source, Opt::Record, Op
 constexpr std::array kShowOptions = {Opt::Query, Opt::Record, Opt::Set, Opt::Press, Opt::Yes, Opt::Format};
 constexpr std::array kNameOptions = {Opt::Name};
 constexpr std::array kImportNeeds = {Opt::Table};
+constexpr std::array kExportOptions = {
+    Opt::Query,     Opt::Yes,           Opt::Header,        Opt::Separator,     Opt::Quote,
+    Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator, Opt::DoubledQuotes, Opt::Encoding,
+};
+constexpr std::array kSaveOptions = {Opt::Table, Opt::Replace, Opt::Yes};
 
 constexpr std::array kCommands = {
     CommandDef{"new", "DB", "create a database", {}, {}, RunNew},
@@ -34,6 +39,22 @@ constexpr std::array kCommands = {
     CommandDef{"tables", "DB", "list the tables", {}, {}, RunTables},
     CommandDef{"fields", "DB TABLE", "list the fields of a table", kFormatOptions, {}, RunFields},
     CommandDef{"import", "DB FILE", "read a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
+    CommandDef{"export",
+               "DB [SOURCE] FILE",
+               "write a table, a SELECT or a saved query as a CSV file (-: to standard output)",
+               kExportOptions,
+               {},
+               RunExport},
+    CommandDef{"aggregate",
+               "DB SOURCE FIELD sum|max|min|avg",
+               "sum up a field over all records of a table or a SELECT",
+               {},
+               {},
+               RunAggregateCommand},
+    CommandDef{"update-all", "DB SOURCE FIELD VALUE", "set a field of all records of a table or a SELECT",
+               kDropOptions, kDropOptions, RunUpdateAll},
+    CommandDef{"delete-all", "DB SOURCE", "delete all records of a table or a SELECT", kDropOptions, kDropOptions,
+               RunDeleteAll},
     CommandDef{"eval", "EXPRESSION", "the value of an expression", kEvalOptions, {}, RunEval, "text|json"},
     CommandDef{"forms list",
                "DB",
@@ -58,6 +79,16 @@ constexpr std::array kCommands = {
     CommandDef{"forms export", "DB NAME FILE", "write a form file", kDropOptions, {}, RunFormsExport},
     CommandDef{"forms import", "DB FILE", "add the form of a form file", kNameOptions, {}, RunFormsImport},
     CommandDef{"forms delete", "DB NAME", "delete a form", kDropOptions, kDropOptions, RunFormsDelete},
+    CommandDef{"queries list",
+               "DB",
+               "list the saved queries with their tables and statements",
+               kFormatOptions,
+               {},
+               RunQueriesList},
+    CommandDef{"queries save", "DB NAME STATEMENT", "save a statement as a query", kSaveOptions, kImportNeeds,
+               RunQueriesSave},
+    CommandDef{"queries run", "DB NAME", "print the records of a saved query", kFormatOptions, {}, RunQueriesRun},
+    CommandDef{"queries delete", "DB NAME", "delete a saved query", kDropOptions, kDropOptions, RunQueriesDelete},
     CommandDef{"config get", "SECTION KEY", "print a setting", {}, {}, RunConfigGet},
     CommandDef{"config set", "SECTION KEY VALUE", "change a setting", {}, {}, RunConfigSet},
 };

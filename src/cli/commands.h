@@ -18,6 +18,20 @@ ExitStatus RunSql(Run& run);
 // import_command.cpp
 ExitStatus RunImport(Run& run);
 
+// export_command.cpp
+ExitStatus RunExport(Run& run);
+
+// bulk_commands.cpp
+ExitStatus RunAggregateCommand(Run& run);
+ExitStatus RunUpdateAll(Run& run);
+ExitStatus RunDeleteAll(Run& run);
+
+// query_commands.cpp
+ExitStatus RunQueriesList(Run& run);
+ExitStatus RunQueriesSave(Run& run);
+ExitStatus RunQueriesRun(Run& run);
+ExitStatus RunQueriesDelete(Run& run);
+
 // eval_command.cpp
 ExitStatus RunEval(Run& run);
 

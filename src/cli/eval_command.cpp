@@ -52,12 +52,6 @@ QString FaultOf(const Arguments& arguments)
     return {};
 }
 
-ExitStatus Refuse(const QString& fault)
-{
-    WriteMessage(fault + u'\n' + StringText(Str::CliSeeHelp, {QStringLiteral(" eval")}));
-    return ExitStatus::BadArguments;
-}
-
 // One expression over the records of one result, written value by value.
 class EvalRun {
 public:
@@ -204,7 +198,7 @@ ExitStatus RunEval(Run& run)
     QString fault = FaultOf(run.Args());
     const std::optional<QHash<QString, QString>> controls = ControlsOf(run.Args(), fault);
     if (!fault.isEmpty())
-        return Refuse(fault);
+        return run.Refuse(fault);
     EvalRun eval(run, *controls);
     if (run.Args().Has(Opt::Tree)) {
         eval.WriteTree();

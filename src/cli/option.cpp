@@ -47,11 +47,13 @@ constexpr std::array kOptions = {
     OptionDef{Opt::Tree, "--tree", ValueKind::Flag, "", "print how the expression was read"},
     OptionDef{Opt::Explain, "--explain", ValueKind::Flag, "",
               "tell what was left out, what is likely meant otherwise, and why a value is null"},
-    OptionDef{Opt::Query, "--query", ValueKind::Text, "TEXT", "the statement whose records the form shows"},
+    OptionDef{Opt::Query, "--query", ValueKind::Text, "TEXT",
+              "a form's records: a statement; an export's: a saved query"},
     OptionDef{Opt::Set, "--set", ValueKind::Text, "CONTROL=TEXT",
               "change a control as the user would; these and --press are done in the order in which they stand"},
     OptionDef{Opt::Press, "--press", ValueKind::Text, "BUTTON", "press a button"},
     OptionDef{Opt::Name, "--name", ValueKind::Text, "NAME", "the name that it gets"},
+    OptionDef{Opt::Replace, "--replace", ValueKind::Flag, "", "replace the query of that name"},
 };
 
 constexpr bool StandInTheOrderOfTheirIds()

@@ -41,6 +41,7 @@ enum class Opt {
     Set,
     Press,
     Name,
+    Replace,
 };
 
 // What an option's value has to be; a value that is not is refused before the command runs.

@@ -1,6 +1,7 @@
 #include "cli/run.h"
 
 #include "resources/string_table.h"
+#include "tableview/record_browser.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -82,6 +83,18 @@ void Run::WriteTiming() const
     if (timing_.nsPerEval)
         line[u"ns_per_eval"_s] = *timing_.nsPerEval;
     WriteMessage(QString::fromUtf8(QJsonDocument(line).toJson(QJsonDocument::Compact)));
+}
+
+ExitStatus Run::Refuse(const QString& fault) const
+{
+    return RefuseArguments(fault, arguments_.command);
+}
+
+QString Run::SourceOf(const QString& given)
+{
+    QStringList tables;
+    session_.ListTables(tables);
+    return tables.contains(given, Qt::CaseInsensitive) ? RecordBrowser::StatementOfTable(given) : given;
 }
 
 ExitStatus RunProgram(const QStringList& words, Output& output)

@@ -50,6 +50,10 @@ public:
     // In the format that --format names, with the user's words for Yes and No.
     std::unique_ptr<RecordWriter> MakeWriter();
     void WriteTiming() const;
+    // What is wrong with the arguments, and how to get help.
+    ExitStatus Refuse(const QString& fault) const;
+    // A table's name or a statement, as a recordset takes it; the name may stand there without its brackets.
+    QString SourceOf(const QString& given);
 
 private:
     Arguments arguments_;

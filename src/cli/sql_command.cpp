@@ -1,3 +1,4 @@
+#include "cli/sql_command.h"
 #include "cli/commands.h"
 #include "cli/run.h"
 #include "cli/statement_splitter.h"
@@ -35,19 +36,6 @@ bool WriteRecords(Run& run, DbRecordset& records)
     return read;
 }
 
-bool RunStatement(Run& run, const QString& statement)
-{
-    // Only a static cursor can begin anywhere; the other one gives its first records sooner.
-    const CursorType cursor = run.Args().Has(Opt::Offset) ? CursorType::Static : CursorType::ForwardOnly;
-    DbRecordset records(run.Connection());
-    const bool done = records.Open(statement, run.Session().Path(), cursor, LockType::ReadOnly) &&
-                      (records.Fields().empty() || WriteRecords(run, records));
-    if (!done)
-        ReportProviderError(run.Prompt(), &records, records.LastResult());
-    // Whoever feeds a script may wait for the records before going on.
-    return done && run.Out().Flush() && !WasInterrupted();
-}
-
 bool RunScript(Run& run, QIODevice& script)
 {
     StatementSplitter splitter;
@@ -66,6 +54,19 @@ bool RunScript(Run& run, QIODevice& script)
 }
 
 } // namespace
+
+bool RunStatement(Run& run, const QString& statement)
+{
+    // Only a static cursor can begin anywhere; the other one gives its first records sooner.
+    const CursorType cursor = run.Args().Has(Opt::Offset) ? CursorType::Static : CursorType::ForwardOnly;
+    DbRecordset records(run.Connection());
+    const bool done = records.Open(statement, run.Session().Path(), cursor, LockType::ReadOnly) &&
+                      (records.Fields().empty() || WriteRecords(run, records));
+    if (!done)
+        ReportProviderError(run.Prompt(), &records, records.LastResult());
+    // Whoever feeds a script may wait for the records before going on.
+    return done && run.Out().Flush() && !WasInterrupted();
+}
 
 ExitStatus RunSql(Run& run)
 {

@@ -44,14 +44,14 @@ CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, 
     return result;
 }
 
-bool ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path, OnStop onStop,
-                   UserPrompt& prompt)
+std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path,
+                                    OnStop onStop, UserPrompt& prompt)
 {
     using Ending = CsvExportResult::Ending;
     QSaveFile file(path);
     if (!file.open(QIODevice::WriteOnly)) {
         prompt.Show({Str::FileCreationFail, {QDir::toNativeSeparators(path)}});
-        return false;
+        return {};
     }
     CsvExportResult result;
     {
@@ -61,16 +61,16 @@ bool ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const Q
     } // the display goes before a message comes
     if (result.ending == Ending::ReadFailed) {
         ReportProviderError(prompt, &source, source.LastResult());
-        return false;
+        return {};
     }
     if (result.ending == Ending::Stopped && onStop == OnStop::Discard)
-        return false;
+        return {};
     if (result.ending == Ending::WriteFailed || !file.commit()) {
         prompt.Show({Str::FileWriteFail, {QDir::toNativeSeparators(path), file.errorString()}});
-        return false;
+        return {};
     }
     prompt.Show({Str::RecordsExported, {QString::number(result.records)}});
-    return true;
+    return result.records;
 }
 
 QStringList PreviewCsv(DbRecordset& source, const CsvExportOptions& options, int maxLines)

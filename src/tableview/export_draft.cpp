@@ -53,7 +53,7 @@ bool ExportDraft::ChoosePath(const QString& path)
 
 bool ExportDraft::Run()
 {
-    return CanRun() && ExportCsvFile(records_, options_, path_, OnStop::KeepWritten, prompt_);
+    return CanRun() && ExportCsvFile(records_, options_, path_, OnStop::KeepWritten, prompt_).has_value();
 }
 
 } // namespace mirel

@@ -23,6 +23,13 @@ std::optional<QString> SavedQueries::StatementOf(QStringView name) const
     return query ? std::optional(query->text.Text()) : std::nullopt;
 }
 
+bool SavedQueries::Knows(QStringView name) const
+{
+    QueryDef query;
+    query.SetName(name);
+    return std::as_const(store_).FindQuery(query.name.Text()) != nullptr;
+}
+
 bool SavedQueries::AskIfUnbalanced(const QString& statement)
 {
     return IsBalanced(statement) ||

@@ -28,6 +28,7 @@ public:
     bool CanSave() const { return !store_.Path().isEmpty(); }
     QStringList Names() const;
     std::optional<QString> StatementOf(QStringView name) const;
+    bool Knows(QStringView name) const; // by the name as it would be kept
 
     // Asks before a statement is taken whose brackets or quotes are not closed; false: the user takes it back.
     bool AskIfUnbalanced(const QString& statement);
