@@ -1,9 +1,7 @@
 #include "forms/running_form.h"
 
 #include "data/provider_error.h"
-#include "expr/evaluation.h"
 #include "forms/aggregate_pass.h"
-#include "forms/form_query.h"
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
 #include "provider/conversion.h"
@@ -14,7 +12,7 @@
 #include <algorithm>
 #include <utility>
 
-// The controls, what they show and what the user does to them; the buttons are in running_form_buttons.cpp.
+// What is shown, moving, adding, filters; the first result and the buttons are in running_form_buttons.cpp.
 
 namespace mirel {
 namespace {
@@ -22,24 +20,6 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kMaxItems = 10'000; // of a drop-down box: nobody looks through more
-
-bool HoldsValue(ControlType type)
-{
-    return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
-}
-
-bool ShowsText(ControlType type)
-{
-    return type == ControlType::EditBox || type == ControlType::DropDownBox;
-}
-
-bool IsClock(const ControlRun& control, const ControlBinding& binding)
-{
-    if (control.type != ControlType::EditBox || !binding.tree)
-        return false;
-    const OpCode root = binding.tree->code;
-    return root == OpCode::SysTime || root == OpCode::SysDate || root == OpCode::SysDateTime;
-}
 
 QString DisplayText(const Value& value, FieldType type, const YesNoWords& words)
 {
@@ -53,303 +33,109 @@ RunningForm::RunningForm(FormCall call, FormEnvironment environment)
     , callQuery_(std::move(call.query))
     , callRecord_(call.record)
     , environment_(std::move(environment))
+    , controls_(form_)
     , result_(
           environment_.connection, environment_.database, environment_.prompt, environment_.settings.words,
           [this](QStringView name) { return ControlText(name); }, environment_.clock)
 {
-    BuildControls();
 }
 
 RunningForm::~RunningForm() = default;
-
-// --- making the controls ----------------------------------------------------------------------------------------
-
-void RunningForm::BuildControls()
-{
-    for (const ControlDef& definition : form_.controls) {
-        ControlRun control;
-        control.definition = &definition;
-        control.windowId = kFirstControlWindow + int(controls_.size());
-        control.type = definition.type;
-        control.name = definition.name.Text();
-        ControlBinding binding = BindControl(definition);
-        if (control.type == ControlType::Label || control.type == ControlType::Button)
-            control.text = control.name;
-        else if (ShowsText(control.type) && definition.fieldBound != 0)
-            control.text = definition.defaultValue.Text();
-        for (const ControlBinding::Column& column : binding.columns)
-            control.columns += column.name;
-        control.isClock = IsClock(control, binding);
-        control.keepsInput = definition.fieldBound != 0 || ShownField(binding, definition.type);
-        controls_.push_back(std::move(control));
-        bindings_.push_back(std::move(binding));
-    }
-    for (int i = 0; i < int(controls_.size()); ++i) {
-        const QString name = controls_[size_t(i)].name.trimmed(); // references are trimmed, too
-        const int known = inputs_.value(name, -1);
-        if (known < 0 || (!HoldsValue(controls_[size_t(known)].type) && HoldsValue(controls_[size_t(i)].type)))
-            inputs_[name] = i;
-    }
-    MarkUpdateReferences();
-}
-
-void RunningForm::MarkUpdateReferences()
-{
-    for (const ControlDef& definition : form_.controls) {
-        if (definition.type != ControlType::Button || definition.buttonFunction != ButtonFunction::Update)
-            continue;
-        QStringList names;
-        for (const SourceAssignment& source : SplitAssignments(definition.source.Text())) {
-            const FieldAssignment assignment = ParseAssignment(source);
-            if (assignment.tree)
-                CollectControlNames(*assignment.tree, names);
-        }
-        for (const QString& name : names) {
-            if (const int control = FindInput(name); control >= 0)
-                controls_[size_t(control)].keepsInput = true;
-        }
-    }
-}
-
-QStringList RunningForm::ItemsOf(const ControlBinding& binding, bool& failed)
-{
-    const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, result_.Context());
-    QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
-    items.removeDuplicates();
-    if (binding.dropDown.query.isEmpty())
-        return items;
-    const QString query = CompleteQuery(binding.dropDown.query, form_.tableName.Text(), TextsForQueries());
-    DbRecordset rows(environment_.connection);
-    failed =
-        !MayRun(query) || !rows.Open(query, environment_.database, CursorType::ForwardOnly, LockType::ReadOnly);
-    if (failed) {
-        ReportProviderError(environment_.prompt, &rows, rows.LastResult());
-        return items;
-    }
-    QSet<QString> known(items.begin(), items.end());
-    while (!rows.IsEof() && items.size() < kMaxItems) {
-        const Value value = rows.FieldValue(0);
-        const QString text = DisplayText(value, rows.TypeOfField(0), environment_.settings.words);
-        if (!value.IsNull() && !known.contains(text)) {
-            known.insert(text);
-            items += text;
-        }
-        if (!rows.MoveNext())
-            break;
-    }
-    return items;
-}
-
-void RunningForm::FillDropDowns()
-{
-    for (size_t i = 0; i < controls_.size(); ++i) {
-        bool failed = false;
-        if (controls_[i].type == ControlType::DropDownBox)
-            FillDropDown(i, failed);
-        if (failed)
-            return; // one message is enough, and the next query is likely to fail likewise
-    }
-}
-
-void RunningForm::FillDropDown(size_t control, bool& failed)
-{
-    QStringList items = ItemsOf(bindings_[control], failed);
-    if (items == controls_[control].items)
-        return;
-    controls_[control].items = std::move(items);
-    Touch(controls_[control]);
-}
-
-void RunningForm::RefreshItems(int control)
-{
-    bool failed = false;
-    if (Is(control, ControlType::DropDownBox))
-        FillDropDown(size_t(control), failed);
-}
-
-// --- what is shown ----------------------------------------------------------------------------------------------
 
 void RunningForm::ChangeSettings(const FormViewSettings& settings)
 {
     environment_.settings = settings;
     result_.Context().SetWords(settings.words);
-    if (!dirty_)
+    if (!IsDirty())
         ShowRecord();
 }
 
-bool RunningForm::Is(int control, ControlType type) const
-{
-    return control >= 0 && control < int(controls_.size()) && controls_[size_t(control)].type == type;
-}
-
-int RunningForm::FindControl(QStringView name) const
-{
-    return inputs_.value(name.trimmed().toString(), -1);
-}
-
-int RunningForm::FindInput(QStringView name) const
-{
-    const int control = FindControl(name);
-    return control >= 0 && HoldsValue(controls_[size_t(control)].type) ? control : -1;
-}
-
-QString RunningForm::ControlText(QStringView name) const
-{
-    const int found = FindInput(name);
-    return found < 0 ? QString() : ShownText(found);
-}
-
-QString RunningForm::ShownText(int index) const
-{
-    const ControlRun& control = controls_[size_t(index)];
-    if (control.type == ControlType::CheckBox)
-        return control.ticked ? u"1"_s : u"0"_s;
-    return control.text;
-}
+// --- items of drop-down boxes -----------------------------------------------------------------------------------
 
 ControlTextOf RunningForm::TextsForQueries() const
 {
-    return
-        [this](QStringView name) { return FindInput(name) < 0 ? std::nullopt : std::optional(ControlText(name)); };
+    return [this](QStringView name) { return controls_.TextOf(name); };
 }
 
-void RunningForm::Touch(ControlRun& control)
+// Those of the query's first column that are not there yet, NULL left out.
+bool RunningForm::AddItemsOf(const QString& query, QStringList& items)
 {
-    control.revision = ++revision_;
-}
-
-void RunningForm::ShowText(ControlRun& control, const QString& text)
-{
-    if (control.text == text)
-        return;
-    control.text = text;
-    Touch(control);
-}
-
-void RunningForm::ShowTicked(ControlRun& control, bool ticked)
-{
-    if (control.ticked == ticked)
-        return;
-    control.ticked = ticked;
-    Touch(control);
-}
-
-void RunningForm::ShowControl(size_t index)
-{
-    ControlRun& control = controls_[index];
-    ControlBinding& binding = bindings_[index];
-    const ExprTree& tree = IsItem(binding, result_.Context()) ? binding.ownField : binding.tree;
-    if (!tree)
-        return;
-    if (control.type == ControlType::CheckBox) {
-        binding.recordTicked = HoldsOnRecord(*tree, result_.Context());
-        ShowTicked(control, binding.recordTicked);
-    } else {
-        binding.recordText = TextOnRecord(*tree, result_.Context());
-        ShowText(control, binding.recordText);
+    const QString statement = CompleteQuery(query, form_.tableName.Text(), TextsForQueries());
+    DbRecordset rows(environment_.connection);
+    if (!MayRun(statement))
+        return false;
+    bool more = rows.Open(statement, environment_.database, CursorType::ForwardOnly, LockType::ReadOnly);
+    QSet<QString> known(items.begin(), items.end());
+    for (; more && !rows.IsEof() && items.size() < kMaxItems; more = rows.MoveNext()) {
+        const Value value = rows.FieldValue(0);
+        const QString text = DisplayText(value, rows.TypeOfField(0), environment_.settings.words);
+        if (value.IsNull() || known.contains(text))
+            continue;
+        known.insert(text);
+        items += text;
     }
-    binding.shownRecord = result_.Index();
+    if (!more)
+        ReportProviderError(environment_.prompt, &rows, rows.LastResult());
+    return more;
 }
+
+bool RunningForm::FillDropDown(int control)
+{
+    const ControlBinding& binding = controls_.Bindings()[size_t(control)];
+    const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, result_.Context());
+    QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
+    items.removeDuplicates();
+    const bool filled = binding.dropDown.query.isEmpty() || AddItemsOf(binding.dropDown.query, items);
+    controls_.SetItems(control, std::move(items));
+    return filled;
+}
+
+void RunningForm::FillDropDowns()
+{
+    for (int i = 0; i < int(Controls().size()); ++i) {
+        // One message is enough: the next query is likely to fail likewise.
+        if (controls_.Is(i, ControlType::DropDownBox) && !FillDropDown(i))
+            return;
+    }
+}
+
+void RunningForm::RefreshItems(int control)
+{
+    if (controls_.Is(control, ControlType::DropDownBox))
+        (void)FillDropDown(control);
+}
+
+// --- what is shown ----------------------------------------------------------------------------------------------
 
 void RunningForm::ShowRecord()
 {
-    ForgetEdits();
-    if (result_.Index() < 0) {
-        ClearControls(Clearing::Record);
-        return;
-    }
-    for (size_t i = 0; i < controls_.size(); ++i) {
-        if (controls_[i].type == ControlType::List)
-            ShowList(controls_[i]);
-        else if (bindings_[i].tree && !bindings_[i].wholeResult)
-            ShowControl(i);
-    }
+    controls_.ShowRecord(result_);
 }
 
 void RunningForm::ShowResult()
 {
     ShowRecord();
     RecomputeAggregates();
-    for (ControlRun& control : controls_) {
-        if (control.type == ControlType::List)
-            Touch(control); // its rows may hold other texts
-    }
-    ++revision_;
-}
-
-void RunningForm::ShowList(ControlRun& control)
-{
-    const qint64 rows = std::max<qint64>(result_.Count(), 0);
-    if (control.rows == rows && control.selectedRow == result_.Index())
-        return;
-    control.rows = rows;
-    control.selectedRow = result_.Index();
-    Touch(control);
-}
-
-void RunningForm::ClearControls(Clearing what)
-{
-    for (size_t i = 0; i < controls_.size(); ++i) {
-        ControlRun& control = controls_[i];
-        ControlBinding& binding = bindings_[i];
-        if (control.type == ControlType::List)
-            ShowList(control);
-        if (!binding.tree || binding.wholeResult != (what == Clearing::Aggregates))
-            continue;
-        if (control.isClock) {
-            ShowControl(i);
-            continue;
-        }
-        binding.recordText.clear();
-        binding.recordTicked = false;
-        binding.shownRecord = -1;
-        ShowTicked(control, false);
-        if (ShowsText(control.type))
-            ShowText(control, {});
-    }
+    controls_.TouchLists();
 }
 
 void RunningForm::RecomputeAggregates()
 {
-    const bool computed = result_.Count() > 0 &&
-                          ComputeAggregates(result_.Records(), result_.Context(), environment_.prompt, bindings_);
-    if (!computed) {
-        if (result_.Count() > 0)
+    bool computed = result_.Count() > 0;
+    if (computed) {
+        computed =
+            ComputeAggregates(result_.Records(), result_.Context(), environment_.prompt, controls_.Bindings());
+        if (!computed)
             result_.Report();
-        ClearControls(Clearing::Aggregates);
-        return;
     }
-    for (size_t i = 0; i < controls_.size(); ++i) {
-        if (bindings_[i].tree && bindings_[i].wholeResult)
-            ShowControl(i);
-    }
+    controls_.ShowAggregates(result_, computed);
 }
 
 std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int count)
 {
-    std::vector<QStringList> rows;
-    if (!Is(control, ControlType::List) || !HasResult() || first < 0 || count <= 0)
-        return rows;
-    std::vector<ControlBinding::Column>& columns = bindings_[size_t(control)].columns;
-    RowContext context(result_.Context(), result_.Count());
-    for (const ControlBinding::Column& column : columns) {
-        if (column.tree)
-            context.Collect(*column.tree);
-    }
-    ReadRange range{.first = first, .count = count, .fields = context.Columns()};
-    if (range.fields.empty())
-        range.fields = {0}; // none would be all of them
-    const bool read = result_.Records().Read(range, [&](std::span<const Cell> cells) {
-        context.Lend(first + qint64(rows.size()), cells);
-        QStringList texts;
-        for (ControlBinding::Column& column : columns)
-            texts += column.tree ? TextOnRecord(*column.tree, context) : QString();
-        rows.push_back(std::move(texts));
-        return true;
-    });
-    if (!read)
-        result_.Report();
-    return rows;
+    if (!controls_.Is(control, ControlType::List) || !HasResult() || first < 0 || count <= 0)
+        return {};
+    return controls_.ListRows(control, result_, first, count);
 }
 
 QString RunningForm::CounterText() const
@@ -372,77 +158,43 @@ QString RunningForm::FieldText(int field) const
 
 // --- what the user does to controls -----------------------------------------------------------------------------
 
-void RunningForm::MarkEdited(ControlRun& control, bool edited)
-{
-    edited = edited && control.keepsInput && result_.Index() >= 0;
-    if (control.edited != edited)
-        Touch(control);
-    control.edited = edited;
-    const bool dirty = std::ranges::any_of(controls_, &ControlRun::edited);
-    if (dirty_ != dirty)
-        ++revision_;
-    dirty_ = dirty;
-}
-
-void RunningForm::ForgetEdits()
-{
-    for (ControlRun& control : controls_) {
-        if (control.edited)
-            Touch(control);
-        control.edited = false;
-    }
-    if (dirty_)
-        ++revision_;
-    dirty_ = false;
-}
-
 void RunningForm::SetText(int index, const QString& text)
 {
-    if (!Is(index, ControlType::EditBox) && !Is(index, ControlType::DropDownBox))
-        return;
-    ControlRun& control = controls_[size_t(index)];
-    ShowText(control, text);
-    MarkEdited(control, text != bindings_[size_t(index)].recordText);
+    if (controls_.Is(index, ControlType::EditBox) || controls_.Is(index, ControlType::DropDownBox))
+        controls_.SetText(index, text);
 }
 
 void RunningForm::SetTicked(int index, bool ticked)
 {
-    if (!Is(index, ControlType::CheckBox))
-        return;
-    ControlRun& control = controls_[size_t(index)];
-    ShowTicked(control, ticked);
-    MarkEdited(control, ticked != bindings_[size_t(index)].recordTicked);
+    if (controls_.Is(index, ControlType::CheckBox))
+        controls_.SetTicked(index, ticked);
 }
 
 RunningForm::Outcome RunningForm::SelectListRow(int index, qint64 row)
 {
-    if (!Is(index, ControlType::List) || row < 0 || row >= result_.Count())
+    if (!controls_.Is(index, ControlType::List) || row < 0 || row >= result_.Count())
         return Outcome::Failed;
     if (row == result_.Index())
         return Outcome::Done;
     const Outcome outcome = LeaveAndMoveTo(row);
     if (outcome != Outcome::Done)
-        Touch(controls_[size_t(index)]); // the window takes its own selection back
+        controls_.Touch(index); // the window takes its own selection back
     return outcome;
 }
 
 RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
 {
-    if (!Is(index, ControlType::List) || result_.Count() < 1 || column < 0 ||
-        column >= int(bindings_[size_t(index)].columns.size()))
+    if (!controls_.Is(index, ControlType::List) || result_.Count() < 1 || column < 0 ||
+        column >= controls_[index].columns.size())
         return Outcome::Done;
-    ControlRun& control = controls_[size_t(index)];
-    const bool descending = control.sortedColumn == column && !control.sortedDescending;
-    const ExprNode* tree = bindings_[size_t(index)].columns[size_t(column)].tree.get();
-    const int field = ColumnOf(tree, result_.Context());
+    const ControlBinding& binding = controls_.Bindings()[size_t(index)];
+    const int field = ColumnOf(binding.columns[size_t(column)].tree.get(), result_.Context());
     if (field < 0)
         return Outcome::Done;
+    const bool descending = controls_[index].sortedColumn == column && !controls_[index].sortedDescending;
     const Outcome outcome = SortByField(field, descending ? SortOrder::Descending : SortOrder::Ascending);
-    if (outcome == Outcome::Done) {
-        control.sortedColumn = column;
-        control.sortedDescending = descending;
-        Touch(control);
-    }
+    if (outcome == Outcome::Done)
+        controls_.MarkSorted(index, column, descending);
     return outcome;
 }
 
@@ -450,8 +202,8 @@ RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
 
 bool RunningForm::LeaveRecordCheck()
 {
-    if (!dirty_ || !environment_.settings.confirmSave) {
-        ForgetEdits();
+    if (!IsDirty() || !environment_.settings.confirmSave) {
+        controls_.ForgetEdits();
         return true;
     }
     const UserMessage question{Str::IgnoreChangesQuestion, {}};
@@ -463,8 +215,8 @@ bool RunningForm::LeaveRecordCheck()
     if (answer == UserPrompt::Answer::No)
         return false;
     if (answer == UserPrompt::Answer::Third)
-        return PressButton(FirstUpdateButton()) == Outcome::Done && !dirty_;
-    ForgetEdits();
+        return PressButton(FirstUpdateButton()) == Outcome::Done && !IsDirty();
+    controls_.ForgetEdits();
     return true;
 }
 
@@ -478,7 +230,6 @@ RunningForm::Outcome RunningForm::LeaveAndMoveTo(qint64 record)
         return Outcome::Failed;
     }
     ShowRecord();
-    ++revision_;
     return Outcome::Done;
 }
 
@@ -518,9 +269,9 @@ bool RunningForm::NewRecordValues(std::vector<FieldChange>& values)
         else if (isColumn && records.TypeOfField(field) == FieldType::YesNo)
             values.push_back({field, Value::Bool(false)});
     }
-    for (size_t i = 0; i < controls_.size(); ++i) {
+    for (int i = 0; i < int(Controls().size()); ++i) {
         const QString text = controls_[i].definition->defaultValue.Text();
-        const int field = text.isEmpty() ? -1 : FieldOfControl(int(i));
+        const int field = text.isEmpty() ? -1 : FieldOfControl(i);
         if (field < 0)
             continue;
         Value value;
@@ -571,11 +322,7 @@ void RunningForm::DataHasChanged()
     ShowRecord();
     if (environment_.settings.updateAggregate || result_.Count() < 1)
         RecomputeAggregates();
-    for (ControlRun& control : controls_) {
-        if (control.type == ControlType::List)
-            Touch(control);
-    }
-    ++revision_;
+    controls_.TouchLists();
 }
 
 void RunningForm::ReportRefusedField(int field, Hr hr)
@@ -584,28 +331,11 @@ void RunningForm::ReportRefusedField(int field, Hr hr)
     environment_.prompt.ShowError(ProviderErrorText(&result_.Records(), hr, place));
 }
 
-// --- time -------------------------------------------------------------------------------------------------------
-
-bool RunningForm::HasClock() const
-{
-    return std::ranges::any_of(controls_, &ControlRun::isClock);
-}
-
-void RunningForm::Tick()
-{
-    for (size_t i = 0; i < controls_.size(); ++i) {
-        if (controls_[i].isClock)
-            ShowControl(i);
-    }
-}
-
 // --- filter and sort --------------------------------------------------------------------------------------------
 
 int RunningForm::FieldOfControl(int control) const
 {
-    if (control < 0 || control >= int(controls_.size()) || !HasResult())
-        return -1;
-    return ShownColumn(bindings_[size_t(control)], controls_[size_t(control)].type, result_.Context());
+    return control < 0 || control >= int(Controls().size()) ? -1 : controls_.ColumnOf(control, result_);
 }
 
 template <typename Rewrite>
@@ -616,8 +346,7 @@ RunningForm::Outcome RunningForm::Rearrange(Rewrite rewrite)
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
     const bool done = rewrite();
-    for (ControlRun& control : controls_)
-        control.sortedColumn = -1;
+    controls_.ForgetSorting();
     ShowResult();
     return done ? Outcome::Done : Outcome::Failed;
 }

@@ -1,25 +1,19 @@
 #pragma once
 
 #include "data/db_connection.h"
-#include "data/db_recordset.h"
 #include "data/filter_condition.h"
-#include "forms/assignment.h"
-#include "forms/control_binding.h"
-#include "forms/control_run.h"
+#include "forms/form_controls.h"
 #include "forms/form_host.h"
-#include "forms/form_query.h"
 #include "forms/form_result.h"
 #include "forms/form_store.h"
 #include "forms/form_view_settings.h"
 #include "platform/user_prompt.h"
 
 #include <QDateTime>
-#include <QHash>
 #include <QString>
 #include <QStringList>
 
 #include <functional>
-#include <optional>
 #include <span>
 #include <vector>
 
@@ -69,18 +63,19 @@ public:
 
     // --- what is shown ------------------------------------------------------------------------------------
 
-    std::span<const ControlRun> Controls() const { return controls_; }
-    int FindControl(QStringView name) const; // the first that can hold a value, else the first; -1: none
+    std::span<const ControlRun> Controls() const { return controls_.All(); }
+    // The first of that name that can hold a value, else the first; -1: none.
+    int FindControl(QStringView name) const { return controls_.Find(name); }
     // What a control holds as one text: "1" or "0" for a check box, nothing for a list.
-    QString ShownText(int control) const;
-    // Grows with every change of any control, and of what is told below.
-    quint64 Revision() const { return revision_; }
+    QString ShownText(int control) const { return controls_.ShownText(control); }
+    // Grows with every change of a control; those whose own revision is greater than the one last seen changed.
+    quint64 Revision() const { return controls_.Revision(); }
 
     bool HasResult() const { return result_.IsOpen(); }
     qint64 RecordCount() const { return result_.Count(); }   // -1: no result
     qint64 CurrentRecord() const { return result_.Index(); } // -1: none
     QString CounterText() const;                             // "3/12", "0/0"; empty without a result
-    bool IsDirty() const { return dirty_; }
+    bool IsDirty() const { return controls_.AreEdited(); }
     bool CanUpdate() const;
     const QString& CurrentQuery() const { return result_.Query(); }
 
@@ -117,8 +112,8 @@ public:
 
     // --- time ---------------------------------------------------------------------------------------------
 
-    bool HasClock() const; // then call Tick once a second
-    void Tick();
+    bool HasClock() const { return controls_.HasClock(); } // then call Tick once a second
+    void Tick() { controls_.ShowTime(result_); }
 
     void RecomputeAggregates();
 
@@ -141,15 +136,6 @@ public:
     QString FieldText(int field) const; // of the current record, uncut, as the grid shows it
 
 private:
-    enum class Clearing { Record, Aggregates };
-
-    // Making the controls.
-    void BuildControls();
-    void MarkUpdateReferences();
-    QStringList ItemsOf(const ControlBinding& binding, bool& failed);
-    void FillDropDown(size_t control, bool& failed);
-    void FillDropDowns();
-
     // The result.
     bool OpenFirstResult();
     bool MayRun(const QString& statement);
@@ -160,25 +146,15 @@ private:
     Outcome Rearrange(Rewrite rewrite);
     Outcome SortByField(int field, SortOrder order);
     bool NewRecordValues(std::vector<FieldChange>& values);
+    void ShowRecord();
+    void ShowResult(); // the aggregates and the lists as well
     void DataHasChanged();
     void ReportRefusedField(int field, Hr hr);
 
-    // Showing.
-    void ShowRecord();
-    void ShowResult(); // aggregates and lists as well
-    void ShowControl(size_t control);
-    void ShowText(ControlRun& control, const QString& text);
-    void ShowTicked(ControlRun& control, bool ticked);
-    void ShowList(ControlRun& control);
-    void ClearControls(Clearing what); // those that show the record, or those that show the whole result
-    void Touch(ControlRun& control);
-    void MarkEdited(ControlRun& control, bool edited);
-    void ForgetEdits();
-
-    // Controls by name.
-    bool Is(int control, ControlType type) const;
-    int FindInput(QStringView name) const; // -1: no control of that name holds a value
-    QString ControlText(QStringView name) const;
+    // Items of drop-down boxes.
+    [[nodiscard]] bool FillDropDown(int control);
+    void FillDropDowns();
+    [[nodiscard]] bool AddItemsOf(const QString& query, QStringList& items);
     ControlTextOf TextsForQueries() const;
 
     // Buttons.
@@ -194,20 +170,16 @@ private:
     bool UpdateInBulk(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
     bool UpdateRecords(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
     bool UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written);
-    bool IsUntouched(const FieldAssignment& assignment) const;
+    QString ControlText(QStringView name) const { return controls_.TextOf(name).value_or(QString()); }
     void TellDataChanged();
 
     FormDef form_;
     QString callQuery_;
     qint64 callRecord_;
     FormEnvironment environment_;
-    std::vector<ControlRun> controls_;
-    std::vector<ControlBinding> bindings_; // one a control
-    QHash<QString, int> inputs_;           // controls by name, those that hold a value first
+    FormControls controls_;
     FormResult result_;
-    bool dirty_ = false;
     bool dataChanged_ = false;
-    quint64 revision_ = 0;
 };
 
 } // namespace mirel

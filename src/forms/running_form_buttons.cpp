@@ -64,25 +64,24 @@ RunningForm::Outcome RunningForm::RunQuery(const QString& query, qint64 record)
     const bool opened = MayRun(statement) && result_.Open(statement, record);
     if (!opened)
         result_.Close();
-    for (ControlRun& control : controls_)
-        control.sortedColumn = -1;
+    controls_.ForgetSorting();
     ShowResult();
     return opened ? Outcome::Done : Outcome::Failed;
 }
 
 int RunningForm::FirstUpdateButton() const
 {
-    const auto button = std::ranges::find_if(controls_, [](const ControlRun& control) {
+    const std::span<const ControlRun> controls = Controls();
+    const auto button = std::ranges::find_if(controls, [](const ControlRun& control) {
         return control.type == ControlType::Button && control.definition->buttonFunction == ButtonFunction::Update;
     });
-    return button == controls_.end() ? -1 : int(button - controls_.begin());
+    return button == controls.end() ? -1 : int(button - controls.begin());
 }
 
 RunningForm::Outcome RunningForm::PressButton(int control)
 {
-    if (!Is(control, ControlType::Button))
-        return Outcome::Failed;
-    return RunButton(*controls_[size_t(control)].definition);
+    return controls_.Is(control, ControlType::Button) ? RunButton(*controls_[control].definition)
+                                                      : Outcome::Failed;
 }
 
 RunningForm::Outcome RunningForm::RunButton(const ControlDef& button)
@@ -134,12 +133,7 @@ RunningForm::Outcome RunningForm::RunSelect(const ControlDef& button)
 
 RunningForm::Outcome RunningForm::RunClearForm()
 {
-    for (ControlRun& control : controls_) {
-        if (control.type == ControlType::EditBox)
-            ShowText(control, {});
-        else if (control.type == ControlType::CheckBox)
-            ShowTicked(control, false);
-    }
+    controls_.ClearInputs();
     return Outcome::Done;
 }
 
@@ -152,7 +146,7 @@ RunningForm::Outcome RunningForm::RunRecalc()
 
 RunningForm::Outcome RunningForm::RunCallForm(const ControlDef& button)
 {
-    const bool wasDirty = dirty_;
+    const bool wasDirty = IsDirty();
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
     if (wasDirty)
@@ -220,26 +214,15 @@ std::vector<FieldAssignment> RunningForm::AssignmentsOf(const ControlDef& button
     return assignments;
 }
 
-// Whether the assignment would only write back what the control was given by the current record. It is left out:
-// a text may show less than the store holds (a number's last digits, a date's fraction of a second).
-bool RunningForm::IsUntouched(const FieldAssignment& assignment) const
-{
-    const int index = assignment.controlName.isEmpty() ? -1 : FindInput(assignment.controlName);
-    if (index < 0 || FieldOfControl(index) != assignment.field)
-        return false;
-    const ControlRun& control = controls_[size_t(index)];
-    const ControlBinding& binding = bindings_[size_t(index)];
-    if (binding.shownRecord != result_.Records().Position())
-        return false;
-    return control.type == ControlType::CheckBox ? control.ticked == binding.recordTicked
-                                                 : control.text == binding.recordText;
-}
-
 bool RunningForm::UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written)
 {
     std::vector<FieldChange> changes;
     for (FieldAssignment& assignment : assignments) {
-        if (assignment.field < 0 || !assignment.tree || IsUntouched(assignment))
+        if (assignment.field < 0 || !assignment.tree)
+            continue;
+        // What the record itself put into a control may show less than the store holds: a number's last digits, a
+        // date's fraction of a second. Writing it back would lose them.
+        if (controls_.IsUntouched(assignment, result_, result_.Records().Position()))
             continue;
         FieldChange change{assignment.field, {}};
         const Hr hr = ValueToStore(

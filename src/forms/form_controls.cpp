@@ -1,0 +1,331 @@
+#include "forms/form_controls.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+bool HoldsValue(ControlType type)
+{
+    return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
+}
+
+bool ShowsText(ControlType type)
+{
+    return type == ControlType::EditBox || type == ControlType::DropDownBox;
+}
+
+bool IsClock(const ControlDef& control, const ControlBinding& binding)
+{
+    if (control.type != ControlType::EditBox || !binding.tree)
+        return false;
+    const OpCode root = binding.tree->code;
+    return root == OpCode::SysTime || root == OpCode::SysDate || root == OpCode::SysDateTime;
+}
+
+ControlRun MakeRun(const ControlDef& definition, const ControlBinding& binding, int windowId)
+{
+    ControlRun control;
+    control.definition = &definition;
+    control.windowId = windowId;
+    control.type = definition.type;
+    control.name = definition.name.Text();
+    if (control.type == ControlType::Label || control.type == ControlType::Button)
+        control.text = control.name;
+    else if (ShowsText(control.type) && definition.fieldBound != 0)
+        control.text = definition.defaultValue.Text();
+    for (const ControlBinding::Column& column : binding.columns)
+        control.columns += column.name;
+    control.isClock = IsClock(definition, binding);
+    control.keepsInput = definition.fieldBound != 0 || ShownField(binding, definition.type);
+    return control;
+}
+
+} // namespace
+
+FormControls::FormControls(const FormDef& form)
+{
+    for (const ControlDef& definition : form.controls) {
+        const int index = int(controls_.size());
+        ControlBinding binding = BindControl(definition);
+        controls_.push_back(MakeRun(definition, binding, kFirstControlWindow + index));
+        bindings_.push_back(std::move(binding));
+        const QString name = definition.name.Text().trimmed(); // references are trimmed, too
+        const int known = names_.value(name, -1);
+        if (known < 0 || (!HoldsValue((*this)[known].type) && HoldsValue(definition.type)))
+            names_[name] = index;
+    }
+    MarkUpdateReferences(form);
+}
+
+void FormControls::MarkUpdateReferences(const FormDef& form)
+{
+    QStringList names;
+    for (const ControlDef& definition : form.controls) {
+        if (definition.type != ControlType::Button || definition.buttonFunction != ButtonFunction::Update)
+            continue;
+        for (const SourceAssignment& source : SplitAssignments(definition.source.Text())) {
+            const FieldAssignment assignment = ParseAssignment(source);
+            if (assignment.tree)
+                CollectControlNames(*assignment.tree, names);
+        }
+    }
+    for (const QString& name : names) {
+        if (const int control = FindInput(name); control >= 0)
+            controls_[size_t(control)].keepsInput = true;
+    }
+}
+
+bool FormControls::Is(int control, ControlType type) const
+{
+    return control >= 0 && control < int(controls_.size()) && (*this)[control].type == type;
+}
+
+int FormControls::Find(QStringView name) const
+{
+    return names_.value(name.trimmed().toString(), -1);
+}
+
+int FormControls::FindInput(QStringView name) const
+{
+    const int control = Find(name);
+    return control >= 0 && HoldsValue((*this)[control].type) ? control : -1;
+}
+
+QString FormControls::ShownText(int index) const
+{
+    const ControlRun& control = (*this)[index];
+    if (control.type == ControlType::CheckBox)
+        return control.ticked ? u"1"_s : u"0"_s;
+    return control.text;
+}
+
+std::optional<QString> FormControls::TextOf(QStringView name) const
+{
+    const int control = FindInput(name);
+    return control < 0 ? std::nullopt : std::optional(ShownText(control));
+}
+
+int FormControls::ColumnOf(int control, const FormResult& result) const
+{
+    return result.IsOpen() ? ShownColumn(bindings_[size_t(control)], (*this)[control].type, result.Context()) : -1;
+}
+
+// --- showing ----------------------------------------------------------------------------------------------------
+
+void FormControls::ShowText(ControlRun& control, const QString& text)
+{
+    if (control.text == text)
+        return;
+    control.text = text;
+    Touch(control);
+}
+
+void FormControls::ShowTicked(ControlRun& control, bool ticked)
+{
+    if (control.ticked == ticked)
+        return;
+    control.ticked = ticked;
+    Touch(control);
+}
+
+void FormControls::ShowPlaceInList(ControlRun& control, const FormResult& result)
+{
+    const qint64 rows = std::max<qint64>(result.Count(), 0);
+    if (control.rows == rows && control.selectedRow == result.Index())
+        return;
+    control.rows = rows;
+    control.selectedRow = result.Index();
+    Touch(control);
+}
+
+void FormControls::Show(size_t index, const FormResult& result)
+{
+    ControlRun& control = controls_[index];
+    ControlBinding& binding = bindings_[index];
+    const ExprTree& tree = IsItem(binding, result.Context()) ? binding.ownField : binding.tree;
+    if (!tree)
+        return;
+    if (control.type == ControlType::CheckBox) {
+        binding.recordTicked = HoldsOnRecord(*tree, result.Context());
+        ShowTicked(control, binding.recordTicked);
+    } else {
+        binding.recordText = TextOnRecord(*tree, result.Context());
+        ShowText(control, binding.recordText);
+    }
+    binding.shownRecord = result.Index();
+}
+
+void FormControls::ShowNothing(size_t index)
+{
+    ControlBinding& binding = bindings_[index];
+    binding.recordText.clear();
+    binding.recordTicked = false;
+    binding.shownRecord = -1;
+    ShowTicked(controls_[index], false);
+    ShowText(controls_[index], {});
+}
+
+void FormControls::ShowRecord(const FormResult& result)
+{
+    ForgetEdits();
+    hasRecord_ = result.Index() >= 0;
+    for (size_t i = 0; i < controls_.size(); ++i) {
+        if (controls_[i].type == ControlType::List)
+            ShowPlaceInList(controls_[i], result);
+        if (!bindings_[i].tree || bindings_[i].wholeResult)
+            continue;
+        if (hasRecord_ || controls_[i].isClock)
+            Show(i, result);
+        else
+            ShowNothing(i);
+    }
+}
+
+void FormControls::ShowAggregates(const FormResult& result, bool computed)
+{
+    for (size_t i = 0; i < controls_.size(); ++i) {
+        if (!bindings_[i].tree || !bindings_[i].wholeResult)
+            continue;
+        if (computed)
+            Show(i, result);
+        else
+            ShowNothing(i);
+    }
+}
+
+void FormControls::Touch(int control)
+{
+    Touch(controls_[size_t(control)]);
+}
+
+void FormControls::TouchLists()
+{
+    for (ControlRun& control : controls_) {
+        if (control.type == ControlType::List)
+            Touch(control);
+    }
+}
+
+bool FormControls::HasClock() const
+{
+    return std::ranges::any_of(controls_, &ControlRun::isClock);
+}
+
+void FormControls::ShowTime(const FormResult& result)
+{
+    for (size_t i = 0; i < controls_.size(); ++i) {
+        if (controls_[i].isClock)
+            Show(i, result);
+    }
+}
+
+void FormControls::SetItems(int index, QStringList items)
+{
+    ControlRun& control = controls_[size_t(index)];
+    if (control.items == items)
+        return;
+    control.items = std::move(items);
+    Touch(control);
+}
+
+void FormControls::MarkSorted(int index, int column, bool descending)
+{
+    for (size_t i = 0; i < controls_.size(); ++i) {
+        ControlRun& control = controls_[i];
+        const int sorted = int(i) == index ? column : -1;
+        if (control.sortedColumn == sorted && control.sortedDescending == (sorted >= 0 && descending))
+            continue;
+        control.sortedColumn = sorted;
+        control.sortedDescending = sorted >= 0 && descending;
+        Touch(control);
+    }
+}
+
+std::vector<QStringList> FormControls::ListRows(int control, FormResult& result, qint64 first, int count)
+{
+    std::vector<ControlBinding::Column>& columns = bindings_[size_t(control)].columns;
+    RowContext context(result.Context(), result.Count());
+    for (const ControlBinding::Column& column : columns) {
+        if (column.tree)
+            context.Collect(*column.tree);
+    }
+    ReadRange range{.first = first, .count = count, .fields = context.Columns()};
+    if (range.fields.empty())
+        range.fields = {0}; // none would be all of them
+    std::vector<QStringList> rows;
+    const bool read = result.Records().Read(range, [&](std::span<const Cell> cells) {
+        context.Lend(first + qint64(rows.size()), cells);
+        QStringList texts;
+        for (ControlBinding::Column& column : columns)
+            texts += column.tree ? TextOnRecord(*column.tree, context) : QString();
+        rows.push_back(std::move(texts));
+        return true;
+    });
+    if (!read)
+        result.Report();
+    return rows;
+}
+
+// --- edits ------------------------------------------------------------------------------------------------------
+
+void FormControls::SetText(int index, const QString& text)
+{
+    ControlRun& control = controls_[size_t(index)];
+    ShowText(control, text);
+    MarkEdited(control, text != bindings_[size_t(index)].recordText);
+}
+
+void FormControls::SetTicked(int index, bool ticked)
+{
+    ControlRun& control = controls_[size_t(index)];
+    ShowTicked(control, ticked);
+    MarkEdited(control, ticked != bindings_[size_t(index)].recordTicked);
+}
+
+// Only what would be lost is an edit: there is a record, and the control is one that shows it or goes into it.
+void FormControls::MarkEdited(ControlRun& control, bool edited)
+{
+    edited = edited && control.keepsInput && hasRecord_;
+    if (control.edited != edited)
+        Touch(control);
+    control.edited = edited;
+    edited_ = std::ranges::any_of(controls_, &ControlRun::edited);
+}
+
+void FormControls::ForgetEdits()
+{
+    for (ControlRun& control : controls_) {
+        if (std::exchange(control.edited, false))
+            Touch(control);
+    }
+    edited_ = false;
+}
+
+void FormControls::ClearInputs()
+{
+    for (ControlRun& control : controls_) {
+        if (control.type == ControlType::EditBox)
+            ShowText(control, {});
+        else if (control.type == ControlType::CheckBox)
+            ShowTicked(control, false);
+    }
+}
+
+bool FormControls::IsUntouched(const FieldAssignment& assignment, const FormResult& result, qint64 position) const
+{
+    const int index = assignment.controlName.isEmpty() ? -1 : FindInput(assignment.controlName);
+    if (index < 0 || ColumnOf(index, result) != assignment.field)
+        return false;
+    const ControlRun& control = (*this)[index];
+    const ControlBinding& binding = bindings_[size_t(index)];
+    if (binding.shownRecord != position)
+        return false;
+    return control.type == ControlType::CheckBox ? control.ticked == binding.recordTicked
+                                                 : control.text == binding.recordText;
+}
+
+} // namespace mirel
