@@ -24,7 +24,7 @@ FieldChooser::FieldChooser(FieldLists& lists, Use use, QWidget* parent)
     form->addRow(StringText(Str::FieldsLabel), fields_);
     for (QComboBox* box : {tables_, fields_}) {
         box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
-        box->setMinimumContentsLength(8);
+        box->setMinimumContentsLength(5);
     }
     tables_->addItems(lists_.Tables());
     ListFields({});

@@ -34,6 +34,14 @@ const QStringList kExpressionOperators = {u"="_s,  u"<>"_s,      u">"_s,       u
                                           u"IN"_s, u"BETWEEN"_s, u"IS TRUE"_s, u"IS FALSE"_s};
 const QStringList kExpressionWords = {u"AND"_s, u"OR"_s, u"NOT"_s};
 
+// As wide a form as a handheld's screen holds.
+void PrepareForm(QFormLayout* form)
+{
+    form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
+    form->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    form->setContentsMargins(form->contentsMargins() / 2);
+}
+
 QComboBox* WordBox(const QStringList& words, QWidget* parent)
 {
     auto* box = new PickBox(parent);
@@ -60,8 +68,8 @@ FilterTerm::FilterTerm(QWidget* parent)
     date_->setAccessibleName(StringText(Str::FilterValueName));
     auto* row = new QHBoxLayout(this);
     row->setContentsMargins({});
-    row->addWidget(operators_);
-    row->addWidget(values_, 1);
+    row->addWidget(operators_, 2);
+    row->addWidget(values_, 3);
     setFocusProxy(text_);
 }
 
@@ -145,6 +153,7 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
     single_->SetOperator(lists_.TypeOf(field_->Table(), field_->Field()) == FieldType::YesNo
                              ? FilterDraft::PresetYesNo(displayText)
                              : single_->Operator());
+    resize(sizeHint().expandedTo({60 * fontMetrics().averageCharWidth(), 0}));
     QTimer::singleShot(kFocusDelayMs, single_, &FilterTerm::FocusValue);
 }
 
@@ -152,8 +161,7 @@ QWidget* CFilterDialog::BasicPage()
 {
     auto* page = new QWidget(this);
     auto* form = new QFormLayout(page);
-    form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
-    form->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    PrepareForm(form);
     form->addRow(field_);
     form->addRow(StringText(Str::OperatorsLabel), single_);
     form->addRow(fromTo_);
@@ -175,8 +183,7 @@ QWidget* CFilterDialog::AdvancedPage()
     expression_->setAccessibleName(StringText(Str::FilterPrompt));
 
     auto* form = new QFormLayout(page);
-    form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
-    form->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    PrepareForm(form);
     auto* prompt = new QLabel(StringText(Str::FilterPrompt), page);
     prompt->setBuddy(expression_);
     form->addRow(prompt);
