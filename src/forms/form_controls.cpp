@@ -151,10 +151,16 @@ void FormControls::Show(size_t index, const FormResult& result)
         return;
     if (control.type == ControlType::CheckBox) {
         binding.recordTicked = HoldsOnRecord(*tree, result.Context());
-        ShowTicked(control, binding.recordTicked);
+        if (control.edited)
+            MarkEdited(control, control.ticked != binding.recordTicked);
+        else
+            ShowTicked(control, binding.recordTicked);
     } else {
         binding.recordText = TextOnRecord(*tree, result.Context());
-        ShowText(control, binding.recordText);
+        if (control.edited)
+            MarkEdited(control, control.text != binding.recordText);
+        else
+            ShowText(control, binding.recordText);
     }
     binding.shownRecord = result.Index();
 }
@@ -169,10 +175,11 @@ void FormControls::ShowNothing(size_t index)
     ShowText(controls_[index], {});
 }
 
-void FormControls::ShowRecord(const FormResult& result)
+void FormControls::ShowRecord(const FormResult& result, Edits edits)
 {
-    ForgetEdits();
     hasRecord_ = result.Index() >= 0;
+    if (edits == Edits::Drop || !hasRecord_)
+        ForgetEdits();
     for (size_t i = 0; i < controls_.size(); ++i) {
         if (controls_[i].type == ControlType::List)
             ShowPlaceInList(controls_[i], result);
@@ -303,6 +310,14 @@ void FormControls::ForgetEdits()
             Touch(control);
     }
     edited_ = false;
+}
+
+void FormControls::ForgetEditsOf(const QStringList& names)
+{
+    for (const QString& name : names) {
+        if (const int control = FindInput(name); control >= 0)
+            MarkEdited(controls_[size_t(control)], false);
+    }
 }
 
 void FormControls::ClearInputs()

@@ -39,8 +39,9 @@ public:
 
     // --- showing ------------------------------------------------------------------------------------------
 
-    // The current record in all controls that show one, without a record nothing but the time. Edits are gone.
-    void ShowRecord(const FormResult& result);
+    // The current record in all controls that show one, without a record nothing but the time.
+    enum class Edits { Drop, Keep }; // kept ones stay as long as they differ from what the record gives
+    void ShowRecord(const FormResult& result, Edits edits = Edits::Drop);
     // The aggregates, computed anew over the whole result; nothing where `computed` says that there are none.
     void ShowAggregates(const FormResult& result, bool computed);
     std::span<ControlBinding> Bindings() { return bindings_; }
@@ -62,6 +63,7 @@ public:
     void ClearInputs(); // edit boxes and check boxes; no edit
     bool AreEdited() const { return edited_; }
     void ForgetEdits();
+    void ForgetEditsOf(const QStringList& names); // what these controls hold was written
     // Whether the assignment would only write back what the record at `position` put into its control.
     bool IsUntouched(const FieldAssignment& assignment, const FormResult& result, qint64 position) const;
 

@@ -7,6 +7,7 @@
 #include "provider/conversion.h"
 #include "resources/string_table.h"
 
+#include <QElapsedTimer>
 #include <QSet>
 
 #include <algorithm>
@@ -57,15 +58,19 @@ ControlTextOf RunningForm::TextsForQueries() const
     return [this](QStringView name) { return controls_.TextOf(name); };
 }
 
-// Those of the query's first column that are not there yet, NULL left out.
-bool RunningForm::AddItemsOf(const QString& query, QStringList& items)
+// The texts in the query's first column, each once, NULL left out.
+bool RunningForm::ReadItems(const QString& query, QStringList& items)
 {
     const QString statement = CompleteQuery(query, form_.tableName.Text(), TextsForQueries());
-    DbRecordset rows(environment_.connection);
+    if (const auto known = itemsOfQuery_.find(statement); known != itemsOfQuery_.end()) {
+        items = *known;
+        return true;
+    }
     if (!MayRun(statement))
         return false;
+    DbRecordset rows(environment_.connection);
     bool more = rows.Open(statement, environment_.database, CursorType::ForwardOnly, LockType::ReadOnly);
-    QSet<QString> known(items.begin(), items.end());
+    QSet<QString> known;
     for (; more && !rows.IsEof() && items.size() < kMaxItems; more = rows.MoveNext()) {
         const Value value = rows.FieldValue(0);
         const QString text = DisplayText(value, rows.TypeOfField(0), environment_.settings.words);
@@ -74,7 +79,9 @@ bool RunningForm::AddItemsOf(const QString& query, QStringList& items)
         known.insert(text);
         items += text;
     }
-    if (!more)
+    if (more)
+        itemsOfQuery_[statement] = items;
+    else
         ReportProviderError(environment_.prompt, &rows, rows.LastResult());
     return more;
 }
@@ -84,37 +91,45 @@ bool RunningForm::FillDropDown(int control)
     const ControlBinding& binding = controls_.Bindings()[size_t(control)];
     const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, result_.Context());
     QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
+    QStringList fromQuery;
+    const bool filled = binding.dropDown.query.isEmpty() || ReadItems(binding.dropDown.query, fromQuery);
+    items += fromQuery;
     items.removeDuplicates();
-    const bool filled = binding.dropDown.query.isEmpty() || AddItemsOf(binding.dropDown.query, items);
     controls_.SetItems(control, std::move(items));
     return filled;
 }
 
+// The boxes that come too late are filled when they are opened, see RefreshItems.
 void RunningForm::FillDropDowns()
 {
-    for (int i = 0; i < int(Controls().size()); ++i) {
-        // One message is enough: the next query is likely to fail likewise.
-        if (controls_.Is(i, ControlType::DropDownBox) && !FillDropDown(i))
-            return;
+    constexpr int kBudgetMs = 1000;
+    QElapsedTimer timer;
+    timer.start();
+    bool filled = true; // one message is enough: the next query is likely to fail likewise
+    for (int i = 0; i < int(Controls().size()) && filled && timer.elapsed() < kBudgetMs; ++i) {
+        if (controls_.Is(i, ControlType::DropDownBox))
+            filled = FillDropDown(i);
     }
+    itemsOfQuery_.clear();
 }
 
 void RunningForm::RefreshItems(int control)
 {
     if (controls_.Is(control, ControlType::DropDownBox))
         (void)FillDropDown(control);
+    itemsOfQuery_.clear();
 }
 
 // --- what is shown ----------------------------------------------------------------------------------------------
 
-void RunningForm::ShowRecord()
+void RunningForm::ShowRecord(FormControls::Edits edits)
 {
-    controls_.ShowRecord(result_);
+    controls_.ShowRecord(result_, edits);
 }
 
-void RunningForm::ShowResult()
+void RunningForm::ShowResult(FormControls::Edits edits)
 {
-    ShowRecord();
+    ShowRecord(edits);
     RecomputeAggregates();
     controls_.TouchLists();
 }
@@ -316,10 +331,10 @@ RunningForm::Outcome RunningForm::DeleteRecord()
 
 // After each change that was written: the aggregates only where the user wants them brought up to date, because
 // they cost a walk over all records.
-void RunningForm::DataHasChanged()
+void RunningForm::DataHasChanged(FormControls::Edits edits)
 {
     dataChanged_ = true;
-    ShowRecord();
+    ShowRecord(edits);
     if (environment_.settings.updateAggregate || result_.Count() < 1)
         RecomputeAggregates();
     controls_.TouchLists();

@@ -10,6 +10,7 @@
 #include "platform/user_prompt.h"
 
 #include <QDateTime>
+#include <QHash>
 #include <QString>
 #include <QStringList>
 
@@ -146,15 +147,16 @@ private:
     Outcome Rearrange(Rewrite rewrite);
     Outcome SortByField(int field, SortOrder order);
     bool NewRecordValues(std::vector<FieldChange>& values);
-    void ShowRecord();
-    void ShowResult(); // the aggregates and the lists as well
-    void DataHasChanged();
+    void ShowRecord(FormControls::Edits edits = FormControls::Edits::Drop);
+    // The aggregates and the lists as well.
+    void ShowResult(FormControls::Edits edits = FormControls::Edits::Drop);
+    void DataHasChanged(FormControls::Edits edits = FormControls::Edits::Drop);
     void ReportRefusedField(int field, Hr hr);
 
     // Items of drop-down boxes.
     [[nodiscard]] bool FillDropDown(int control);
     void FillDropDowns();
-    [[nodiscard]] bool AddItemsOf(const QString& query, QStringList& items);
+    [[nodiscard]] bool ReadItems(const QString& query, QStringList& items);
     ControlTextOf TextsForQueries() const;
 
     // Buttons.
@@ -179,6 +181,7 @@ private:
     FormEnvironment environment_;
     FormControls controls_;
     FormResult result_;
+    QHash<QString, QStringList> itemsOfQuery_; // while many drop-down boxes are filled
     bool dataChanged_ = false;
 };
 

@@ -16,6 +16,17 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+// The controls whose texts the assignments write.
+QStringList ControlsOf(const std::vector<FieldAssignment>& assignments)
+{
+    QStringList names;
+    for (const FieldAssignment& assignment : assignments) {
+        if (assignment.field >= 0 && assignment.tree)
+            CollectControlNames(*assignment.tree, names);
+    }
+    return names;
+}
+
 QString ReferenceOf(const TargetName& target)
 {
     const QString field = FieldReference(target.field);
@@ -140,7 +151,8 @@ RunningForm::Outcome RunningForm::RunClearForm()
 RunningForm::Outcome RunningForm::RunRecalc()
 {
     FillDropDowns();
-    ShowResult();
+    // What the user typed stays: expressions that refer to it are what is to be recomputed.
+    ShowResult(FormControls::Edits::Keep);
     return Outcome::Done;
 }
 
@@ -156,7 +168,7 @@ RunningForm::Outcome RunningForm::RunCallForm(const ControlDef& button)
         return Outcome::Done;
     FormCall call;
     call.form.CopyFrom(*called);
-    if (button.option1 != 0) {
+    if (button.option1 != 0 && HasResult()) {
         call.query = result_.Query();
         call.record = result_.Index();
     }
@@ -277,10 +289,10 @@ RunningForm::Outcome RunningForm::RunUpdate(const ControlDef& button, qint64 fir
                                 : UpdateRecords(assignments, first, last, written);
     if (result_.Records().Position() != current)
         (void)result_.MoveTo(current);
+    if (written > 0 || done)
+        controls_.ForgetEditsOf(ControlsOf(assignments));
     if (written > 0)
-        DataHasChanged();
-    else if (done)
-        ShowRecord();
+        DataHasChanged(FormControls::Edits::Keep);
     return done ? Outcome::Done : Outcome::Failed;
 }
 
@@ -328,7 +340,8 @@ RunningForm::Outcome RunningForm::RunInsert(const ControlDef& button)
         return Outcome::Failed;
     }
     result_.Recount();
-    DataHasChanged();
+    controls_.ForgetEditsOf(ControlsOf(assignments));
+    DataHasChanged(FormControls::Edits::Keep);
     return Outcome::Done;
 }
 

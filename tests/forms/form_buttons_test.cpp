@@ -117,6 +117,24 @@ TEST_F(FormButtonsTest, UpdateWritesAllOfARecordOrNothing)
     EXPECT_EQ(host.changed, 1);
 }
 
+TEST_F(FormButtonsTest, KeepsTheEditsThatAButtonDidNotSave)
+{
+    FormBuilder form = Form();
+    form.Button(u"name", ButtonFunction::Update, {{u"Birds.Name"_s, u"&Name"_s}});
+    form.Edit(u"doubled", u"&Price*2").Button(u"recalc", ButtonFunction::Recalc);
+    Start(form);
+    Type(u"Name", u"Kite"_s);
+    Type(u"Price", u"3"_s);
+    EXPECT_EQ(Press(u"recalc"), Outcome::Done);
+    EXPECT_EQ(Text(u"doubled"), u"6"_s);
+    EXPECT_EQ(Text(u"Name"), u"Kite"_s);
+    EXPECT_EQ(Press(u"name"), Outcome::Done);
+    EXPECT_EQ(Record(1), u"1|Kite|1.5|7/4/2001|-1|one|NULL"_s);
+    EXPECT_EQ(Text(u"Price"), u"3"_s);
+    EXPECT_TRUE(running->IsDirty());
+    EXPECT_EQ(prompt_.questions, QStringList());
+}
+
 TEST_F(FormButtonsTest, SavingWithoutAChangeChangesNothing)
 {
     Run(u"UPDATE Birds SET Price=0.30000000000000004,Seen='2001-07-04 09:05:00.250' WHERE ID=1"_s);
