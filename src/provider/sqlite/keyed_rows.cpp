@@ -126,11 +126,9 @@ Outcome KeyedRows::GatherByText(bool& sorted)
     if (result != SQLITE_DONE)
         return file_.OutcomeOf(result);
     sorted = true;
-    for (const qint64 rowId : sort.Finish(order.descending)) {
-        if (!keys_.Append({&rowId, 1}))
-            return {Hr::OutOfMemory, {}};
-    }
-    return {};
+    bool fit = true;
+    sort.Finish(order.descending, [&](qint64 rowId) { fit = fit && keys_.Append({&rowId, 1}); });
+    return fit ? Outcome() : Outcome{Hr::OutOfMemory, {}};
 }
 
 Outcome KeyedRows::GatherSlice()

@@ -5,12 +5,13 @@
 #include <algorithm>
 #include <array>
 #include <functional>
+#include <numeric>
 
 namespace mirel::sqlite {
 namespace {
 
 constexpr size_t kMostBytes = size_t(192) << 20;
-constexpr size_t kMostEntries = size_t(4) << 20;
+constexpr size_t kMostRecords = size_t(12) << 20;
 constexpr size_t kRecent = 1 << 15;
 
 constexpr size_t kPieceBytes = 8;
@@ -51,50 +52,39 @@ bool TextSort::Store(std::string_view text, quint32& index)
 
 bool TextSort::Add(qint64 rowId, std::optional<std::string_view> text)
 {
+    if (rowIds_.size() + nulls_.size() >= kMostRecords)
+        return false;
     if (!text) {
         nulls_.push_back(rowId);
         return true;
     }
     quint32 index = 0;
-    if (entries_.size() >= kMostEntries || !Store(*text, index))
+    if (!Store(*text, index))
         return false;
-    entries_.push_back({0, rowId, index});
+    rowIds_.push_back(rowId);
+    texts_.push_back(index);
     return true;
 }
 
-int TextSort::Compare(const Entry& a, const Entry& b) const
+void TextSort::SortWhole(std::span<Entry> entries) const
 {
-    if (a.stored == b.stored)
-        return 0;
-    const Stored& left = stored_[a.stored];
-    const Stored& right = stored_[b.stored];
-    if (const int keys = KeyOf(left).compare(KeyOf(right)); keys != 0)
-        return keys;
-    return TextOf(left).compare(TextOf(right));
-}
-
-void TextSort::SortWhole(std::span<Entry> entries, bool descending) const
-{
-    std::ranges::sort(entries, [this, descending](const Entry& a, const Entry& b) {
-        const int order = Compare(a, b);
-        if (order != 0)
-            return descending ? order > 0 : order < 0;
-        return a.rowId < b.rowId;
+    std::ranges::sort(entries, [this](const Entry& a, const Entry& b) {
+        const Stored& left = stored_[a.stored];
+        const Stored& right = stored_[b.stored];
+        const int keys = KeyOf(left).compare(KeyOf(right));
+        return keys != 0 ? keys < 0 : TextOf(left) < TextOf(right);
     });
 }
 
-void TextSort::SortFrom(int piece, std::span<Entry> entries, bool descending)
+void TextSort::SortFrom(int piece, std::span<Entry> entries)
 {
-    const auto isSameText = [first = entries.front().stored](const Entry& entry) { return entry.stored == first; };
-    if (entries.size() <= kFewEntries || piece == kMostPieces || std::ranges::all_of(entries, isSameText))
-        return SortWhole(entries, descending);
+    if (entries.size() <= kFewEntries || piece == kMostPieces)
+        return SortWhole(entries);
     size_t longest = 0;
     for (Entry& entry : entries) {
         const std::string_view key = KeyOf(stored_[entry.stored]);
         longest = std::max(longest, key.size());
         entry.piece = PieceOf(key, piece);
-        if (descending)
-            entry.piece = ~entry.piece;
     }
     std::ranges::sort(entries, {}, &Entry::piece);
     const bool isLast = longest <= size_t(piece + 1) * kPieceBytes;
@@ -103,26 +93,55 @@ void TextSort::SortFrom(int piece, std::span<Entry> entries, bool descending)
             ++to;
         const std::span<Entry> same = entries.subspan(from, to - from);
         if (isLast)
-            SortWhole(same, descending);
+            SortWhole(same);
         else if (same.size() > 1)
-            SortFrom(piece + 1, same, descending);
+            SortFrom(piece + 1, same);
     }
 }
 
-std::vector<qint64> TextSort::Finish(bool descending)
+quint32 TextSort::Rank(std::vector<quint32>& ranks)
 {
-    std::ranges::sort(nulls_);
-    if (!entries_.empty())
-        SortFrom(0, entries_, descending);
-    std::vector<qint64> rowIds;
-    rowIds.reserve(entries_.size() + nulls_.size());
+    std::vector<Entry> entries(stored_.size());
+    for (size_t i = 0; i < entries.size(); ++i)
+        entries[i].stored = quint32(i);
+    SortFrom(0, entries);
+    ranks.resize(stored_.size());
+    quint32 rank = 0;
+    for (size_t i = 0; i < entries.size(); ++i) {
+        if (i > 0 && TextOf(stored_[entries[i].stored]) != TextOf(stored_[entries[i - 1].stored]))
+            ++rank;
+        ranks[entries[i].stored] = rank;
+    }
+    return entries.empty() ? 0 : rank + 1;
+}
+
+void TextSort::Finish(bool descending, const std::function<void(qint64)>& take)
+{
+    std::vector<quint32> ranks;
+    const size_t different = Rank(ranks);
+    // Where each text's records begin, then where the next one of them goes.
+    std::vector<quint32> starts(different + 1);
+    for (const quint32 text : texts_)
+        ++starts[ranks[text] + 1];
+    std::partial_sum(starts.begin(), starts.end(), starts.begin());
+    std::vector<quint32> next = starts;
+    std::vector<qint64> sorted(rowIds_.size());
+    for (size_t i = 0; i < rowIds_.size(); ++i)
+        sorted[next[ranks[texts_[i]]]++] = rowIds_[i];
+
+    const auto takeAll = [&take](std::span<qint64> rowIds) {
+        if (!std::ranges::is_sorted(rowIds)) // an index led to them
+            std::ranges::sort(rowIds);
+        std::ranges::for_each(rowIds, take);
+    };
     if (!descending)
-        rowIds = std::move(nulls_);
-    for (const Entry& entry : entries_)
-        rowIds.push_back(entry.rowId);
+        takeAll(nulls_);
+    for (size_t i = 0; i < different; ++i) {
+        const size_t rank = descending ? different - 1 - i : i;
+        takeAll(std::span(sorted).subspan(starts[rank], starts[rank + 1] - starts[rank]));
+    }
     if (descending)
-        rowIds.insert(rowIds.end(), nulls_.begin(), nulls_.end());
-    return rowIds;
+        takeAll(nulls_);
 }
 
 } // namespace mirel::sqlite
