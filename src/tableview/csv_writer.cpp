@@ -10,16 +10,11 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-constexpr qsizetype kFlushSizeBytes = 1 << 20;
+constexpr size_t kFlushSizeBytes = size_t(1) << 20;
 
-void Append(QByteArray& out, std::string_view bytes)
+std::string Utf8Of(QChar character)
 {
-    out.append(bytes.data(), qsizetype(bytes.size()));
-}
-
-QByteArray Utf8Of(QChar character)
-{
-    return character.isNull() ? QByteArray() : QString(character).toUtf8();
+    return character.isNull() ? std::string() : QString(character).toStdString();
 }
 
 } // namespace
@@ -41,10 +36,11 @@ CsvWriter::CsvWriter(QIODevice& device, const CsvExportOptions& options, std::sp
     , fields_(fields)
     , separator_(Utf8Of(options.separator))
     , quote_(Utf8Of(options.quote))
+    , dates_(options.dates)
     , plainUtf8_(options.encoding.compare("UTF-8", Qt::CaseInsensitive) == 0)
     , encoder_(options.encoding.constData())
 {
-    pending_.reserve(kFlushSizeBytes + (1 << 16));
+    pending_.resize(kFlushSizeBytes + (1 << 16));
 }
 
 bool CsvWriter::KnowsEncoding(const QByteArray& name)
@@ -56,7 +52,7 @@ void CsvWriter::WriteHeader()
 {
     for (size_t i = 0; i < fields_.size(); ++i) {
         if (i > 0)
-            pending_ += separator_;
+            Append(separator_);
         const QByteArray name = fields_[i].name.toUtf8();
         AppendText({name.constData(), size_t(name.size())});
     }
@@ -68,7 +64,7 @@ bool CsvWriter::WriteRecord(std::span<const Cell> cells)
     Q_ASSERT(cells.size() == fields_.size());
     for (size_t i = 0; i < cells.size(); ++i) {
         if (i > 0)
-            pending_ += separator_;
+            Append(separator_);
         AppendCell(cells[i], fields_[i].type);
     }
     EndLine();
@@ -88,12 +84,12 @@ void CsvWriter::AppendCell(const Cell& cell, FieldType type)
         return;
     case Cell::Kind::Integer:
         if (type == FieldType::YesNo)
-            pending_ += cell.integer == 0 ? '0' : '1';
+            Append(cell.integer == 0 ? "0" : "1");
         else
-            Append(pending_, NumberBuffer(cell.integer).Text());
+            Append(NumberBuffer(cell.integer).Text());
         return;
     case Cell::Kind::Real:
-        Append(pending_, NumberBuffer(cell.real).Text());
+        Append(NumberBuffer(cell.real).Text());
         return;
     case Cell::Kind::Text:
         if (type == FieldType::Date)
@@ -106,34 +102,31 @@ void CsvWriter::AppendCell(const Cell& cell, FieldType type)
 
 void CsvWriter::AppendText(std::string_view utf8)
 {
-    pending_ += quote_;
-    if (options_.doubledQuotes && !quote_.isEmpty()) {
-        const std::string_view quote(quote_.constData(), size_t(quote_.size()));
-        for (size_t at = utf8.find(quote); at != std::string_view::npos; at = utf8.find(quote)) {
-            Append(pending_, utf8.substr(0, at + quote.size()));
-            pending_ += quote_;
-            utf8.remove_prefix(at + quote.size());
+    Append(quote_);
+    if (options_.doubledQuotes && !quote_.empty()) {
+        for (size_t at = utf8.find(quote_); at != std::string_view::npos; at = utf8.find(quote_)) {
+            Append(utf8.substr(0, at + quote_.size()));
+            Append(quote_);
+            utf8.remove_prefix(at + quote_.size());
         }
     }
-    Append(pending_, utf8);
-    pending_ += quote_;
+    Append(utf8);
+    Append(quote_);
 }
 
 void CsvWriter::AppendDate(std::string_view stored)
 {
-    const std::optional<double> date = OleDateFromStored(stored);
-    if (!date) // what a file from elsewhere holds in a date column and nobody can read
-        return AppendText(stored);
-    if (options_.dates.order == DateOrder::Locale)
-        pending_ += FormatDateText(options_.dates, *date).toUtf8();
+    const std::string_view text = dates_.Of(stored);
+    if (text.empty()) // what a file from elsewhere holds in a date column and nobody can read
+        AppendText(stored);
     else
-        Append(pending_, FormatDateFields(options_.dates, *date).Text());
+        Append(text);
 }
 
 void CsvWriter::EndLine()
 {
-    pending_ += "\r\n";
-    if (pending_.size() >= kFlushSizeBytes)
+    Append("\r\n");
+    if (used_ >= kFlushSizeBytes)
         Flush();
 }
 
@@ -141,13 +134,10 @@ bool CsvWriter::Flush()
 {
     if (!ok_)
         return false;
-    if (plainUtf8_) {
-        ok_ = device_.write(pending_) == pending_.size();
-    } else {
-        QByteArray encoded = encoder_.encode(QString::fromUtf8(pending_));
-        ok_ = device_.write(encoded) == encoded.size();
-    }
-    pending_.resize(0); // keeps the room
+    const QByteArray waiting = QByteArray::fromRawData(pending_.data(), qsizetype(used_));
+    const QByteArray bytes = plainUtf8_ ? waiting : QByteArray(encoder_.encode(QString::fromUtf8(waiting)));
+    ok_ = device_.write(bytes) == bytes.size();
+    used_ = 0;
     return ok_;
 }
 

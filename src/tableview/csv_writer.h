@@ -3,11 +3,14 @@
 #include "expr/date_format.h"
 #include "platform/cell.h"
 #include "provider/provider.h"
+#include "tableview/date_texts.h"
 
 #include <QByteArray>
 #include <QStringEncoder>
 
+#include <algorithm>
 #include <span>
+#include <string>
 #include <vector>
 
 class QIODevice;
@@ -48,6 +51,16 @@ public:
     [[nodiscard]] bool Finish();
 
 private:
+    void Append(std::string_view bytes)
+    {
+        if (bytes.size() > pending_.size() - used_)
+            pending_.resize(2 * pending_.size() + bytes.size());
+        if (bytes.size() == 1) // separators and quotation marks, mostly
+            pending_[used_] = bytes.front();
+        else
+            std::copy(bytes.begin(), bytes.end(), pending_.begin() + std::ptrdiff_t(used_));
+        used_ += bytes.size();
+    }
     void AppendText(std::string_view utf8);
     void AppendDate(std::string_view stored);
     void AppendCell(const Cell& cell, FieldType type);
@@ -57,11 +70,13 @@ private:
     QIODevice& device_;
     CsvExportOptions options_;
     std::span<const ResultField> fields_;
-    QByteArray separator_; // in UTF-8
-    QByteArray quote_;     // in UTF-8; empty: none
-    bool plainUtf8_;       // nothing to convert
+    std::string separator_; // in UTF-8
+    std::string quote_;     // in UTF-8; empty: none
+    DateTexts dates_;
+    bool plainUtf8_; // nothing to convert
     QStringEncoder encoder_;
-    QByteArray pending_;
+    std::vector<char> pending_; // `used_` bytes wait for the device
+    size_t used_ = 0;
     bool ok_ = true;
 };
 
