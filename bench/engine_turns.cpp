@@ -1,5 +1,6 @@
 // Holds the data layer against plain SQLite on the same files, in turns, in one process:
 // mirel-bench-engine LARGE.cdb SMALL.cdb [REPEAT [reads]]
+// mirel-bench-engine export DATABASE FILE.csv        nothing but the export, for who measures the process
 //
 // Both files hold a table Birds, the columns of bench_data.cpp; the small one has ten thousand records. Neither is
 // changed: what writes works on copies. Each line: what, milliseconds of processor time here and there, the same
@@ -7,6 +8,7 @@
 // the repeats.
 #include "data/db_recordset.h"
 #include "tableview/aggregate.h"
+#include "tableview/csv_export.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -330,10 +332,25 @@ void Turns::Run(bool alsoWrites)
         Writes();
 }
 
+int Export(const QString& database, const QString& path)
+{
+    DbConnection connection;
+    Result result(connection, u"SELECT * FROM Birds"_s, database);
+    CsvExportOptions options;
+    options.header = true;
+    options.dates = {DateOrder::YearMonthDay, u'-', u':'};
+    QFile file(path);
+    if (!file.open(QIODevice::WriteOnly | QIODevice::Unbuffered))
+        Fail(path);
+    return ExportCsv(result, options, file, nullptr).ending == CsvExportResult::Ending::Complete ? 0 : 1;
+}
+
 } // namespace
 
 int main(int argc, char** argv)
 {
+    if (argc == 4 && qstrcmp(argv[1], "export") == 0)
+        return Export(QFile::decodeName(argv[2]), QFile::decodeName(argv[3]));
     if (argc < 3)
         Fail(u"mirel-bench-engine LARGE.cdb SMALL.cdb [REPEAT [reads]]"_s);
     const int repeat = argc > 3 ? std::max(1, std::atoi(argv[3])) : 3;
