@@ -22,8 +22,7 @@ constexpr std::array kCommands = {
                     Str::TipOpenByDoubleClicking, u"", u""},
     ShellCommandDef{ImportCsv, ShellMenu::File, Str::CommandImportCsv, Str::TipImportCsv, u"document-import", u"",
                     kLater, kSeparated},
-    ShellCommandDef{ExportCsv, ShellMenu::File, Str::CommandExportCsv, Str::TipExportCsv, u"document-export", u"",
-                    kLater},
+    ShellCommandDef{ExportCsv, ShellMenu::File, Str::CommandExportCsv, Str::TipExportCsv, u"document-export", u""},
     ShellCommandDef{Exit, ShellMenu::File, Str::CommandExit, Str::TipExit, u"application-exit", u"Ctrl+Q", true,
                     kSeparated},
     ShellCommandDef{Font, ShellMenu::Layout, Str::CommandFont, Str::TipLayout, u"preferences-desktop-font", u"",
@@ -107,6 +106,8 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
         return {state.IsFavorite(entry), Str::TipRemoveFavorites};
     case Open:
         return {ToolsOf(entry.kind).opens && !entry.missing, ToolsOf(entry.kind).openTip};
+    case ExportCsv:
+        return {entry.kind != EntryKind::Form && !entry.missing, Str::TipExportCsv};
     case Edit:
         return {false, ToolsOf(entry.kind).editTip};
     default:
@@ -117,7 +118,8 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
 
 bool ActsOnEntry(ShellCommand id)
 {
-    return id == AddFavorites || id == RemoveFavorites || id == Open || id == Edit || id == Delete;
+    return id == AddFavorites || id == RemoveFavorites || id == ExportCsv || id == Open || id == Edit ||
+           id == Delete;
 }
 
 } // namespace

@@ -167,8 +167,11 @@ TEST(Availability, FollowsTheSelection)
     EXPECT_TRUE(enabled(ShellCommand::OpenDatabase));
     EXPECT_FALSE(enabled(ShellCommand::ImportCsv));
 
+    EXPECT_FALSE(enabled(ShellCommand::ExportCsv));
+
     state.Select(kBirds);
     EXPECT_TRUE(enabled(ShellCommand::Open));
+    EXPECT_TRUE(enabled(ShellCommand::ExportCsv));
     EXPECT_TRUE(enabled(ShellCommand::Delete));
     EXPECT_TRUE(enabled(ShellCommand::AddFavorites));
     EXPECT_FALSE(enabled(ShellCommand::RemoveFavorites));
@@ -176,6 +179,7 @@ TEST(Availability, FollowsTheSelection)
     state.SetTab(MainTab::Favorites);
     state.Select({EntryKind::Query, u"Gone"_s, {}, false});
     EXPECT_FALSE(enabled(ShellCommand::Open)) << "its query is gone";
+    EXPECT_FALSE(enabled(ShellCommand::ExportCsv));
     EXPECT_FALSE(enabled(ShellCommand::AddFavorites));
     EXPECT_TRUE(enabled(ShellCommand::RemoveFavorites));
     EXPECT_TRUE(enabled(ShellCommand::Delete));

@@ -298,7 +298,7 @@ TEST_F(ResultCommandsTest, FillsAHandheldsWindowAndNoMore)
     ASSERT_TRUE(draft.SetSource(u"SELECT * FROM People"_s));
     CExportWizard wizard(draft, u"People"_s, path, &view);
     CFilterDialog filter(lists, u"People"_s, u"Note"_s, longNote, &view);
-    CSortDialog sort(lists, u"People"_s, &view);
+    CSortDialog sort(lists, u"People"_s, u"Age"_s, &view);
     CCsvOptionsDialog options({}, &view);
     for (QDialog* dialog : std::initializer_list<QDialog*>{&wizard, &filter, &sort, &options}) {
         dialog->resize(240, 320);

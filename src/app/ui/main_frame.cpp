@@ -9,6 +9,7 @@
 #include "platform/ui/menu_keys.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
+#include "tableview/ui/export_wizard.h"
 #include "tableview/ui/table_view.h"
 
 #include <QApplication>
@@ -156,6 +157,12 @@ void CMainFrame::Run(ShellCommand id)
         if (const std::optional<TableRequest> request = commands_.RequestOfSelected())
             OpenTable(*request);
         return;
+    case ShellCommand::ExportCsv:
+        if (const std::optional<TableRequest> request = commands_.RequestOfSelected()) {
+            RunExport(session_.Connection(), session_.Path(), session_.Prompt(),
+                      {.name = request->title, .statement = request->statement}, *this);
+        }
+        return;
     case ShellCommand::New:
         commands_.New();
         return;
@@ -170,7 +177,6 @@ void CMainFrame::Run(ShellCommand id)
     case ShellCommand::ListTextColor:
     case ShellCommand::ButtonTextColor:
     case ShellCommand::ImportCsv:
-    case ShellCommand::ExportCsv:
     case ShellCommand::Help:
     case ShellCommand::Edit:
         return; // disabled: not built yet

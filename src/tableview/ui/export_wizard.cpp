@@ -2,6 +2,7 @@
 
 #include "platform/ui/elided_label.h"
 #include "platform/ui/file_choice.h"
+#include "platform/ui/wait_cursor.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/csv_options_dialog.h"
@@ -257,6 +258,21 @@ void CExportWizard::GoOn()
         ShowStep(1);
     else if (draft_.Run())
         accept();
+}
+
+void RunExport(DbConnection& connection, const QString& database, UserPrompt& prompt, const ExportRequest& request,
+               QWidget& window)
+{
+    ExportDraft draft(connection, database, prompt);
+    {
+        const WaitCursor waiting;
+        if (!draft.SetSource(request.statement))
+            return;
+        draft.RecordCount();
+    }
+    CExportWizard wizard(draft, request.name, database, &window);
+    FillSmallWindow(wizard, window);
+    wizard.exec();
 }
 
 } // namespace mirel

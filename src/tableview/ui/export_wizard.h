@@ -49,4 +49,12 @@ private:
     QPushButton* next_;
 };
 
+// Opens the wizard over `window` on the records of a statement, and comes back when it is done with.
+struct ExportRequest {
+    QString name; // of the table or the query
+    QString statement;
+};
+void RunExport(DbConnection& connection, const QString& database, UserPrompt& prompt, const ExportRequest& request,
+               QWidget& window);
+
 } // namespace mirel

@@ -81,14 +81,19 @@ std::optional<bool> ResultCommands::Do(TableCommand command)
     }
 }
 
+QString ResultCommands::SelectedColumn() const
+{
+    const int field = browser_.SelectedField();
+    return field < 0 ? QString() : browser_.Fields()[size_t(field)].column;
+}
+
 bool ResultCommands::FilterByExpression()
 {
     if (!browser_.WriteEdit())
         return false;
     FieldLists lists(connection_, browser_.Database(), prompt_);
-    const int field = browser_.SelectedField();
-    const QString column = field < 0 ? QString() : browser_.Fields()[size_t(field)].column;
-    CFilterDialog dialog(lists, browser_.TableOf(field), column, browser_.SelectedText(), &view_);
+    CFilterDialog dialog(lists, browser_.TableOf(browser_.SelectedField()), SelectedColumn(),
+                         browser_.SelectedText(), &view_);
     FillSmallWindow(dialog, view_);
     if (dialog.exec() != QDialog::Accepted)
         return true;
@@ -101,7 +106,7 @@ bool ResultCommands::SortByExpression()
     if (!browser_.WriteEdit())
         return false;
     FieldLists lists(connection_, browser_.Database(), prompt_);
-    CSortDialog dialog(lists, browser_.TableOf(browser_.SelectedField()), &view_);
+    CSortDialog dialog(lists, browser_.TableOf(browser_.SelectedField()), SelectedColumn(), &view_);
     FillSmallWindow(dialog, view_);
     if (dialog.exec() != QDialog::Accepted)
         return true;
@@ -150,16 +155,8 @@ bool ResultCommands::Export()
 {
     if (!browser_.WriteEdit())
         return false;
-    ExportDraft draft(connection_, browser_.Database(), prompt_);
-    {
-        const WaitCursor waiting;
-        if (!draft.SetSource(browser_.Statement()))
-            return true;
-        draft.RecordCount();
-    }
-    CExportWizard wizard(draft, title_, browser_.Database(), &view_);
-    FillSmallWindow(wizard, view_);
-    wizard.exec();
+    RunExport(connection_, browser_.Database(), prompt_, {.name = title_, .statement = browser_.Statement()},
+              view_);
     return true;
 }
 

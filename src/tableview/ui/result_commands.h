@@ -37,6 +37,7 @@ Q_SIGNALS:
     void queriesChanged();
 
 private:
+    QString SelectedColumn() const; // in its table; empty for an expression
     bool FilterByExpression();
     bool SortByExpression();
     bool OpenQuery();

@@ -14,13 +14,13 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-CSortDialog::CSortDialog(FieldLists& lists, const QString& table, QWidget* parent)
+CSortDialog::CSortDialog(FieldLists& lists, const QString& table, const QString& field, QWidget* parent)
     : QDialog(parent)
     , terms_(new QLineEdit(this))
 {
     setWindowTitle(StringText(Str::SortTitle));
     auto* chooser = new FieldChooser(lists, FieldChooser::Use::ToPick, this);
-    chooser->Choose(table, {});
+    chooser->Choose(table, field);
     auto* directions = new PickBox(this);
     directions->addItems({u"ASC"_s, u"DESC"_s});
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);

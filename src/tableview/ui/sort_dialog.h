@@ -13,7 +13,7 @@ class CSortDialog : public QDialog {
     Q_OBJECT
 
 public:
-    CSortDialog(FieldLists& lists, const QString& table, QWidget* parent);
+    CSortDialog(FieldLists& lists, const QString& table, const QString& field, QWidget* parent);
 
     QString Terms() const;
 
