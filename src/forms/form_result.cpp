@@ -65,11 +65,11 @@ bool FormResult::RunAgain()
 
 bool FormResult::MoveTo(qint64 record)
 {
-    if (!records_.MoveTo(record)) {
+    if (!records_.MoveTo(record) || (records_.IsEof() && !records_.MoveLast())) {
         Report();
         return false;
     }
-    index_ = record;
+    index_ = records_.Position();
     return true;
 }
 

@@ -38,7 +38,9 @@ public:
     bool Add(std::span<const FieldChange> values); // the new record becomes current
     // The record that takes its place becomes current, or the last one. When it fails, the query is run again.
     bool Delete();
-    void Recount(); // after records came or went behind the cursor's back
+    // Brings count and place up to date after records came or went behind the cursor's back: an INSERT of ours, or
+    // what another program did.
+    void Recount();
 
     // Each runs the rewritten query and stands on its first record. False when the provider refuses it: the
     // result before is then shown again.

@@ -248,28 +248,45 @@ RunningForm::Outcome RunningForm::LeaveAndMoveTo(qint64 record)
     return Outcome::Done;
 }
 
+// Another program may have added or deleted records: moves go from where the record stands now.
+void RunningForm::TakeUpChanges()
+{
+    const qint64 before = result_.Count();
+    result_.Recount();
+    if (result_.Count() == before)
+        return;
+    ShowRecord(FormControls::Edits::Keep);
+    controls_.TouchLists();
+}
+
 RunningForm::Outcome RunningForm::GoToFirst()
 {
-    return result_.Count() < 1 ? Outcome::Failed : LeaveAndMoveTo(0);
+    return GoToRecord(0);
 }
 
 RunningForm::Outcome RunningForm::GoToLast()
 {
+    TakeUpChanges();
     return result_.Count() < 1 ? Outcome::Failed : LeaveAndMoveTo(result_.Count() - 1);
 }
 
 RunningForm::Outcome RunningForm::GoToNext()
 {
-    return GoToRecord(result_.Index() + 1);
+    TakeUpChanges();
+    return result_.Index() + 1 >= result_.Count() ? Outcome::Failed : LeaveAndMoveTo(result_.Index() + 1);
 }
 
 RunningForm::Outcome RunningForm::GoToPrevious()
 {
-    return result_.Index() == 0 ? Outcome::Done : GoToRecord(result_.Index() - 1);
+    TakeUpChanges();
+    if (result_.Count() < 1)
+        return Outcome::Failed;
+    return result_.Index() <= 0 ? Outcome::Done : LeaveAndMoveTo(result_.Index() - 1);
 }
 
 RunningForm::Outcome RunningForm::GoToRecord(qint64 record)
 {
+    TakeUpChanges();
     return record < 0 || record >= result_.Count() ? Outcome::Failed : LeaveAndMoveTo(record);
 }
 

@@ -141,6 +141,7 @@ private:
     bool OpenFirstResult();
     bool MayRun(const QString& statement);
     Outcome RunQuery(const QString& query, qint64 record);
+    void TakeUpChanges();
     Outcome LeaveAndMoveTo(qint64 record);
     // Runs `rewrite` on the result after the leave-record check, and shows what came of it.
     template <typename Rewrite>

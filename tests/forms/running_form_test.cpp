@@ -1,5 +1,6 @@
 // What a running form shows and what the user does to its controls; buttons are in form_buttons_test.cpp.
 #include "form_fixture.h"
+#include "support/sqlite_file.h"
 
 #include <limits>
 
@@ -55,6 +56,21 @@ TEST_F(RunningFormTest, MovesWithinTheResultAlone)
     EXPECT_EQ(running->GoToPrevious(), Outcome::Done);
     EXPECT_EQ(running->GoToFirst(), Outcome::Done);
     EXPECT_EQ(running->CurrentRecord(), 0);
+}
+
+TEST_F(RunningFormTest, FollowsWhatAnotherProgramDoes)
+{
+    Start(BirdForm());
+    EXPECT_EQ(running->GoToRecord(1), Outcome::Done);
+    SqliteFile(path_).Run("DELETE FROM Birds WHERE ID=1; UPDATE Birds SET Name='Swift' WHERE ID=3");
+    EXPECT_EQ(running->GoToNext(), Outcome::Done); // of Gull, the first one now
+    EXPECT_EQ(Text(u"counter"), u"2/3"_s);
+    EXPECT_EQ(Text(u"Name"), u"Swift"_s);
+    SqliteFile(path_).Run("DELETE FROM Birds");
+    EXPECT_EQ(running->GoToNext(), Outcome::Failed);
+    EXPECT_EQ(running->GoToLast(), Outcome::Failed);
+    EXPECT_EQ(running->CounterText(), u"0/0"_s);
+    EXPECT_EQ(Text(u"Name"), QString());
 }
 
 // What the first result comes from: the call's query, a default-query button, the form's default query, the table.
