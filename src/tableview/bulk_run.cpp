@@ -9,16 +9,27 @@ namespace mirel {
 bool BulkRun::Run(Str what, qint64 total, const std::function<bool(const BulkProgress&)>& work)
 {
     done_ = 0;
+    stopped_ = false;
     bool ended = false;
     {
         const std::unique_ptr<Progress> progress = prompt_.StartProgress({what, {}}, total);
         ended = work([&](qint64 done) {
             done_ = done;
-            return progress->Advance(done);
+            stopped_ = !progress->Advance(done);
+            return !stopped_;
         });
     } // the display goes before a message comes
     if (!ended)
         ReportProviderError(prompt_, &records_, records_.LastResult());
+    return ended;
+}
+
+bool BulkRun::Change(Str what, const std::function<bool(const BulkProgress&)>& work)
+{
+    const qint64 total = records_.RecordCount();
+    const bool ended = Run(what, total, work);
+    if (ended && stopped_ && done_ < total)
+        prompt_.Show({Str::StoppedAt, {QString::number(done_), QString::number(total)}});
     return ended;
 }
 
@@ -54,14 +65,14 @@ bool BulkRun::AskUpdateAll(int field, const QString& shownValue)
 
 bool BulkRun::DeleteAll()
 {
-    return Run(Str::DeletingRecords, records_.RecordCount(),
-               [&](const BulkProgress& progress) { return records_.DeleteAll(progress); });
+    return Change(Str::DeletingRecords,
+                  [&](const BulkProgress& progress) { return records_.DeleteAll(progress); });
 }
 
 bool BulkRun::UpdateAll(int field, const Value& value)
 {
-    return Run(Str::UpdatingRecords, records_.RecordCount(),
-               [&](const BulkProgress& progress) { return records_.UpdateAll(field, value, progress); });
+    return Change(Str::UpdatingRecords,
+                  [&](const BulkProgress& progress) { return records_.UpdateAll(field, value, progress); });
 }
 
 } // namespace mirel

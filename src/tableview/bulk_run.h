@@ -27,7 +27,7 @@ public:
     // The questions, two of them before each run; false: the user does not want it.
     bool AskDeleteAll();
     bool AskUpdateAll(int field, const QString& shownValue);
-    // True when the run went through, or the user ended it on the way.
+    // True when the run went through, or the user ended it on the way: how far it came is then told.
     bool DeleteAll();
     bool UpdateAll(int field, const Value& value);
 
@@ -36,10 +36,12 @@ public:
 
 private:
     bool Run(Str what, qint64 total, const std::function<bool(const BulkProgress&)>& work);
+    bool Change(Str what, const std::function<bool(const BulkProgress&)>& work);
 
     DbRecordset& records_;
     UserPrompt& prompt_;
     qint64 done_ = 0;
+    bool stopped_ = false;
 };
 
 } // namespace mirel

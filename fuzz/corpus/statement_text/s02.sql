@@ -1,0 +1,2 @@
+SELECT DISTINCT A, LEFT(B,2) AS [x,y] FROM T WHERE a='it''s' ORDER BY A
+[b] IS NULL

@@ -1,0 +1,2 @@
+SELECT 'from FROM WHERE' FROM [order by]
+1=1

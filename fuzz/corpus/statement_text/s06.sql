@@ -1,0 +1,2 @@
+SELECT (a FROM T WHERE "b
+x
