@@ -330,14 +330,14 @@ void FormControls::ClearInputs()
     }
 }
 
-bool FormControls::IsUntouched(const FieldAssignment& assignment, const FormResult& result, qint64 position) const
+bool FormControls::IsUntouched(const FieldAssignment& assignment, const FormResult& result) const
 {
     const int index = assignment.controlName.isEmpty() ? -1 : FindInput(assignment.controlName);
     if (index < 0 || ColumnOf(index, result) != assignment.field)
         return false;
     const ControlRun& control = (*this)[index];
     const ControlBinding& binding = bindings_[size_t(index)];
-    if (binding.shownRecord != position)
+    if (binding.shownRecord != result.Index())
         return false;
     return control.type == ControlType::CheckBox ? control.ticked == binding.recordTicked
                                                  : control.text == binding.recordText;

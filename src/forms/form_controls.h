@@ -64,8 +64,8 @@ public:
     bool AreEdited() const { return edited_; }
     void ForgetEdits();
     void ForgetEditsOf(const QStringList& names); // what these controls hold was written
-    // Whether the assignment would only write back what the record at `position` put into its control.
-    bool IsUntouched(const FieldAssignment& assignment, const FormResult& result, qint64 position) const;
+    // Whether the assignment would only write back what the current record put into its control.
+    bool IsUntouched(const FieldAssignment& assignment, const FormResult& result) const;
 
 private:
     int FindInput(QStringView name) const;

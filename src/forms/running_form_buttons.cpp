@@ -228,13 +228,14 @@ std::vector<FieldAssignment> RunningForm::AssignmentsOf(const ControlDef& button
 
 bool RunningForm::UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written)
 {
+    const bool isShown = result_.Records().Position() == result_.Index(); // others pass by in a bulk update
     std::vector<FieldChange> changes;
     for (FieldAssignment& assignment : assignments) {
         if (assignment.field < 0 || !assignment.tree)
             continue;
         // What the record itself put into a control may show less than the store holds: a number's last digits, a
         // date's fraction of a second. Writing it back would lose them.
-        if (controls_.IsUntouched(assignment, result_, result_.Records().Position()))
+        if (isShown && controls_.IsUntouched(assignment, result_))
             continue;
         FieldChange change{assignment.field, {}};
         const Hr hr = ValueToStore(
