@@ -1,5 +1,6 @@
 #include "app/ui/message_box_prompt.h"
 
+#include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 
 #include <QApplication>
@@ -40,6 +41,7 @@ QMessageBox::StandardButton Ask(const QString& text, QMessageBox::Icon icon, QMe
     box.setTextFormat(Qt::PlainText);
     box.setDefaultButton(preset);
     box.setEscapeButton(preset);
+    const UsualCursor answering;
     return QMessageBox::StandardButton(box.exec());
 }
 
@@ -115,6 +117,7 @@ std::optional<QString> MessageBoxPrompt::AskText(const UserMessage& title, const
                                                  const QString& preset)
 {
     bool accepted = false;
+    const UsualCursor answering;
     const QString text = QInputDialog::getText(FrontWindow(), title.Text(), LinesOf(label.Text()),
                                                QLineEdit::Normal, preset, &accepted);
     return accepted ? std::optional(text) : std::nullopt;

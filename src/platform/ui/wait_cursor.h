@@ -13,4 +13,12 @@ public:
     Q_DISABLE_COPY_MOVE(WaitCursor)
 };
 
+// The usual cursor again, for a question in the middle of that.
+class UsualCursor {
+public:
+    UsualCursor() { QGuiApplication::setOverrideCursor(Qt::ArrowCursor); }
+    ~UsualCursor() { QGuiApplication::restoreOverrideCursor(); }
+    Q_DISABLE_COPY_MOVE(UsualCursor)
+};
+
 } // namespace mirel

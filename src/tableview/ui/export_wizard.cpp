@@ -80,6 +80,7 @@ CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, QWi
     , pages_(new QStackedWidget(this))
     , path_(new ElidedLabel(this))
     , preview_(new QListWidget(this))
+    , saveAs_(new QPushButton(StringText(Str::ExportSaveAs), this))
     , back_(new QPushButton(StringText(Str::WizardBack), this))
     , next_(new QPushButton(this))
 {
@@ -128,11 +129,9 @@ QWidget* CExportWizard::SourcePage()
     auto* query = new QPushButton(StringText(Str::ExportQuery), page);
     query->setEnabled(false);
     query->setToolTip(StringText(Str::ExportQueryTip));
-    auto* saveAs = new QPushButton(StringText(Str::ExportSaveAs), page);
-    saveAs->setToolTip(StringText(Str::ExportSaveAsTip));
-    saveAs->setAutoDefault(false);
+    saveAs_->setToolTip(StringText(Str::ExportSaveAsTip));
     auto* count = new QLabel(StringText(Str::RecordsSelected, {QString::number(draft_.RecordCount())}), page);
-    connect(saveAs, &QPushButton::clicked, this, &CExportWizard::ChoosePath);
+    connect(saveAs_, &QPushButton::clicked, this, &CExportWizard::ChoosePath);
 
     auto* grid = new QGridLayout(page);
     grid->setContentsMargins({});
@@ -143,7 +142,7 @@ QWidget* CExportWizard::SourcePage()
     grid->addWidget(count, 3, 0, 1, 2);
     grid->addWidget(new QLabel(StringText(Str::ExportDestination), page), 4, 0, 1, 2);
     grid->addWidget(path_, 5, 0);
-    grid->addWidget(saveAs, 5, 1);
+    grid->addWidget(saveAs_, 5, 1);
     grid->setColumnStretch(0, 1);
     grid->setRowStretch(2, 1);
     return page;
@@ -210,8 +209,7 @@ void CExportWizard::ShowStep(int step)
     ShowState();
     if (step > 0)
         ShowPreview();
-    if (next_->isEnabled())
-        next_->setFocus();
+    (next_->isEnabled() ? next_ : saveAs_)->setFocus();
 }
 
 void CExportWizard::ShowState()

@@ -45,6 +45,7 @@ private:
     QStackedWidget* pages_;
     ElidedLabel* path_;
     QListWidget* preview_;
+    QPushButton* saveAs_;
     QPushButton* back_;
     QPushButton* next_;
 };

@@ -1,4 +1,5 @@
 #include "platform/ui/menu_keys.h"
+#include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
@@ -13,6 +14,7 @@
 
 #include <algorithm>
 #include <array>
+#include <memory>
 
 // The commands of the table view: their actions and menus, when each can be given, and what carries it out.
 
@@ -33,10 +35,13 @@ bool Columns(RecordBrowser& browser)
     return browser.MoveColumns(Count);
 }
 
+constexpr bool kTakesTime = true;
+
 // What the browser does by itself.
 struct BrowserCall {
     Command command;
     bool (*call)(RecordBrowser&);
+    bool takesTime = false; // runs a statement
 };
 constexpr std::array kBrowserCalls = {
     BrowserCall{Command::First, [](RecordBrowser& b) { return b.GoToFirst(); }},
@@ -74,16 +79,18 @@ constexpr std::array kBrowserCalls = {
     BrowserCall{Command::NewRecord, [](RecordBrowser& b) { return b.AddRecord(); }},
     BrowserCall{Command::DeleteRecord, [](RecordBrowser& b) { return b.DeleteRecord(); }},
     BrowserCall{Command::ToggleDetail, [](RecordBrowser& b) { return b.TogglePresentation(); }},
-    BrowserCall{Command::RunAgain, [](RecordBrowser& b) { return b.RunAgain(); }},
+    BrowserCall{Command::RunAgain, [](RecordBrowser& b) { return b.RunAgain(); }, kTakesTime},
     BrowserCall{Command::FilterBySelection,
-                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::BySelection); }},
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::BySelection); }, kTakesTime},
     BrowserCall{Command::FilterExcluding,
-                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::ExcludingSelection); }},
-    BrowserCall{Command::RemoveFilter, [](RecordBrowser& b) { return b.RemoveFilter(); }},
+                [](RecordBrowser& b) { return b.FilterByCell(CellFilter::ExcludingSelection); }, kTakesTime},
+    BrowserCall{Command::RemoveFilter, [](RecordBrowser& b) { return b.RemoveFilter(); }, kTakesTime},
     BrowserCall{Command::SortAscending,
-                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Ascending); }},
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Ascending); },
+                kTakesTime},
     BrowserCall{Command::SortDescending,
-                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Descending); }},
+                [](RecordBrowser& b) { return b.SortByColumn(b.SelectedField(), SortDirection::Descending); },
+                kTakesTime},
     BrowserCall{Command::HideColumn, [](RecordBrowser& b) { return b.HideColumn(); }},
     BrowserCall{Command::ShowAllColumns, [](RecordBrowser& b) { return b.ShowAllColumns(); }},
 };
@@ -183,6 +190,7 @@ void CTableView::Do(TableCommand command)
     if (row != kBrowserCalls.end()) {
         const bool fromEditor = strip_->HasEditorFocus();
         const bool isEdit = command == Command::RepeatAbove || command == Command::InsertDateTime;
+        const auto waiting = row->takesTime ? std::make_unique<WaitCursor>() : nullptr;
         if (Run(row->call) && fromEditor && !isEdit)
             grid_->setFocus();
         return;
