@@ -56,9 +56,10 @@ public:
         ControlDef& counter = Add(ControlType::EditBox, u"counter", place, kEditStyle | style::kRight);
         SetSource(counter, u"RECNO()+'/'+RECCOUNT()"_s, SourceScope::Record);
     }
+    // A label stands at the top of its place, the text of a box in the middle of it.
     void Label(QStringView text, const QRect& place)
     {
-        Add(ControlType::Label, text, place, kLabelStyle | style::kRight);
+        Add(ControlType::Label, text, place.adjusted(0, 3, 0, 0), kLabelStyle | style::kRight);
     }
     // A box that shows the field of that name.
     ControlDef& FieldBox(QStringView field, const QRect& place, EditKind kind = EditKind::Plain)
@@ -135,20 +136,21 @@ FormDef StrikesForm()
     FormSheet sheet(u"Strikes");
     sheet.Title(u"Bird strikes", {kMargin, 4, 140, kLineHeight});
     sheet.Counter({146, 4, 80, kLineHeight});
+    sheet.Label(u"Search:", {kMargin, 28, 44, 22});
     sheet.DropDown(u"Species",
                    {u"SELECT DISTINCT [Wildlife Species] FROM [Bird Strikes] ORDER BY [Wildlife Species]"_s, {}},
-                   {kMargin, 28, 160, 22}, false);
+                   {52, 28, 120, 22}, false);
     sheet
         .Button(u"Find", ButtonFunction::Select,
                 u"SELECT * WHERE [Wildlife Species] LIKE '%&[Species]%' ORDER BY [Cost Total $] DESC"_s,
-                {168, 28, 58, 22})
+                {176, 28, 50, 22})
         .option1 = 1;
     sheet.List(u"strikes",
                {{u"Date"_s, FieldSource(u"Flight Date")},
-                {u"Airport"_s, FieldSource(u"Airport Name")},
-                {u"Cost $"_s, FieldSource(u"Cost Total $")}},
-               {kMargin, 54, kInnerWidth, 104});
-    int top = 162;
+                {u"Cost $"_s, FieldSource(u"Cost Total $")},
+                {u"Airport"_s, FieldSource(u"Airport Name")}},
+               {kMargin, 54, kInnerWidth, 84});
+    int top = 142;
     const auto row = [&](QStringView label, QStringView field) {
         sheet.Label(label, {kMargin, top, 56, kLineHeight});
         sheet.FieldBox(field, {64, top, 162, kLineHeight});
@@ -157,7 +159,7 @@ FormDef StrikesForm()
     row(u"Species:", u"Wildlife Species");
     row(u"Aircraft:", u"Aircraft Make Model");
     row(u"Damage:", u"Effect Amount of damage");
-    sheet.Label(u"All cost $:", {kMargin, top, 56, kLineHeight});
+    sheet.Label(u"Total $:", {kMargin, top, 56, kLineHeight});
     sheet.WholeBox(u"Total", u"SUM([Cost Total $])"_s, {64, top, 74, kLineHeight});
     sheet.Label(u"Avg:", {140, top, 28, kLineHeight});
     sheet.WholeBox(u"Average", u"ROUND(AVG([Cost Total $]),0)"_s, {170, top, 56, kLineHeight});
