@@ -56,7 +56,8 @@ bool ExportToOutput(Run& run, DbRecordset& records, const CsvExportOptions& opti
 
 bool ExportToFile(Run& run, DbRecordset& records, const CsvExportOptions& options, const QString& path)
 {
-    const std::optional<qint64> written = ExportCsvFile(records, options, path, OnStop::Discard, run.Prompt());
+    const CsvTarget target{.path = path, .database = run.Session().Path(), .onStop = OnStop::Discard};
+    const std::optional<qint64> written = ExportCsvFile(records, options, target, run.Prompt());
     run.Times().rows = written.value_or(0);
     return written.has_value();
 }

@@ -5,12 +5,20 @@
 
 #include <QBuffer>
 #include <QDir>
+#include <QFileInfo>
 #include <QSaveFile>
 
 namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
+
+// Whatever links lead there.
+bool IsSameFile(const QString& path, const QString& other)
+{
+    const QString place = QFileInfo(path).canonicalFilePath();
+    return !place.isEmpty() && place == QFileInfo(other).canonicalFilePath();
+}
 
 constexpr qint64 kRecordsPerStep = 1024; // between two looks at the progress display
 
@@ -44,13 +52,14 @@ CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, 
     return result;
 }
 
-std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path,
-                                    OnStop onStop, UserPrompt& prompt)
+std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const CsvTarget& target,
+                                    UserPrompt& prompt)
 {
     using Ending = CsvExportResult::Ending;
-    QSaveFile file(path);
-    if (!file.open(QIODevice::WriteOnly)) {
-        prompt.Show({Str::FileCreationFail, {QDir::toNativeSeparators(path)}});
+    const QString path = QDir::toNativeSeparators(target.path);
+    QSaveFile file(target.path);
+    if (IsSameFile(target.path, target.database) || !file.open(QIODevice::WriteOnly)) {
+        prompt.Show({Str::FileCreationFail, {path}});
         return {};
     }
     CsvExportResult result;
@@ -63,10 +72,10 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
         ReportProviderError(prompt, &source, source.LastResult());
         return {};
     }
-    if (result.ending == Ending::Stopped && onStop == OnStop::Discard)
+    if (result.ending == Ending::Stopped && target.onStop == OnStop::Discard)
         return {};
     if (result.ending == Ending::WriteFailed || !file.commit()) {
-        prompt.Show({Str::FileWriteFail, {QDir::toNativeSeparators(path), file.errorString()}});
+        prompt.Show({Str::FileWriteFail, {path, file.errorString()}});
         return {};
     }
     prompt.Show({Str::RecordsExported, {QString::number(result.records)}});

@@ -31,11 +31,17 @@ CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, 
 
 enum class OnStop { KeepWritten, Discard };
 
+struct CsvTarget {
+    QString path;
+    QString database; // whose records these are: the one file that an export never replaces
+    OnStop onStop = OnStop::KeepWritten;
+};
+
 // The same into a file, with progress and the messages of its end. An existing file is replaced in one step once
-// the new one is whole, or, when the user stops it and `onStop` says so, holds what was written up to there. Gives
-// the number of records; empty: nothing was written, why was told, and the file is as it was before.
-std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const QString& path,
-                                    OnStop onStop, UserPrompt& prompt);
+// the new one is whole, or, when the user stops it and the target says so, holds what was written up to there.
+// Gives the number of records; empty: nothing was written, why was told, and the file is as it was before.
+std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const CsvTarget& target,
+                                    UserPrompt& prompt);
 
 // The first lines of the file that ExportCsv would write, at most `maxLines`, and a line "....." when there are
 // more records than that.

@@ -53,7 +53,8 @@ bool ExportDraft::ChoosePath(const QString& path)
 
 bool ExportDraft::Run()
 {
-    return CanRun() && ExportCsvFile(records_, options_, path_, OnStop::KeepWritten, prompt_).has_value();
+    return CanRun() &&
+           ExportCsvFile(records_, options_, {.path = path_, .database = database_}, prompt_).has_value();
 }
 
 } // namespace mirel

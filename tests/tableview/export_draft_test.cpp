@@ -118,6 +118,20 @@ TEST_F(Export, SaysWhyAFileCannotBeMadeAndCanGoElsewhere)
     EXPECT_TRUE(draft.Run());
 }
 
+TEST_F(Export, NeverReplacesTheDatabaseItself)
+{
+    ASSERT_TRUE(draft.SetSource(u"SELECT Name FROM People"_s));
+    ASSERT_TRUE(QFile::link(path, File(u"link.csv"_s)));
+    for (const QString& database :
+         {path, File(u"link.csv"_s), File(u"../"_s) + QDir(folder.path()).dirName() + u"/people.cdb"_s}) {
+        prompt.answers = {true};
+        EXPECT_TRUE(draft.ChoosePath(database));
+        EXPECT_FALSE(draft.Run());
+        EXPECT_TRUE(prompt.shown.takeLast().startsWith(u"File creation fail."_s));
+    }
+    EXPECT_EQ(Stored(u"SELECT COUNT(*) FROM People"_s), u"25"_s);
+}
+
 TEST_F(Export, LeavesTheOldFileWhenTheDiskIsFull)
 {
     OpenLongSource();
