@@ -19,6 +19,7 @@ enum class ShellCommand {
     DatabaseTextColor,
     ListTextColor,
     ButtonTextColor,
+    ResetLayout,
     ImportCsv,
     ExportCsv,
     Exit,

@@ -13,6 +13,7 @@ void CellEdit::Load(const Value& value, FieldType type, int size)
     if (type == FieldType::YesNo) {
         kind_ = EditorKind::Check;
         checked_ = loadedChecked_ = value.Number() != 0;
+        unset_ = value.IsNull();
         return;
     }
     kind_ = type == FieldType::Date ? EditorKind::Date : EditorKind::Text;

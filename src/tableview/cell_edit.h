@@ -19,6 +19,7 @@ public:
     EditorKind Kind() const { return kind_; }
     const QString& Text() const { return text_; }
     bool IsChecked() const { return checked_; }
+    bool IsUnset() const { return unset_ && !pending_; } // a Yes/No that is neither
     bool IsPending() const { return pending_; }
     bool IsKeptWhole() const; // false: what is stored will not be all of the text
 
@@ -37,6 +38,7 @@ private:
     QString loadedText_;
     QString text_;
     bool loadedChecked_ = false;
+    bool unset_ = false;
     bool checked_ = false;
     bool pending_ = false;
 };

@@ -290,6 +290,8 @@ void RecordBrowser::RevertEdit()
 
 QString RecordBrowser::SelectedText() const
 {
+    if (edit_.IsUnset())
+        return {};
     return edit_.Kind() == EditorKind::Check ? settings_.words.Of(edit_.IsChecked()) : edit_.Text();
 }
 

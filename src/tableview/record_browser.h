@@ -217,7 +217,7 @@ public:
     // --- records ------------------------------------------------------------------------------------------
 
     bool AddRecord();
-    bool DeleteRecord();
+    bool DeleteRecord(); // all records that have selected cells
 
     // What a change of many records came to. Where it stopped early, the records before are written.
     struct ManyChanged {
@@ -273,7 +273,9 @@ private:
     bool AddOne(std::vector<FieldChange> values, UndoLog::Step& step);
     std::optional<RecordChange> NewChange(RecordChange::Kind kind) const; // none: it cannot be undone
     void NoteAdded(UndoLog::Step& step) const;
-    void NoteDeleted(UndoLog::Step& step);
+    void NoteDeleted(DbRecordset& table, UndoLog::Step& step);
+    bool DeleteBlock();
+    bool DeleteFrom(qint64 first, qint64 last, UndoLog::Step& step);
 
     DbConnection& connection_;
     DbRecordset recordset_;

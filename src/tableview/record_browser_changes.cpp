@@ -83,10 +83,13 @@ bool RecordBrowser::DeleteRecord()
     const qint64 record = SelectedRecord();
     if (record < 0 || !WriteEdit())
         return false;
+    if (Block().Records() > 1)
+        return DeleteBlock();
     if (settings_.confirmDelete && !prompt_.AskYesNo({Str::DeleteRecordQuestion, {}}))
         return false;
     UndoLog::Step step;
-    NoteDeleted(step);
+    DbRecordset table(connection_);
+    NoteDeleted(table, step);
     if (!recordset_.Delete()) {
         ReportFailure();
         RunAgain();
@@ -144,6 +147,53 @@ RecordBrowser::ChangeRecords(qint64 first, qint64 count,
     FillPage();
     LoadEditor();
     return changed;
+}
+
+bool RecordBrowser::DeleteBlock()
+{
+    const CellBlock block = Block();
+    if (settings_.confirmDelete &&
+        !prompt_.AskYesNo({Str::DeleteRecordsQuestion, {QString::number(block.Records())}}))
+        return false;
+    ProviderConnection& provider = *connection_.Provider();
+    Hr result = provider.BeginBulk(database_);
+    if (Failed(result)) {
+        ReportProviderError(prompt_, nullptr, result);
+        return false;
+    }
+    UndoLog::Step step;
+    const bool deleted = DeleteFrom(block.firstRecord, block.lastRecord, step);
+    if (!deleted)
+        ReportFailure();
+    result = provider.EndBulk(database_);
+    ReportProviderError(prompt_, nullptr, result);
+    if (!Failed(result))
+        undo_.Add(std::move(step));
+    count_.reset();
+    topRow_ = std::min(topRow_, HighestTopRow());
+    ShowRecord(std::min(block.firstRecord, Count() - 1));
+    FillPage();
+    LoadEditor();
+    return deleted && !Failed(result);
+}
+
+// From the last to the first, so that those still to go keep their places. A stop is no failure.
+bool RecordBrowser::DeleteFrom(qint64 first, qint64 last, UndoLog::Step& step)
+{
+    constexpr qint64 kRecordsAStep = 64;
+    const std::unique_ptr<Progress> progress =
+        prompt_.StartProgress({Str::DeletingSelected, {}}, last - first + 1);
+    DbRecordset table(connection_);
+    for (qint64 record = last; record >= first; --record) {
+        if ((last - record) % kRecordsAStep == 0 && !progress->Advance(last - record))
+            return true;
+        if (!recordset_.MoveTo(record))
+            return false;
+        NoteDeleted(table, step);
+        if (!recordset_.Delete())
+            return false;
+    }
+    return true;
 }
 
 bool RecordBrowser::ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step& step)
@@ -209,12 +259,13 @@ void RecordBrowser::NoteAdded(UndoLog::Step& step) const
     step.push_back(std::move(*change));
 }
 
-// The whole record, also what of it the result does not show.
-void RecordBrowser::NoteDeleted(UndoLog::Step& step)
+// The whole record, also what of it the result does not show: `table` is opened for that where it is not yet.
+void RecordBrowser::NoteDeleted(DbRecordset& table, UndoLog::Step& step)
 {
     std::optional<RecordChange> change = NewChange(RecordChange::Kind::Deleted);
-    DbRecordset table(connection_);
-    if (!change ||
+    if (!change)
+        return;
+    if (!table.IsOpen() &&
         !table.Open(StatementOfTable(change->table), database_, CursorType::Static, LockType::Optimistic))
         return;
     std::vector<int> shown; // where the result has each of the table's columns

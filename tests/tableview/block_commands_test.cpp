@@ -262,6 +262,21 @@ TEST_F(Blocks, UndoBringsADeletedRecordBackWhole)
     EXPECT_EQ(All(u"Name"_s, u"Age=21"_s), u"P1"_s);
 }
 
+TEST_F(Blocks, AreDeletedAsWholeRecordsAndComeBack)
+{
+    ASSERT_TRUE(browser.SortByColumn(Age, SortDirection::Descending));
+    Select(1, Name);
+    Extend(3, Age);
+    EXPECT_FALSE(browser.DeleteRecord());
+    EXPECT_EQ(prompt.questions, QStringList{u"Are you sure you want to delete these 3 records?"_s});
+    prompt.answers = {true};
+    EXPECT_TRUE(browser.DeleteRecord());
+    EXPECT_EQ(browser.CounterText(), u"2/22"_s);
+    EXPECT_EQ(All(u"Name"_s, u"Age>40"_s), u"P24"_s);
+    EXPECT_TRUE(browser.Undo());
+    EXPECT_EQ(All(u"Name"_s, u"Age>40 ORDER BY Age"_s), u"P21 P22 P23 P24"_s);
+}
+
 TEST_F(Blocks, UndoTakesANewRecordAwayUnlessItWasFilledInElsewhere)
 {
     ASSERT_TRUE(browser.AddRecord());

@@ -1,4 +1,5 @@
 #include "tableview/column_layout.h"
+#include "tableview/column_widths.h"
 #include "tableview/scroll_scale.h"
 
 #include <gtest/gtest.h>
@@ -61,6 +62,14 @@ TEST_F(Columns, AreResizedByTheNearestEdgeWithinReach)
     layout_.Fit(0, 80);
     EXPECT_FALSE(layout_.IsByHand(0));
     EXPECT_EQ(layout_.LeftPx(1), 80);
+}
+
+TEST(ColumnWidths, ComeBackFromTheProfile)
+{
+    const ColumnWidths widths = {{QStringLiteral("Name"), 120}, {QStringLiteral("a:b,c%"), 80}};
+    EXPECT_EQ(ReadColumnWidths(ColumnWidthsText(widths)), widths);
+    EXPECT_EQ(ReadColumnWidths(QStringLiteral("Name:120,x,:,Age:wide,B:-5,C:99999999999")),
+              (ColumnWidths{{QStringLiteral("Name"), 120}}));
 }
 
 } // namespace

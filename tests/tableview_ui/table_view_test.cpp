@@ -4,6 +4,7 @@
 #include "tableview/people_fixture.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"
+#include "tableview/ui/find_line.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
 
@@ -12,11 +13,14 @@
 #include <QCheckBox>
 #include <QClipboard>
 #include <QLineEdit>
+#include <QMenu>
+#include <QMenuBar>
 #include <QMimeData>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
 #include <QScrollBar>
 #include <QTest>
+#include <QTimer>
 #include <QToolButton>
 
 #include <algorithm>
@@ -229,6 +233,99 @@ TEST_F(TableView, LeavesCtrlZToTheEditorWhileItHasSomethingToUndo)
     EXPECT_EQ(Line()->text(), u"21"_s);
     Press(Qt::Key_Z, Qt::ControlModifier);
     EXPECT_EQ(Stored(u"SELECT Name FROM People WHERE Age=21"_s), u"P1"_s);
+}
+
+TEST_F(TableView, FindsWhileTypingAndGoesOnWithEnterAndF3)
+{
+    QTest::keyClick(&view, Qt::Key_F, Qt::ControlModifier);
+    Type(u"note 1"_s);
+    EXPECT_EQ(Selected(), u"Note/10/25"_s);
+    Type(u"2"_s);
+    EXPECT_EQ(Selected(), u"Note/12/25"_s);
+    Press(Qt::Key_Backspace);
+    Press(Qt::Key_Return);
+    EXPECT_EQ(Selected(), u"Note/13/25"_s);
+    Press(Qt::Key_Return, Qt::ShiftModifier);
+    Press(Qt::Key_Escape);
+    EXPECT_TRUE(GridHasFocus());
+    EXPECT_EQ(Selected(), u"Note/12/25"_s);
+    QTest::keyClick(&view, Qt::Key_F3);
+    EXPECT_EQ(Selected(), u"Note/13/25"_s);
+    QTest::keyClick(&view, Qt::Key_F3, Qt::ShiftModifier);
+    EXPECT_EQ(Selected(), u"Note/12/25"_s);
+    EXPECT_TRUE(view.findChild<FindLine*>()->isVisible());
+    Press(Qt::Key_Escape);
+    EXPECT_FALSE(view.findChild<FindLine*>()->isVisible());
+}
+
+TEST_F(TableView, ShowsItsMenusWithEveryEntryAndLetter)
+{
+    QStringList entries;
+    for (const QAction* top : view.menuBar()->actions()) {
+        QSet<QString> letters;
+        for (const QAction* entry : top->menu()->actions()) {
+            if (entry->isSeparator())
+                continue;
+            const QString letter = entry->text().section(u'&', 1, 1).left(1).toLower();
+            EXPECT_FALSE(letter.isEmpty()) << entry->text().toStdString();
+            EXPECT_FALSE(letters.contains(letter)) << entry->text().toStdString() << ": its letter is taken";
+            letters += letter;
+            EXPECT_FALSE(entry->toolTip().isEmpty()) << entry->text().toStdString();
+            entries += QString(entry->text()).remove(u'&');
+        }
+    }
+    for (const QString& entry : {u"Insert Current DateTime"_s,
+                                 u"New Query ..."_s,
+                                 u"Open Query ..."_s,
+                                 u"Save As Query ..."_s,
+                                 u"Export to CSV ..."_s,
+                                 u"Auto Size Column"_s,
+                                 u"Options..."_s,
+                                 u"Layout"_s,
+                                 u"Help"_s,
+                                 u"Close"_s,
+                                 u"Filter By Selection"_s,
+                                 u"Filter Excluding Selection"_s,
+                                 u"Filter Expression ..."_s,
+                                 u"Remove Filter"_s,
+                                 u"Sort Ascending"_s,
+                                 u"Sort Descending"_s,
+                                 u"Sort Expression ..."_s,
+                                 u"Edit All"_s,
+                                 u"Aggregate"_s,
+                                 u"Go To Record ..."_s,
+                                 u"Undo"_s,
+                                 u"Copy"_s,
+                                 u"Paste"_s,
+                                 u"Statement ..."_s})
+        EXPECT_TRUE(entries.contains(entry)) << entry.toStdString();
+}
+
+TEST_F(TableView, OpensAPopupOfItsOwnInEachPresentationAfterAHold)
+{
+    const auto popupAfterHold = [this] {
+        QStringList entries;
+        QTimer::singleShot(600, [&entries] {
+            auto* popup = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+            ASSERT_TRUE(popup);
+            for (const QAction* entry : popup->actions())
+                entries += QString(entry->text()).remove(u'&');
+            popup->close();
+        });
+        QTest::mousePress(grid->viewport(), Qt::LeftButton, {}, grid->CellRect(1, 1).center());
+        QTest::qWait(800);
+        QTest::mouseRelease(grid->viewport(), Qt::LeftButton, {}, grid->CellRect(1, 1).center());
+        return entries;
+    };
+    const QStringList list = popupAfterHold();
+    EXPECT_TRUE(list.contains(u"Hide this Column"_s));
+    EXPECT_TRUE(list.contains(u"AutoSize All Columns"_s));
+    EXPECT_TRUE(list.contains(u"Filter Expression ..."_s));
+    QTest::keyClick(&view, Qt::Key_D, Qt::ControlModifier);
+    const QStringList detail = popupAfterHold();
+    EXPECT_TRUE(detail.contains(u"Aggregate"_s));
+    EXPECT_TRUE(detail.contains(u"Undo"_s));
+    EXPECT_FALSE(detail.contains(u"Hide this Column"_s));
 }
 
 TEST_F(TableView, ScrollsTheWholeResultWithItsBar)

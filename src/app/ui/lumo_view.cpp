@@ -91,13 +91,13 @@ CLumoView::CLumoView(MainViewState& state, ShellActions& actions, QWidget* paren
          {static_cast<QWidget*>(list_), static_cast<QWidget*>(emptyText_), static_cast<QWidget*>(welcome_)})
         pages_->addWidget(page);
 
-    QWidget* header = MakeHeader();
+    header_ = MakeHeader();
     buttonRow_ = MakeButtons();
     auto* lines = new QVBoxLayout(this);
     const int gap = style()->pixelMetric(QStyle::PM_LayoutVerticalSpacing, nullptr, this) / 2;
     lines->setContentsMargins(gap, gap, gap, gap);
     lines->setSpacing(gap);
-    lines->addWidget(header);
+    lines->addWidget(header_);
     lines->addWidget(tabs_);
     lines->addWidget(search_);
     lines->addWidget(pages_, 1);
@@ -195,6 +195,15 @@ void CLumoView::ShowState()
 void CLumoView::ShowRecent(const QStringList& paths)
 {
     welcome_->SetRecent(paths);
+}
+
+void CLumoView::SetLook(const ViewLook& look)
+{
+    setFont(look.font.value_or(QFont()));
+    DrawAsLine(*header_, look.line);
+    DrawAsList(*list_, look.lists);
+    DrawAsButtons(*buttonRow_, look.buttons);
+    FitButtons();
 }
 
 void CLumoView::ShowList()

@@ -2,6 +2,7 @@
 
 #include "app/main_view_state.h"
 #include "app/ui/shell_actions.h"
+#include "platform/ui/view_look.h"
 
 #include <QWidget>
 
@@ -29,6 +30,7 @@ public:
     // Shows the state as it is now. Whoever changes it calls this.
     void ShowState();
     void ShowRecent(const QStringList& paths);
+    void SetLook(const ViewLook& look);
 
 Q_SIGNALS:
     void RecentChosen(const QString& path);
@@ -56,6 +58,7 @@ private:
     EntryList* list_;
     QLabel* emptyText_;
     WelcomePage* welcome_;
+    QWidget* header_;
     QWidget* buttonRow_;
     std::vector<QToolButton*> buttons_;
 };

@@ -2,6 +2,7 @@
 
 #include "app/table_view_options.h"
 #include "app/ui/about_box.h"
+#include "app/ui/display_look.h"
 #include "app/ui/keys_dialog.h"
 #include "app/ui/lumo_view.h"
 #include "app/ui/shell_actions.h"
@@ -21,6 +22,7 @@
 #include <QUrl>
 
 #include <algorithm>
+#include <array>
 
 namespace mirel {
 namespace {
@@ -29,9 +31,25 @@ using namespace Qt::StringLiterals;
 
 const QString kFramePlace = u"frame"_s;
 const QString kTablePlace = u"table"_s;
+const QString kWidthsSection = u"Columns"_s;
 constexpr QSize kFrameFirstSize(760, 560);
 constexpr QSize kTableFirstSize(960, 620);
 constexpr QSize kSmallestSize(160, 160);
+
+struct LookCommand {
+    ShellCommand command;
+    LookItem item;
+};
+constexpr std::array kLookItems = {
+    LookCommand{ShellCommand::Font, LookItem::Font},
+    LookCommand{ShellCommand::BackgroundColor, LookItem::LineBackground},
+    LookCommand{ShellCommand::ListBackgroundColor, LookItem::ListBackground},
+    LookCommand{ShellCommand::ButtonBackgroundColor, LookItem::ButtonBackground},
+    LookCommand{ShellCommand::DatabaseTextColor, LookItem::LineText},
+    LookCommand{ShellCommand::ListTextColor, LookItem::ListText},
+    LookCommand{ShellCommand::ButtonTextColor, LookItem::ButtonText},
+    LookCommand{ShellCommand::ResetLayout, LookItem::Reset},
+};
 
 // The one database file that is dragged; empty when it is anything else.
 QString DraggedDatabase(const QMimeData* data)
@@ -64,6 +82,7 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     connect(view_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
     RestorePlace(*this, profile, kFramePlace, kFrameFirstSize);
     ShowState();
+    ShowLook();
     view_->setFocus();
 }
 
@@ -176,12 +195,30 @@ void CMainFrame::Run(ShellCommand id)
     case ShellCommand::DatabaseTextColor:
     case ShellCommand::ListTextColor:
     case ShellCommand::ButtonTextColor:
+    case ShellCommand::ResetLayout:
+        ChooseLayout(id);
+        return;
     case ShellCommand::ImportCsv:
     case ShellCommand::Help:
     case ShellCommand::Edit:
         return; // disabled: not built yet
     }
     ShowState();
+}
+
+void CMainFrame::ChooseLayout(ShellCommand id)
+{
+    const auto row = std::ranges::find(kLookItems, id, &LookCommand::command);
+    DisplayChoice choice(settings_, DisplayView::Main);
+    if (ChooseLook(choice, row->item, *view_))
+        ShowLook();
+}
+
+void CMainFrame::ShowLook()
+{
+    view_->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Main)));
+    for (CTableView* table : Tables())
+        table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
 }
 
 QWidget* CMainFrame::OpenTable(const TableRequest& request)
@@ -206,6 +243,13 @@ QWidget* CMainFrame::OpenTable(const TableRequest& request)
         commands_.Refill();
         ShowState();
     });
+    table->SetWidthsByHand(ReadColumnWidths(profile_.ReadText(kWidthsSection, WidthsKey(request.statement), {})));
+    table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
+    connect(table, &CTableView::lookRequested, this, [this, table](LookItem item) {
+        DisplayChoice choice(settings_, DisplayView::Table);
+        if (ChooseLook(choice, item, *table))
+            ShowLook();
+    });
     connect(table, &CTableView::settingsChanged, this,
             [this](const TableViewSettings& options) { WriteTableViewSettings(settings_, options); });
     if (IsHandheldSize(size())) {
@@ -222,11 +266,28 @@ QWidget* CMainFrame::OpenTable(const TableRequest& request)
 bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
 {
     if (event->type() == QEvent::Close) {
-        const auto* table = qobject_cast<CTableView*>(watched);
-        if (table && !IsHandheldSize(table->size()))
-            KeepPlace(*table, profile_, kTablePlace);
+        if (const auto* table = qobject_cast<CTableView*>(watched)) {
+            KeepWidths(*table);
+            if (!IsHandheldSize(table->size()))
+                KeepPlace(*table, profile_, kTablePlace);
+        }
     }
     return QMainWindow::eventFilter(watched, event);
+}
+
+// By the file's name and what was opened of it: a copy of a database looks as the first one does.
+QString CMainFrame::WidthsKey(const QString& statement) const
+{
+    const QString place = state_.DatabaseName() + u':' + statement;
+    return QString::fromLatin1(QUrl::toPercentEncoding(place));
+}
+
+void CMainFrame::KeepWidths(const CTableView& table)
+{
+    const QString key = WidthsKey(table.Browser().BaseStatement());
+    const QString text = ColumnWidthsText(table.WidthsByHand());
+    if (profile_.ReadText(kWidthsSection, key, {}) != text)
+        profile_.WriteText(kWidthsSection, key, text);
 }
 
 QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)

@@ -40,6 +40,10 @@ private:
     void MakeMenus();
     void FillRecentMenu();
     void Run(ShellCommand id);
+    void ChooseLayout(ShellCommand id);
+    void ShowLook();
+    QString WidthsKey(const QString& statement) const;
+    void KeepWidths(const CTableView& table);
     QString ChooseDatabase(Str title, Str accept, FileUse use);
     void ChooseAndOpenDatabase();
     void ChooseAndCreateDatabase();

@@ -1,6 +1,7 @@
 #include "tableview/ui/cell_strip.h"
 
 #include "platform/ole_date.h"
+#include "platform/ui/hold_popup.h"
 #include "platform/user_locale.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
@@ -66,9 +67,11 @@ CellStrip::CellStrip(const RecordBrowser& browser, QWidget* parent)
     zoom_->setToolTip(StringText(Str::ZoomTip));
     zoom_->setFocusPolicy(Qt::TabFocus);
     line_->installEventFilter(this);
+    new HoldPopup(line_, [this] { return browser_.Settings().holdTimeMs; });
     check_->installEventFilter(this);
     connect(line_, &QLineEdit::textEdited, this, &CellStrip::textEdited);
-    connect(check_, &QCheckBox::clicked, this, &CellStrip::checkEdited);
+    // Of a box without a value the first tap makes a tick.
+    connect(check_, &QCheckBox::clicked, this, [this] { Q_EMIT checkEdited(!browser_.Edit().IsChecked()); });
     connect(calendarButton_, &QToolButton::clicked, this, &CellStrip::ShowCalendar);
     connect(zoom_, &QToolButton::clicked, this, [this] { Q_EMIT commandRequested(TableCommand::Zoom); });
     LayOut();
@@ -104,8 +107,8 @@ void CellStrip::ShowState(bool zoomed)
     calendarButton_->setEnabled(browser_.CanEdit());
     check_->setVisible(isCheck);
     check_->setEnabled(browser_.CanEdit());
-    check_->setChecked(edit.IsChecked());
-    check_->setText(browser_.SelectedText());
+    check_->setCheckState(edit.IsUnset() ? Qt::PartiallyChecked : edit.IsChecked() ? Qt::Checked : Qt::Unchecked);
+    check_->setText(edit.IsUnset() ? StringText(Str::CellHasNoValue) : browser_.SelectedText());
     if (line_->text() != edit.Text())
         line_->setText(edit.Text());
     if (!edit.IsPending() && !line_->hasFocus())

@@ -126,7 +126,7 @@ void GridHeader::mouseMoveEvent(QMouseEvent* event)
     const int x = event->position().toPoint().x() + offsetPx_;
     if (draggedEdge_ >= 0) {
         layout_.SetByHand(draggedEdge_, dragWidthPx_ + x - dragFromPx_);
-        Q_EMIT widthsChanged();
+        Q_EMIT widthChanged(draggedEdge_);
         return;
     }
     setCursor(layout_.EdgeNear(x, kEdgeReachPx) >= 0 ? Qt::SplitHCursor : Qt::ArrowCursor);

@@ -29,7 +29,7 @@ public:
 Q_SIGNALS:
     void columnTapped(int column);
     void edgeDoubleTapped(int column);
-    void widthsChanged();
+    void widthChanged(int column);
 
 protected:
     void paintEvent(QPaintEvent* event) override;

@@ -61,7 +61,8 @@ RecordGrid::RecordGrid(const RecordBrowser& browser, QWidget* parent)
     });
     connect(header_, &GridHeader::columnTapped, this, &RecordGrid::headerTapped);
     connect(header_, &GridHeader::edgeDoubleTapped, this, &RecordGrid::FitColumn);
-    connect(header_, &GridHeader::widthsChanged, this, [this] {
+    connect(header_, &GridHeader::widthChanged, this, [this](int column) {
+        KeepWidth(column);
         UpdateScrollBars();
         header_->update();
         viewport()->update();
@@ -119,6 +120,8 @@ void RecordGrid::ShowState()
         shownPage_ = browser_.PageRevision();
         if (browser_.Settings().autoSizing || otherColumns)
             FitToContent(otherColumns);
+        if (otherColumns)
+            TakeUpWidths();
     }
     const RecordBrowser::ColumnSort sort = browser_.CurrentSort();
     header_->SetArrow(sort.field, sort.direction == SortDirection::Ascending ? GridHeader::Arrow::Ascending
@@ -130,8 +133,36 @@ void RecordGrid::ShowState()
     viewport()->update();
 }
 
+void RecordGrid::SetWidthsByHand(const ColumnWidths& widths)
+{
+    widthsByHand_ = widths;
+    TakeUpWidths();
+    UpdateScrollBars();
+    header_->update();
+    viewport()->update();
+}
+
+void RecordGrid::TakeUpWidths()
+{
+    if (browser_.CurrentPresentation() == Presentation::Detail)
+        return;
+    for (int column = 0; column < layout_.Count(); ++column) {
+        const auto width = widthsByHand_.constFind(browser_.Page().columns[size_t(column)].title);
+        if (width != widthsByHand_.constEnd())
+            layout_.SetByHand(column, *width);
+    }
+}
+
+void RecordGrid::KeepWidth(int column)
+{
+    if (browser_.CurrentPresentation() == Presentation::List)
+        widthsByHand_.insert(browser_.Page().columns[size_t(column)].title, layout_.WidthPx(column));
+}
+
 void RecordGrid::FitAllColumns()
 {
+    if (browser_.CurrentPresentation() == Presentation::List)
+        widthsByHand_.clear();
     FitToContent(true);
     UpdateScrollBars();
     header_->update();
@@ -142,6 +173,8 @@ void RecordGrid::FitColumn(int column)
 {
     if (column < 0 || column >= layout_.Count())
         return;
+    if (browser_.CurrentPresentation() == Presentation::List)
+        widthsByHand_.remove(browser_.Page().columns[size_t(column)].title);
     layout_.Fit(column, ContentWidth(column));
     UpdateScrollBars();
     header_->update();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "tableview/column_layout.h"
+#include "tableview/column_widths.h"
 #include "tableview/record_browser.h"
 #include "tableview/ui/line_painter.h"
 #include "tableview/ui/table_command.h"
@@ -29,6 +30,9 @@ public:
     void ShowState();
     void FitAllColumns();
     void FitColumn(int column);
+    // Widths set by hand outlive other filters, orders and hidden columns.
+    const ColumnWidths& WidthsByHand() const { return widthsByHand_; }
+    void SetWidthsByHand(const ColumnWidths& widths);
     QRect CellRect(int row, int column) const; // in the viewport
 
     QSize minimumSizeHint() const override;
@@ -67,6 +71,8 @@ private:
     void FitToContent(bool alsoByHand);
     int ContentWidth(int column) const;
     void FitDetail();
+    void KeepWidth(int column);
+    void TakeUpWidths();
     void UpdateScrollBars();
     void ScrollToSelectedColumn();
     int RowAt(int y) const { return rowHeightPx_ > 0 ? y / rowHeightPx_ : -1; }
@@ -84,6 +90,7 @@ private:
 
     const RecordBrowser& browser_;
     ColumnLayout layout_;
+    ColumnWidths widthsByHand_;
     GridHeader* header_;
     std::optional<LinePainter> text_; // for the widget's font
     int rowHeightPx_ = 0;

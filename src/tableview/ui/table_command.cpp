@@ -69,6 +69,10 @@ constexpr std::array kKeys = {
     KeyRow{Qt::CTRL | Qt::Key_C, InWindow, TableCommand::Copy},
     KeyRow{Qt::CTRL | Qt::SHIFT | Qt::Key_C, InWindow, TableCommand::CopyWithNames},
     KeyRow{Qt::CTRL | Qt::Key_V, InWindow, TableCommand::Paste},
+    KeyRow{Qt::CTRL | Qt::Key_F, InWindow, TableCommand::Find},
+    KeyRow{Qt::Key_F3, InWindow, TableCommand::FindNext},
+    KeyRow{Qt::SHIFT | Qt::Key_F3, InWindow, TableCommand::FindPrevious},
+    KeyRow{Qt::CTRL | Qt::Key_Slash, InWindow, TableCommand::Keys},
     KeyRow{Qt::CTRL | Qt::Key_W, InWindow, TableCommand::Close},
 };
 
@@ -113,6 +117,20 @@ constexpr std::array kActions = {
     ActionRow{TableCommand::ExportCsv, Str::ActionExportCsv, Str::ActionExportCsvTip, nullptr},
     ActionRow{TableCommand::Layout, Str::ActionLayout, Str::ActionLayoutTip, nullptr},
     ActionRow{TableCommand::Help, Str::ActionHelp, Str::ActionHelpTip, nullptr},
+    ActionRow{TableCommand::Find, Str::ActionFind, Str::ActionFindTip, u"edit-find"},
+    ActionRow{TableCommand::FindNext, Str::ActionFindNext, Str::ActionFindNextTip, u"go-down"},
+    ActionRow{TableCommand::FindPrevious, Str::ActionFindPrevious, Str::ActionFindPreviousTip, u"go-up"},
+    ActionRow{TableCommand::Statement, Str::ActionStatement, Str::ActionStatementTip, nullptr},
+    ActionRow{TableCommand::Keys, Str::CommandKeys, Str::TipKeys, nullptr},
+    ActionRow{TableCommand::FitAllNow, Str::ActionFitAllNow, Str::ActionFitAllTip, nullptr},
+    ActionRow{TableCommand::LayoutFont, Str::CommandFont, Str::TipFont, u"preferences-desktop-font"},
+    ActionRow{TableCommand::LayoutBackground, Str::CommandBackgroundColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutListBackground, Str::CommandListBackgroundColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutButtonBackground, Str::CommandButtonBackgroundColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutText, Str::LayoutTextColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutListText, Str::CommandListTextColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutButtonText, Str::CommandButtonTextColor, Str::TipColor, nullptr},
+    ActionRow{TableCommand::LayoutReset, Str::LayoutReset, Str::LayoutResetTip, nullptr},
     ActionRow{TableCommand::Undo, Str::ActionUndo, Str::ActionUndoTip, u"edit-undo"},
     ActionRow{TableCommand::CopyWithNames, Str::ActionCopyWithNames, Str::ActionCopyWithNamesTip, nullptr},
     ActionRow{TableCommand::SelectAll, Str::ActionSelectAll, Str::ActionSelectAllTip, nullptr},
@@ -125,9 +143,56 @@ constexpr std::array kActions = {
     ActionRow{TableCommand::Close, Str::ActionClose, Str::ActionCloseTip, nullptr},
 };
 
+// What the keys do that no menu shows.
+struct KeyText {
+    TableCommand command;
+    Str what;
+};
+constexpr std::array kKeyTexts = {
+    KeyText{TableCommand::RowUp, Str::KeyRowUp},
+    KeyText{TableCommand::RowDown, Str::KeyRowDown},
+    KeyText{TableCommand::PageUp, Str::KeyPageUp},
+    KeyText{TableCommand::PageDown, Str::KeyPageDown},
+    KeyText{TableCommand::ColumnLeft, Str::KeyColumnLeft},
+    KeyText{TableCommand::ColumnRight, Str::KeyColumnRight},
+    KeyText{TableCommand::FirstColumn, Str::KeyFirstColumn},
+    KeyText{TableCommand::LastColumn, Str::KeyLastColumn},
+    KeyText{TableCommand::ExtendUp, Str::KeyExtend},
+    KeyText{TableCommand::ExtendDown, Str::KeyExtend},
+    KeyText{TableCommand::ExtendPageUp, Str::KeyExtend},
+    KeyText{TableCommand::ExtendPageDown, Str::KeyExtend},
+    KeyText{TableCommand::ExtendLeft, Str::KeyExtend},
+    KeyText{TableCommand::ExtendRight, Str::KeyExtend},
+    KeyText{TableCommand::ExtendToFirstColumn, Str::KeyExtend},
+    KeyText{TableCommand::ExtendToLastColumn, Str::KeyExtend},
+    KeyText{TableCommand::ExtendToFirst, Str::KeyExtend},
+    KeyText{TableCommand::ExtendToLast, Str::KeyExtend},
+    KeyText{TableCommand::NextCell, Str::KeyNextCell},
+    KeyText{TableCommand::PreviousCell, Str::KeyPreviousCell},
+    KeyText{TableCommand::EditCell, Str::KeyEditCell},
+    KeyText{TableCommand::RevertEdit, Str::KeyRevertEdit},
+    KeyText{TableCommand::ClearCell, Str::KeyClearCell},
+};
+
+Str TextOfCommand(TableCommand command)
+{
+    const auto action = std::ranges::find(kActions, command, &ActionRow::command);
+    return action != kActions.end() ? action->text
+                                    : std::ranges::find(kKeyTexts, command, &KeyText::command)->what;
+}
+
+constexpr bool EveryKeySaysWhatItDoes()
+{
+    return std::ranges::all_of(kKeys, [](const KeyRow& key) {
+        return std::ranges::any_of(kActions, [&](const ActionRow& row) { return row.command == key.command; }) ||
+               std::ranges::any_of(kKeyTexts, [&](const KeyText& row) { return row.command == key.command; });
+    });
+}
+static_assert(EveryKeySaysWhatItDoes());
+
 constexpr MenuEntry kLine = std::nullopt;
 
-constexpr std::array<MenuEntry, 16> kFileMenu = {TableCommand::InsertDateTime,
+constexpr std::array<MenuEntry, 18> kFileMenu = {TableCommand::InsertDateTime,
                                                  TableCommand::RepeatAbove,
                                                  TableCommand::Zoom,
                                                  kLine,
@@ -137,16 +202,19 @@ constexpr std::array<MenuEntry, 16> kFileMenu = {TableCommand::InsertDateTime,
                                                  TableCommand::ExportCsv,
                                                  kLine,
                                                  TableCommand::RunAgain,
+                                                 TableCommand::Statement,
                                                  TableCommand::FitAllColumns,
                                                  TableCommand::Options,
                                                  TableCommand::Layout,
                                                  TableCommand::Help,
+                                                 TableCommand::Keys,
                                                  kLine,
                                                  TableCommand::Close};
-constexpr std::array<MenuEntry, 9> kEditMenu = {
-    TableCommand::Undo,         kLine, TableCommand::Copy,      TableCommand::CopyWithNames,
-    TableCommand::Paste,        kLine, TableCommand::SelectAll, TableCommand::SelectRecords,
-    TableCommand::SelectColumns};
+constexpr std::array<MenuEntry, 13> kEditMenu = {
+    TableCommand::Undo,          kLine, TableCommand::Copy,      TableCommand::CopyWithNames,
+    TableCommand::Paste,         kLine, TableCommand::SelectAll, TableCommand::SelectRecords,
+    TableCommand::SelectColumns, kLine, TableCommand::Find,      TableCommand::FindNext,
+    TableCommand::FindPrevious};
 constexpr std::array<MenuEntry, 17> kToolsMenu = {TableCommand::NewRecord,
                                                   TableCommand::DeleteRecord,
                                                   TableCommand::ToggleDetail,
@@ -164,21 +232,42 @@ constexpr std::array<MenuEntry, 17> kToolsMenu = {TableCommand::NewRecord,
                                                   TableCommand::Aggregate,
                                                   kLine,
                                                   TableCommand::GoToRecord};
-constexpr std::array<MenuEntry, 14> kPopupMenu = {TableCommand::FilterBySelection,
+constexpr std::array<MenuEntry, 16> kGridPopup = {TableCommand::FilterBySelection,
                                                   TableCommand::FilterExcluding,
+                                                  TableCommand::FilterExpression,
                                                   TableCommand::RemoveFilter,
                                                   kLine,
                                                   TableCommand::SortAscending,
                                                   TableCommand::SortDescending,
+                                                  TableCommand::SortExpression,
                                                   kLine,
                                                   TableCommand::HideColumn,
                                                   TableCommand::ShowAllColumns,
                                                   TableCommand::FitColumn,
-                                                  TableCommand::FitAllColumns,
+                                                  TableCommand::FitAllNow,
                                                   kLine,
                                                   TableCommand::Copy,
                                                   TableCommand::Paste};
-
+constexpr std::array<MenuEntry, 14> kDetailPopup = {TableCommand::FilterBySelection,
+                                                    TableCommand::FilterExcluding,
+                                                    TableCommand::FilterExpression,
+                                                    TableCommand::RemoveFilter,
+                                                    kLine,
+                                                    TableCommand::SortAscending,
+                                                    TableCommand::SortDescending,
+                                                    TableCommand::SortExpression,
+                                                    kLine,
+                                                    TableCommand::Aggregate,
+                                                    kLine,
+                                                    TableCommand::Undo,
+                                                    TableCommand::Copy,
+                                                    TableCommand::Paste};
+constexpr std::array<MenuEntry, 9> kLayoutMenu = {
+    TableCommand::LayoutFont,           TableCommand::LayoutBackground,
+    TableCommand::LayoutListBackground, TableCommand::LayoutButtonBackground,
+    TableCommand::LayoutText,           TableCommand::LayoutListText,
+    TableCommand::LayoutButtonText,     kLine,
+    TableCommand::LayoutReset};
 constexpr std::array<MenuEntry, 2> kEditAllMenu = {TableCommand::DeleteAll, TableCommand::UpdateAll};
 constexpr std::array<MenuEntry, 4> kAggregateMenu = {TableCommand::Sum, TableCommand::Max, TableCommand::Min,
                                                      TableCommand::Avg};
@@ -192,6 +281,23 @@ std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys)
     const auto row = std::ranges::find_if(
         kKeys, [&](const KeyRow& candidate) { return candidate.keys == keys && (candidate.places & bit) != 0; });
     return row == kKeys.end() ? std::nullopt : std::optional(row->command);
+}
+
+QList<KeyLine> KeyList()
+{
+    QList<KeyLine> lines;
+    for (const KeyRow& row : kKeys) {
+        const Str what = TextOfCommand(row.command);
+        auto line = std::ranges::find(lines, what, &KeyLine::what);
+        if (line == lines.end())
+            line = lines.insert(lines.end(), {{}, what});
+        // Shift and Tab come as a key of their own, and the key pad has a second Return.
+        const bool isBackTab = row.keys.key() == Qt::Key_Backtab;
+        const QKeyCombination keys = isBackTab ? Qt::SHIFT | Qt::Key_Tab : row.keys;
+        if (keys.key() != Qt::Key_Enter && !line->keys.contains(keys))
+            line->keys += keys;
+    }
+    return lines;
 }
 
 QKeyCombination ShortcutOf(TableCommand command)
@@ -227,9 +333,14 @@ std::span<const MenuEntry> ToolsMenu()
     return kToolsMenu;
 }
 
-std::span<const MenuEntry> PopupMenu()
+std::span<const MenuEntry> GridPopup()
 {
-    return kPopupMenu;
+    return kGridPopup;
+}
+
+std::span<const MenuEntry> DetailPopup()
+{
+    return kDetailPopup;
 }
 
 std::span<const MenuEntry> SubmenuOf(TableCommand command)
@@ -238,6 +349,8 @@ std::span<const MenuEntry> SubmenuOf(TableCommand command)
         return kEditAllMenu;
     if (command == TableCommand::Aggregate)
         return kAggregateMenu;
+    if (command == TableCommand::Layout)
+        return kLayoutMenu;
     return {};
 }
 

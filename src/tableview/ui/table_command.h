@@ -3,6 +3,7 @@
 #include "resources/string_id.h"
 
 #include <QKeyCombination>
+#include <QList>
 
 #include <optional>
 #include <span>
@@ -53,6 +54,9 @@ enum class TableCommand {
     Copy,
     CopyWithNames,
     Paste,
+    Find,
+    FindNext,
+    FindPrevious,
     FilterBySelection,
     FilterExcluding,
     RemoveFilter,
@@ -71,14 +75,25 @@ enum class TableCommand {
     OpenQuery,
     SaveQuery,
     ExportCsv,
+    Layout, // a menu of its own, too
+    LayoutFont,
+    LayoutBackground,
+    LayoutListBackground,
+    LayoutButtonBackground,
+    LayoutText,
+    LayoutListText,
+    LayoutButtonText,
+    LayoutReset,
     // Not built yet: their menu entries are there, disabled, and say what they will do.
     NewQuery,
-    Layout,
     Help,
     FitColumn,
     FitAllColumns,
     HideColumn,
     ShowAllColumns,
+    FitAllNow, // as FitAllColumns, under the name that the popup menu has for it
+    Statement,
+    Keys,
     NextPane,
     Options,
     Close,
@@ -88,6 +103,13 @@ enum class KeyPlace { Grid, Editor };
 
 // The command of a key where the grid, or the editor of a cell, has the focus; none: the key is theirs.
 std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys);
+
+// Every key with what it does, for the list of keys; keys that do the same stand together.
+struct KeyLine {
+    QList<QKeyCombination> keys;
+    Str what;
+};
+QList<KeyLine> KeyList();
 
 // The key that stands beside the command's menu entry; a key of 0: it has none.
 QKeyCombination ShortcutOf(TableCommand command);
@@ -108,7 +130,8 @@ using MenuEntry = std::optional<TableCommand>;
 std::span<const MenuEntry> FileMenu();
 std::span<const MenuEntry> EditMenu();
 std::span<const MenuEntry> ToolsMenu();
-std::span<const MenuEntry> PopupMenu(); // on the grid
+std::span<const MenuEntry> GridPopup();
+std::span<const MenuEntry> DetailPopup(); // on the fields of a single record
 // The menu behind an entry; empty for one that is a command itself.
 std::span<const MenuEntry> SubmenuOf(TableCommand command);
 

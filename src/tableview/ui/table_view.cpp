@@ -1,9 +1,11 @@
 #include "tableview/ui/table_view.h"
 
+#include "platform/ui/hold_popup.h"
 #include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/filter_chip.h"
+#include "tableview/ui/find_line.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/result_commands.h"
@@ -39,6 +41,8 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
 {
     CreateActions();
     chip_ = new FilterChip(ActionOf(Command::RemoveFilter), this);
+    findLine_ = new FindLine(
+        browser_, {.next = ActionOf(Command::FindNext), .previous = ActionOf(Command::FindPrevious)}, this);
     navigation_ = new NavigationRow({.first = ActionOf(Command::First),
                                      .previous = ActionOf(Command::Previous),
                                      .goTo = ActionOf(Command::GoToRecord),
@@ -63,6 +67,7 @@ void CTableView::LayOut()
     auto* column = new QVBoxLayout(center);
     column->setContentsMargins(0, 0, 0, 0);
     column->addWidget(stack_, 1);
+    column->addWidget(findLine_);
     column->addWidget(chip_);
     column->addWidget(strip_);
     column->addWidget(navigation_);
@@ -71,6 +76,7 @@ void CTableView::LayOut()
     grid_->setFrameShape(QFrame::NoFrame);
     zoomEdit_->setTabChangesFocus(true);
     zoomEdit_->installEventFilter(this);
+    new HoldPopup(zoomEdit_->viewport(), [this] { return browser_.Settings().holdTimeMs; });
     grid_->setAccessibleName(StringText(Str::GridName));
     setCentralWidget(center);
     setContextMenuPolicy(Qt::NoContextMenu);
@@ -106,6 +112,8 @@ void CTableView::ConnectParts()
         browser_.EditChecked(checked);
         ShowState();
     });
+    connect(findLine_, &FindLine::moved, this, [this] { Settle(!browser_.WriteFailed()); });
+    connect(findLine_, &FindLine::closed, stack_, [this] { stack_->currentWidget()->setFocus(); });
     connect(zoomEdit_, &QPlainTextEdit::textChanged, this, [this] {
         if (showing_)
             return;
@@ -147,6 +155,29 @@ bool CTableView::OpenStatement(const QString& title, const QString& statement)
     SetTitle(title);
     const WaitCursor waiting;
     return Settle(browser_.Open(statement));
+}
+
+void CTableView::SetLook(const ViewLook& look)
+{
+    for (QWidget* part : {static_cast<QWidget*>(grid_), static_cast<QWidget*>(zoomEdit_),
+                          static_cast<QWidget*>(strip_), static_cast<QWidget*>(findLine_)})
+        part->setFont(look.font.value_or(QFont()));
+    DrawAsList(*grid_, look.lists);
+    DrawAsList(*zoomEdit_, look.lists);
+    DrawAsLine(*strip_, look.line);
+    DrawAsButtons(*navigation_, look.buttons);
+    navigation_->setAutoFillBackground(look.buttons.background.has_value()); // its buttons have no ground
+    ShowState();
+}
+
+ColumnWidths CTableView::WidthsByHand() const
+{
+    return grid_->WidthsByHand();
+}
+
+void CTableView::SetWidthsByHand(const ColumnWidths& widths)
+{
+    grid_->SetWidthsByHand(widths);
 }
 
 // --- showing ------------------------------------------------------------------------------------------------

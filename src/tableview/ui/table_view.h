@@ -1,6 +1,8 @@
 #pragma once
 
+#include "platform/ui/view_look.h"
 #include "tableview/block_commands.h"
+#include "tableview/column_widths.h"
 #include "tableview/record_browser.h"
 #include "tableview/ui/table_command.h"
 
@@ -17,6 +19,7 @@ namespace mirel {
 
 class CellStrip;
 class FilterChip;
+class FindLine;
 class FormStore;
 class NavigationRow;
 class RecordGrid;
@@ -44,7 +47,13 @@ public:
 
     const RecordBrowser& Browser() const { return browser_; }
 
+    void SetLook(const ViewLook& look);
+    ColumnWidths WidthsByHand() const;
+    void SetWidthsByHand(const ColumnWidths& widths);
+
 Q_SIGNALS:
+    // The user wants to change that of the look; whoever keeps it answers with SetLook.
+    void lookRequested(mirel::LookItem item);
     // The user has confirmed other options; they are in force already.
     void settingsChanged(const TableViewSettings& settings);
     void queriesChanged(); // of the store
@@ -80,6 +89,8 @@ private:
     void FocusNextPane();
     void ToggleZoom();
     void ShowPopup(const QPoint& globalPosition);
+    void ShowStatement();
+    void ShowKeys();
     QAction* ActionOf(TableCommand command) const { return actions_.value(command); }
 
     RecordBrowser browser_;
@@ -92,6 +103,7 @@ private:
     RecordGrid* grid_;
     QPlainTextEdit* zoomEdit_;
     CellStrip* strip_;
+    FindLine* findLine_ = nullptr;
     FilterChip* chip_ = nullptr;
     NavigationRow* navigation_ = nullptr;
     QTimer countTimer_;

@@ -3,6 +3,7 @@
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 #include "tableview/ui/cell_strip.h"
+#include "tableview/ui/find_line.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/result_commands.h"
 #include "tableview/ui/table_view.h"
@@ -95,6 +96,21 @@ constexpr std::array kBrowserCalls = {
     BrowserCall{Command::ShowAllColumns, [](RecordBrowser& b) { return b.ShowAllColumns(); }},
 };
 
+struct LookCommand {
+    Command command;
+    LookItem item;
+};
+constexpr std::array kLookItems = {
+    LookCommand{Command::LayoutFont, LookItem::Font},
+    LookCommand{Command::LayoutBackground, LookItem::LineBackground},
+    LookCommand{Command::LayoutListBackground, LookItem::ListBackground},
+    LookCommand{Command::LayoutButtonBackground, LookItem::ButtonBackground},
+    LookCommand{Command::LayoutText, LookItem::LineText},
+    LookCommand{Command::LayoutListText, LookItem::ListText},
+    LookCommand{Command::LayoutButtonText, LookItem::ButtonText},
+    LookCommand{Command::LayoutReset, LookItem::Reset},
+};
+
 } // namespace
 
 void CTableView::CreateActions()
@@ -146,7 +162,8 @@ void CTableView::ShowPopup(const QPoint& globalPosition)
     if (!Settle(browser_.WriteEdit()))
         return;
     QMenu popup(this);
-    FillMenu(&popup, PopupMenu());
+    const bool list = browser_.CurrentPresentation() == Presentation::List;
+    FillMenu(&popup, list ? GridPopup() : DetailPopup());
     popup.exec(globalPosition);
 }
 
@@ -155,8 +172,9 @@ void CTableView::ShowActions()
     const bool hasRecord = browser_.SelectedRecord() >= 0;
     for (const TableCommand command :
          {Command::First, Command::Previous, Command::Next, Command::Last, Command::GoToRecord, Command::Copy,
-          Command::CopyWithNames, Command::FitColumn, Command::FitAllColumns, Command::FilterBySelection,
-          Command::FilterExcluding, Command::SortAscending, Command::SortDescending})
+          Command::CopyWithNames, Command::Find, Command::FindNext, Command::FindPrevious, Command::FitColumn,
+          Command::FitAllColumns, Command::FitAllNow, Command::FilterBySelection, Command::FilterExcluding,
+          Command::SortAscending, Command::SortDescending})
         ActionOf(command)->setEnabled(hasRecord);
     for (const TableCommand command :
          {Command::FilterExpression, Command::SortExpression, Command::EditAll, Command::DeleteAll,
@@ -164,6 +182,7 @@ void CTableView::ShowActions()
           Command::OpenQuery, Command::SaveQuery, Command::ExportCsv})
         ActionOf(command)->setEnabled(resultCommands_->CanDo(command));
     ActionOf(Command::RemoveFilter)->setEnabled(browser_.IsFiltered());
+    ActionOf(Command::Statement)->setEnabled(browser_.IsOpen());
     for (const TableCommand command : {Command::InsertDateTime, Command::RepeatAbove})
         ActionOf(command)->setEnabled(browser_.CanEdit());
     ActionOf(Command::Paste)->setEnabled(browser_.CanUpdate());
@@ -195,6 +214,12 @@ void CTableView::Do(TableCommand command)
             grid_->setFocus();
         return;
     }
+    const auto look = std::ranges::find(kLookItems, command, &LookCommand::command);
+    if (look != kLookItems.end()) {
+        if (Settle(browser_.WriteEdit()))
+            Q_EMIT lookRequested(look->item);
+        return;
+    }
     switch (command) {
     case Command::EditCell:
         return Edit(nullptr);
@@ -214,6 +239,17 @@ void CTableView::Do(TableCommand command)
         return Paste();
     case Command::FitColumn:
         return grid_->FitColumn(browser_.SelectedColumn());
+    case Command::Find:
+        return findLine_->Open();
+    case Command::FindNext:
+        return findLine_->FindAgain(QuickFind::Direction::Forward);
+    case Command::FindPrevious:
+        return findLine_->FindAgain(QuickFind::Direction::Backward);
+    case Command::Statement:
+        return ShowStatement();
+    case Command::Keys:
+        return ShowKeys();
+    case Command::FitAllNow:
     case Command::FitAllColumns:
         return grid_->FitAllColumns();
     case Command::NextPane:

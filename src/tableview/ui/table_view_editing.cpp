@@ -1,8 +1,12 @@
+#include "platform/ui/keys_dialog.h"
+#include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
+#include "tableview/ui/find_line.h"
 #include "tableview/ui/go_to_dialog.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/options_dialog.h"
 #include "tableview/ui/record_grid.h"
+#include "tableview/ui/statement_dialog.h"
 #include "tableview/ui/table_view.h"
 
 #include <QClipboard>
@@ -42,6 +46,8 @@ void CTableView::Edit(const QString* typed)
 
 void CTableView::Revert()
 {
+    if (!browser_.HasPendingEdit() && !browser_.HasBlock())
+        findLine_->hide();
     if (!browser_.HasPendingEdit())
         browser_.SelectBlock({});
     browser_.RevertEdit();
@@ -126,6 +132,23 @@ void CTableView::ChooseOptions()
         return;
     Settle(browser_.ChangeSettings(dialog.Chosen()));
     Q_EMIT settingsChanged(browser_.Settings());
+}
+
+void CTableView::ShowStatement()
+{
+    CStatementDialog(browser_.Statement(), this).exec();
+}
+
+void CTableView::ShowKeys()
+{
+    QList<KeyHint> rows;
+    for (const KeyLine& line : KeyList()) {
+        QStringList keys;
+        for (const QKeyCombination key : line.keys)
+            keys += QKeySequence(key).toString(QKeySequence::NativeText);
+        rows.push_back({keys.join(QStringLiteral(", ")), StringText(line.what)});
+    }
+    ShowKeyHints(*this, rows);
 }
 
 void CTableView::FocusNextPane()
