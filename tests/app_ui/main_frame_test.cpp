@@ -1,8 +1,10 @@
 #include "app/ui/main_frame.h"
 
+#include "app/display_choice.h"
 #include "app/ui/look.h"
 #include "support/printing.h"
 #include "support/scripted_prompt.h"
+#include "tableview/ui/record_grid.h"
 #include "tableview/ui/table_view.h"
 
 #include <gtest/gtest.h>
@@ -132,6 +134,23 @@ TEST_F(MainFrameTest, ClosingKeepsTheWindowsSizeForTheNextRun)
     EXPECT_TRUE(frame_.close());
     const CMainFrame next(session_, state_, commands_, settings_, profile_);
     EXPECT_EQ(next.size(), QSize(640, 480));
+}
+
+TEST_F(MainFrameTest, ATableKeepsTheWidthsSetByHandAndTheChosenColors)
+{
+    auto* first = qobject_cast<CTableView*>(OpenBirds());
+    ASSERT_TRUE(first);
+    first->SetWidthsByHand({{u"Name"_s, 222}});
+    EXPECT_TRUE(first->close());
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    DisplayChoice(settings_, DisplayView::Table).SetColor(ColorPart::Lists, ColorKind::Background, 0x0000FF);
+    const auto* again = qobject_cast<CTableView*>(OpenBirds());
+    ASSERT_TRUE(again);
+    EXPECT_EQ(again->WidthsByHand().value(u"Name"_s), 222);
+    const auto* grid = again->findChild<RecordGrid*>();
+    EXPECT_EQ(grid->CellRect(0, 0).width(), 222);
+    EXPECT_EQ(grid->palette().color(QPalette::Base), QColor(Qt::red));
+    EXPECT_EQ(grid->palette().color(QPalette::Text), QApplication::palette().color(QPalette::Text));
 }
 
 } // namespace

@@ -185,6 +185,10 @@ TEST_F(TableView, SelectsBlocksByKeyAndByMouse)
     EXPECT_EQ(browser.Block(), (CellBlock{0, 2, 0, 1})) << "from where it began";
     QTest::mousePress(grid->viewport(), Qt::RightButton, {}, from);
     EXPECT_TRUE(browser.HasBlock()) << "its popup menu is for all of it";
+    QTest::mousePress(grid->viewport(), Qt::LeftButton, {}, from);
+    EXPECT_TRUE(browser.HasBlock()) << "so is that of a hold";
+    QTest::mouseRelease(grid->viewport(), Qt::LeftButton, {}, from);
+    EXPECT_FALSE(browser.HasBlock());
     QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, from);
     EXPECT_FALSE(browser.HasBlock());
 }

@@ -5,39 +5,43 @@
 
 #include <QDialog>
 #include <QDialogButtonBox>
-#include <QHeaderView>
-#include <QTreeWidget>
+#include <QTextBrowser>
 #include <QVBoxLayout>
 
 namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+QString TableOf(const QList<KeyHint>& rows)
+{
+    QString html = u"<table width=\"100%\" cellpadding=\"3\">"_s;
+    for (const KeyHint& row : rows) {
+        QString what = row.what;
+        what.remove(u'&').remove(u" ..."_s);
+        html += u"<tr><td width=\"42%\"><b>%1</b></td><td>%2</td></tr>"_s.arg(row.keys.toHtmlEscaped(),
+                                                                              what.toHtmlEscaped());
+    }
+    return html + u"</table>"_s;
+}
+
+} // namespace
 
 void ShowKeyHints(QWidget& window, const QList<KeyHint>& rows)
 {
     QDialog dialog(&window);
     dialog.setWindowTitle(StringText(Str::KeysTitle));
-    auto* keys = new QTreeWidget(&dialog);
-    keys->setColumnCount(2);
-    keys->setHeaderHidden(true);
-    keys->setRootIsDecorated(false);
-    keys->setAlternatingRowColors(true);
-    keys->setWordWrap(true);
-    keys->setTextElideMode(Qt::ElideRight);
+    auto* keys = new QTextBrowser(&dialog);
+    keys->setHtml(TableOf(rows));
     keys->setAccessibleName(dialog.windowTitle());
-    for (const KeyHint& row : rows) {
-        QString what = row.what;
-        auto* item = new QTreeWidgetItem(keys, {row.keys, what.remove(u'&').remove(QStringLiteral(" ..."))});
-        item->setToolTip(0, row.keys);
-        item->setToolTip(1, what);
-    }
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Close, &dialog);
     QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
     auto* lines = new QVBoxLayout(&dialog);
     lines->addWidget(keys);
     lines->addWidget(buttons);
     const int line = dialog.fontMetrics().height();
-    dialog.resize(line * 34, line * 28);
+    dialog.resize(line * 34, line * 30);
     FillSmallWindow(dialog, window);
-    keys->header()->resizeSection(0, dialog.width() * 2 / 5);
     dialog.exec();
 }
 

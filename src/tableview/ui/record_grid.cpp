@@ -16,6 +16,7 @@
 #include <QStyleOption>
 
 #include <algorithm>
+#include <utility>
 
 namespace mirel {
 namespace {
@@ -392,10 +393,14 @@ void RecordGrid::mousePressEvent(QMouseEvent* event)
         return;
     const bool isLeft = event->button() == Qt::LeftButton;
     const CellPlace place{browser_.ScrollPosition() + cell->y(), cell->x()};
-    if (!isLeft && browser_.HasBlock() && browser_.Block().Contains(place))
+    const bool inBlock = browser_.HasBlock() && browser_.Block().Contains(place);
+    if (!isLeft && inBlock)
         return; // its menu is the block's
+    pressedInBlock_.reset();
     if (isLeft && event->modifiers() == Qt::ShiftModifier)
         Q_EMIT cellReached(cell->y(), cell->x());
+    else if (inBlock)
+        pressedInBlock_ = cell;
     else
         Q_EMIT cellPressed(cell->y(), cell->x());
     if (!isLeft)
@@ -415,8 +420,18 @@ void RecordGrid::mouseMoveEvent(QMouseEvent* event)
             return;
         hold_.stop();
     }
-    if (dragging_ && (event->buttons() & Qt::LeftButton))
-        DragTo(at);
+    if (!dragging_ || !(event->buttons() & Qt::LeftButton))
+        return;
+    EndBlockPressed();
+    DragTo(at);
+}
+
+void RecordGrid::EndBlockPressed()
+{
+    if (!pressedInBlock_)
+        return;
+    const QPoint cell = *std::exchange(pressedInBlock_, std::nullopt);
+    Q_EMIT cellPressed(cell.y(), cell.x());
 }
 
 void RecordGrid::DragTo(const QPoint& position)
@@ -453,6 +468,7 @@ void RecordGrid::mouseReleaseEvent(QMouseEvent*)
     hold_.stop();
     dragOn_.stop();
     dragging_ = false;
+    EndBlockPressed();
 }
 
 void RecordGrid::mouseDoubleClickEvent(QMouseEvent* event)
@@ -480,6 +496,7 @@ void RecordGrid::timerEvent(QTimerEvent* event)
     } else if (event->timerId() == hold_.timerId()) {
         hold_.stop();
         dragging_ = false;
+        pressedInBlock_.reset();
         Q_EMIT popupRequested(viewport()->mapToGlobal(pressedAt_));
     } else {
         QAbstractScrollArea::timerEvent(event);

@@ -79,6 +79,7 @@ private:
     // The cell there, in rows and columns of the page; empty: there is none.
     std::optional<QPoint> CellAt(const QPoint& position) const;
     bool PressCell(const QPoint& position); // false: there is none
+    void EndBlockPressed();
     void DragTo(const QPoint& position);
     void DragOnward();
 
@@ -101,6 +102,7 @@ private:
     bool syncing_ = false;
     QBasicTimer hold_;
     QPoint pressedAt_;
+    std::optional<QPoint> pressedInBlock_; // the cell: a hold opens the block's menu, all else ends the block
     bool dragging_ = false;
     QBasicTimer dragOn_; // while the mouse is dragged beyond the cells
     QPoint dragAt_;

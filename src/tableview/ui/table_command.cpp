@@ -192,9 +192,8 @@ static_assert(EveryKeySaysWhatItDoes());
 
 constexpr MenuEntry kLine = std::nullopt;
 
-constexpr std::array<MenuEntry, 18> kFileMenu = {TableCommand::InsertDateTime,
-                                                 TableCommand::RepeatAbove,
-                                                 TableCommand::Zoom,
+// No menu is longer than a screen of 320 pixels: Qt would make two columns of it.
+constexpr std::array<MenuEntry, 16> kFileMenu = {TableCommand::InsertDateTime,
                                                  kLine,
                                                  TableCommand::NewQuery,
                                                  TableCommand::OpenQuery,
@@ -210,11 +209,22 @@ constexpr std::array<MenuEntry, 18> kFileMenu = {TableCommand::InsertDateTime,
                                                  TableCommand::Keys,
                                                  kLine,
                                                  TableCommand::Close};
-constexpr std::array<MenuEntry, 13> kEditMenu = {
-    TableCommand::Undo,          kLine, TableCommand::Copy,      TableCommand::CopyWithNames,
-    TableCommand::Paste,         kLine, TableCommand::SelectAll, TableCommand::SelectRecords,
-    TableCommand::SelectColumns, kLine, TableCommand::Find,      TableCommand::FindNext,
-    TableCommand::FindPrevious};
+constexpr std::array<MenuEntry, 16> kEditMenu = {TableCommand::Undo,
+                                                 kLine,
+                                                 TableCommand::Copy,
+                                                 TableCommand::CopyWithNames,
+                                                 TableCommand::Paste,
+                                                 TableCommand::RepeatAbove,
+                                                 kLine,
+                                                 TableCommand::SelectAll,
+                                                 TableCommand::SelectRecords,
+                                                 TableCommand::SelectColumns,
+                                                 kLine,
+                                                 TableCommand::Find,
+                                                 TableCommand::FindNext,
+                                                 TableCommand::FindPrevious,
+                                                 kLine,
+                                                 TableCommand::Zoom};
 constexpr std::array<MenuEntry, 17> kToolsMenu = {TableCommand::NewRecord,
                                                   TableCommand::DeleteRecord,
                                                   TableCommand::ToggleDetail,
