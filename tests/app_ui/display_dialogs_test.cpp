@@ -82,9 +82,11 @@ TEST(ViewLook, NamesNoColorThatNobodyChose)
     dark.setColor(QPalette::Base, Qt::black);
     QApplication::setPalette(dark);
     QWidget widget;
-    DrawAsList(widget, {.background = QColor(Qt::yellow), .text = {}});
-    EXPECT_EQ(widget.palette().color(QPalette::Base).rgb(), QColor(Qt::yellow).rgb());
+    DrawAsList(widget, {.background = QColor(Qt::darkRed), .text = {}});
+    EXPECT_EQ(widget.palette().color(QPalette::Base).rgb(), QColor(Qt::darkRed).rgb());
     EXPECT_EQ(widget.palette().color(QPalette::Text).rgb(), QColor(Qt::cyan).rgb());
+    DrawAsList(widget, {.background = QColor(Qt::cyan), .text = {}});
+    EXPECT_EQ(widget.palette().color(QPalette::Text).rgb(), QColor(Qt::black).rgb()) << "cyan on cyan";
     DrawAsList(widget, {});
     EXPECT_EQ(widget.palette().color(QPalette::Base).rgb(), QColor(Qt::black).rgb());
     QApplication::setPalette(before);

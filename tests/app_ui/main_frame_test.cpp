@@ -143,13 +143,13 @@ TEST_F(MainFrameTest, ATableKeepsTheWidthsSetByHandAndTheChosenColors)
     first->SetWidthsByHand({{u"Name"_s, 222}});
     EXPECT_TRUE(first->close());
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-    DisplayChoice(settings_, DisplayView::Table).SetColor(ColorPart::Lists, ColorKind::Background, 0x0000FF);
+    DisplayChoice(settings_, DisplayView::Table).SetColor(ColorPart::Lists, ColorKind::Background, 0x00FFFF);
     const auto* again = qobject_cast<CTableView*>(OpenBirds());
     ASSERT_TRUE(again);
     EXPECT_EQ(again->WidthsByHand().value(u"Name"_s), 222);
     const auto* grid = again->findChild<RecordGrid*>();
     EXPECT_EQ(grid->CellRect(0, 0).width(), 222);
-    EXPECT_EQ(grid->palette().color(QPalette::Base), QColor(Qt::red));
+    EXPECT_EQ(grid->palette().color(QPalette::Base), QColor(Qt::yellow));
     EXPECT_EQ(grid->palette().color(QPalette::Text), QApplication::palette().color(QPalette::Text));
 }
 

@@ -199,7 +199,9 @@ void CLumoView::ShowRecent(const QStringList& paths)
 
 void CLumoView::SetLook(const ViewLook& look)
 {
-    setFont(look.font.value_or(QFont()));
+    // The tabs stay as they are: all four must fit.
+    for (QWidget* part : {header_, static_cast<QWidget*>(list_), static_cast<QWidget*>(emptyText_), buttonRow_})
+        part->setFont(look.font.value_or(QFont()));
     DrawAsLine(*header_, look.line);
     DrawAsList(*list_, look.lists);
     DrawAsButtons(*buttonRow_, look.buttons);

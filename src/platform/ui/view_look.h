@@ -38,7 +38,8 @@ enum class LookItem {
     Reset, // all of it
 };
 
-// Draws a widget and what it holds in these colours, and the desktop's for those that are not chosen.
+// Draws a widget and what it holds in these colours, and the desktop's for those that are not chosen. A text that
+// could not be read on a chosen background becomes black or white.
 void DrawAsLine(QWidget& widget, const ViewLook::Colors& colors);
 void DrawAsList(QWidget& widget, const ViewLook::Colors& colors);
 void DrawAsButtons(QWidget& widget, const ViewLook::Colors& colors);

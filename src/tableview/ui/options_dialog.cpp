@@ -1,5 +1,6 @@
 #include "tableview/ui/options_dialog.h"
 
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
 #include <QCheckBox>
@@ -11,6 +12,7 @@
 #include <QScreen>
 #include <QScrollArea>
 #include <QSpinBox>
+#include <QStyle>
 #include <QVBoxLayout>
 
 namespace mirel {
@@ -62,10 +64,14 @@ void COptionsDialog::LayOut()
     scroller->setWidgetResizable(true);
     scroller->setFrameShape(QFrame::NoFrame);
     auto* column = new QVBoxLayout(page);
+    const int margin = style()->pixelMetric(QStyle::PM_LayoutLeftMargin, nullptr, this) / 2;
+    column->setContentsMargins(margin, margin, margin, margin);
     column->addWidget(confirmDelete_);
 
     auto* limitBox = new QGroupBox(StringText(Str::OptionColumnGroup), this);
     auto* limitRow = new QHBoxLayout(limitBox);
+    limitRow->setContentsMargins(margin, margin, margin, margin);
+    limitRow->setSpacing(margin);
     limitRow->addWidget(limit_);
     limitRow->addWidget(characters_);
     limitRow->addWidget(new QLabel(StringText(Str::OptionCharacters), limitBox), 1);
@@ -76,8 +82,10 @@ void COptionsDialog::LayOut()
     column->addWidget(wordsLabel);
     column->addWidget(words_);
 
-    auto* holdRow = new QHBoxLayout;
-    holdRow->addWidget(popup_);
+    column->addWidget(popup_);
+    auto* holdRow = new QHBoxLayout; // in line with the words above it
+    holdRow->addSpacing(style()->pixelMetric(QStyle::PM_IndicatorWidth, nullptr, this) +
+                        style()->pixelMetric(QStyle::PM_CheckBoxLabelSpacing, nullptr, this));
     holdRow->addWidget(holdMs_);
     holdRow->addWidget(new QLabel(StringText(Str::OptionMilliseconds), this), 1);
     column->addLayout(holdRow);
@@ -88,9 +96,11 @@ void COptionsDialog::LayOut()
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     column->addStretch(1);
     auto* whole = new QVBoxLayout(this);
+    whole->setContentsMargins(margin, margin, margin, margin);
     whole->addWidget(scroller, 1);
     whole->addWidget(buttons);
     resize((scroller->sizeHint() + QSize(2, 3) * fontMetrics().height()).boundedTo(screen()->availableSize()));
+    FillSmallWindow(*this, *parentWidget()->window());
     characters_->setAccessibleName(StringText(Str::OptionColumnGroup));
     holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup));
 }
