@@ -215,22 +215,26 @@ RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
 
 // --- moving, adding, deleting -----------------------------------------------------------------------------------
 
+UserPrompt::Answer RunningForm::AskAboutChanges()
+{
+    const UserMessage question{Str::IgnoreChangesQuestion, {}};
+    if (environment_.settings.saveAsThirdAnswer && FirstUpdateButton() >= 0)
+        return environment_.prompt.AskYesNoOr(question, {Str::SaveChangesAnswer, {}});
+    return environment_.prompt.AskYesNo(question) ? UserPrompt::Answer::Yes : UserPrompt::Answer::No;
+}
+
 bool RunningForm::LeaveRecordCheck()
 {
-    if (!IsDirty() || !environment_.settings.confirmSave) {
-        controls_.ForgetEdits();
-        return true;
+    if (IsDirty() && environment_.settings.confirmSave) {
+        switch (AskAboutChanges()) {
+        case UserPrompt::Answer::No:
+            return false;
+        case UserPrompt::Answer::Third:
+            return PressButton(FirstUpdateButton()) == Outcome::Done && !IsDirty();
+        case UserPrompt::Answer::Yes:
+            break;
+        }
     }
-    const UserMessage question{Str::IgnoreChangesQuestion, {}};
-    const bool offersSave = environment_.settings.saveAsThirdAnswer && FirstUpdateButton() >= 0;
-    const UserPrompt::Answer answer = offersSave
-                                          ? environment_.prompt.AskYesNoOr(question, {Str::SaveChangesAnswer, {}})
-                                      : environment_.prompt.AskYesNo(question) ? UserPrompt::Answer::Yes
-                                                                               : UserPrompt::Answer::No;
-    if (answer == UserPrompt::Answer::No)
-        return false;
-    if (answer == UserPrompt::Answer::Third)
-        return PressButton(FirstUpdateButton()) == Outcome::Done && !IsDirty();
     controls_.ForgetEdits();
     return true;
 }

@@ -142,6 +142,7 @@ private:
     bool MayRun(const QString& statement);
     Outcome RunQuery(const QString& query, qint64 record);
     void TakeUpChanges();
+    UserPrompt::Answer AskAboutChanges();
     Outcome LeaveAndMoveTo(qint64 record);
     // Runs `rewrite` on the result after the leave-record check, and shows what came of it.
     template <typename Rewrite>

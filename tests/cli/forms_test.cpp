@@ -1,4 +1,6 @@
 // The commands of forms as a script meets them.
+#include "forms/form_file.h"
+#include "forms/form_fixture.h"
 #include "support/printing.h"
 
 #include <gtest/gtest.h>
@@ -12,6 +14,7 @@
 
 namespace {
 
+using namespace mirel;
 using namespace Qt::StringLiterals;
 
 class FormsCommands : public ::testing::Test {
@@ -114,6 +117,34 @@ TEST_F(FormsCommands, SetAndPressInTheirOrder)
         EXPECT_EQ(ended.out, QString()) << row.options.join(u' ').toStdString();
         EXPECT_TRUE(ended.err.contains(row.fault)) << ended.err.toStdString();
     }
+}
+
+TEST_F(FormsCommands, ShowTheFormThatAButtonCalled)
+{
+    FormBuilder main(u"My Birds", u"Main");
+    main.Edit(u"Name", u"[Name]").List(u"list", {{u"Bird"_s, u"[Name]"_s}}).DropDown(u"pick", u"a;b");
+    main.Button(u"call", ButtonFunction::CallForm, u"DefaultForm").Last().option1 = 1;
+    main.Button(u"swap", ButtonFunction::CallForm, u"DefaultForm").Last().option2 = 1;
+    main.Button(u"find", ButtonFunction::Select, u"SELECT * WHERE Wild=1").Button(u"close", ButtonFunction::Close);
+    QString error;
+    ASSERT_TRUE(ExportForm(main.form, folder_.filePath(u"m.pfs"_s), error)) << error.toStdString();
+    Do({u"forms"_s, u"import"_s, u"a.cdb"_s, u"m.pfs"_s});
+    const auto show = [this](const QStringList& options) {
+        const QString out =
+            Do(QStringList{u"forms"_s, u"show"_s, u"a.cdb"_s, u"Main"_s, u"--format"_s, u"json"_s} + options);
+        const QJsonObject form = QJsonDocument::fromJson(out.toUtf8()).object();
+        return u"%1 %2/%3"_s.arg(form[u"form"].toString())
+            .arg(form[u"record"].toInt())
+            .arg(form[u"records"].toInt());
+    };
+    const QStringList call = {u"--press"_s, u"find"_s, u"--set"_s, u"list=2"_s, u"--press"_s, u"call"_s};
+    EXPECT_EQ(show({}), u"Main 1/3"_s);
+    EXPECT_EQ(show(call), u"DefaultForm 2/2"_s);
+    EXPECT_EQ(show(QStringList{u"--press"_s, u"swap"_s}), u"DefaultForm 1/3"_s);
+    EXPECT_EQ(show({u"--press"_s, u"close"_s}), u"Main 1/3"_s); // as it was when it closed
+    for (const QStringList& pressed : {QStringList{u"--press"_s, u"close"_s, u"--press"_s, u"find"_s},
+                                       {u"--press"_s, u"swap"_s, u"--press"_s, u"find"_s}})
+        EXPECT_EQ(Run(QStringList{u"forms"_s, u"show"_s, u"a.cdb"_s, u"Main"_s} + pressed).status, 1);
 }
 
 TEST_F(FormsCommands, CarryFormsFromFileToFile)
