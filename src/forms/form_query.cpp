@@ -68,7 +68,8 @@ QString WithControlTexts(QStringView query, const ControlTextOf& controlText)
             closing = c;
         else if (closing.isNull() && c == u'[')
             closing = u']';
-        out += c;
+        // Filters and sorts, which are put onto the statement later, look for words between blanks.
+        out += closing.isNull() && c.isSpace() ? QChar(u' ') : c;
     }
     return out;
 }

@@ -49,6 +49,7 @@ TEST(CompleteQuery, PutsTheFormsTableWhereFromIsMissing)
         {u"SELECT LEFT(A,2) WHERE A='x FROM y'", u"SELECT LEFT(A,2) FROM [My Birds] WHERE A='x FROM y'"},
         {u"SELECT * FROM T WHERE A=1", u"SELECT * FROM T WHERE A=1"},
         {u"SELECT [FROM] FROM T", u"SELECT [FROM] FROM T"},
+        {u"SELECT *\nFROM T\tWHERE A='x\ny'", u"SELECT * FROM T WHERE A='x\ny'"},
         {u"T", u"T"},
         {u"SELECT 'never closed", u"SELECT 'never closed"},
     });
