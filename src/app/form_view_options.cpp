@@ -11,6 +11,8 @@ FormViewSettings ReadFormViewSettings(const Settings& settings)
             .scrollPixels = settings.Int(Setting::FormViewScroll),
             .maxColumnChars = settings.Int(Setting::FormViewMaxColumnChars),
             .holdTimeMs = settings.Int(Setting::FormViewHoldingTime),
+            .sortByHeader = settings.Flag(Setting::FormViewSortColumn),
+            .fitToWindow = settings.Flag(Setting::FormViewFitToWindow),
             .words = settings.Words()};
 }
 
@@ -23,6 +25,8 @@ void WriteFormViewSettings(Settings& settings, const FormViewSettings& options)
     settings.SetInt(Setting::FormViewScroll, options.scrollPixels);
     settings.SetInt(Setting::FormViewMaxColumnChars, options.maxColumnChars);
     settings.SetInt(Setting::FormViewHoldingTime, options.holdTimeMs);
+    settings.SetInt(Setting::FormViewSortColumn, options.sortByHeader ? 1 : 0);
+    settings.SetInt(Setting::FormViewFitToWindow, options.fitToWindow ? 1 : 0);
     settings.SetText(Setting::FormViewYesNo, options.words.Setting());
 }
 

@@ -58,6 +58,8 @@ constexpr std::array kSettings = {
                u"bring aggregate fields up to date"},
     SettingRow{Setting::FormViewYesNo, u"FormView", u"yesnoString", YesNo, u"Yes/No",
                u"words for true and false; one pair with the table view's"},
+    SettingRow{Setting::FormViewFitToWindow, u"FormView", u"fitToWindow", Integer, u"1",
+               u"scale forms to their window"},
 };
 
 constexpr bool RowsStandInTheOrderOfTheirIds()

@@ -44,6 +44,7 @@ enum class Setting {
     FormViewSaveAnswer,
     FormViewUpdateAggregate,
     FormViewYesNo,
+    FormViewFitToWindow,
 };
 
 enum class SettingKind { Text, Integer, Colors, Font, YesNo };

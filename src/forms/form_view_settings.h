@@ -14,7 +14,9 @@ struct FormViewSettings {
     bool updateAggregate = false;   // recompute aggregates after each saved change
     int scrollPixels = 10;          // of Scroll Up and Scroll Down
     int maxColumnChars = 50;        // longest text in a list's cell; kNoColumnLimit: none
-    int holdTimeMs = 400;
+    int holdTimeMs = 400;           // how long a hold takes to open the popup menu; 0 or less: it never does
+    bool sortByHeader = false;      // a tap on a header of the view's list of records sorts it, too
+    bool fitToWindow = true;        // scale the form to its window; otherwise its pixels are the window's
     YesNoWords words;
 
     friend bool operator==(const FormViewSettings&, const FormViewSettings&) = default;

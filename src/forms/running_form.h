@@ -106,6 +106,8 @@ public:
     Outcome GoToRecord(qint64 record);
     Outcome AddRecord();
     Outcome DeleteRecord();
+    // Runs the current query again and shows the same record, with everything that is computed computed anew.
+    Outcome RunAgain();
     // Asks about unsaved changes, tells the host what changed and that it is to close.
     Outcome Close();
     // Asks about unsaved changes alone. True: whoever asked may go on.

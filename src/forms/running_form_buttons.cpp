@@ -148,6 +148,18 @@ RunningForm::Outcome RunningForm::RunClearForm()
     return Outcome::Done;
 }
 
+RunningForm::Outcome RunningForm::RunAgain()
+{
+    if (!HasResult())
+        return Outcome::Failed;
+    if (!LeaveRecordCheck())
+        return Outcome::Stopped;
+    const bool done = result_.RunAgain();
+    FillDropDowns();
+    ShowResult();
+    return done ? Outcome::Done : Outcome::Failed;
+}
+
 RunningForm::Outcome RunningForm::RunRecalc()
 {
     FillDropDowns();
