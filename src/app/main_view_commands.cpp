@@ -207,4 +207,22 @@ std::optional<TableRequest> MainViewCommands::RequestOfSelected() const
     return std::nullopt;
 }
 
+std::optional<FormCall> MainViewCommands::CallOfSelected() const
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry || entry->missing || entry->kind != EntryKind::Form)
+        return std::nullopt;
+    return CallOfForm(entry->name);
+}
+
+std::optional<FormCall> MainViewCommands::CallOfForm(const QString& name) const
+{
+    const FormDef* form = session_.Store().FindForm(name);
+    if (!form)
+        return std::nullopt;
+    FormCall call;
+    call.form.CopyFrom(*form); // the store may be loaded anew while the form runs
+    return call;
+}
+
 } // namespace mirel

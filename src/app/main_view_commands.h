@@ -4,6 +4,7 @@
 #include "app/main_view_state.h"
 #include "app/sample_database.h"
 #include "app/settings.h"
+#include "forms/form_host.h"
 
 #include <optional>
 
@@ -55,6 +56,9 @@ public:
 
     // What the table view is to show for the selected entry; empty for a form, or when there is nothing to show.
     std::optional<TableRequest> RequestOfSelected() const;
+    // The selected form, to be run from its start; empty for anything else.
+    std::optional<FormCall> CallOfSelected() const;
+    std::optional<FormCall> CallOfForm(const QString& name) const;
 
 private:
     bool RemoveFavorite(const MainEntry& entry);

@@ -77,7 +77,7 @@ struct KindTools {
 };
 constexpr std::array kKindTools = {
     KindTools{EntryKind::Table, Str::TipNewTable, Str::TipEditTable, true, Str::TipOpen},
-    KindTools{EntryKind::Form, Str::TipNewForm, Str::TipEditForm, kLater, Str::TipOpenForm},
+    KindTools{EntryKind::Form, Str::TipNewForm, Str::TipEditForm, true, Str::TipRunForm},
     KindTools{EntryKind::Query, Str::TipNewQuery, Str::TipEditQuery, true, Str::TipOpen},
 };
 

@@ -30,6 +30,7 @@ const std::array kOptions = {
               nullptr},
     OptionDef{u"size", u"WxH", u"size of that picture; 1100x700 unless given", nullptr, nullptr},
     OptionDef{u"table", u"NAME", u"a picture of the table view of that table", &WindowOptions::table, nullptr},
+    OptionDef{u"form", u"NAME", u"a picture of that form running", &WindowOptions::form, nullptr},
     OptionDef{u"print-sample-path", u"", u"print where the sample database is, making it where it is not there",
               nullptr, &WindowOptions::printSamplePath},
     OptionDef{u"help", u"", u"print this", nullptr, &WindowOptions::help},
@@ -77,6 +78,10 @@ bool ReadOptions(const QCommandLineParser& parser, WindowOptions& options, QStri
     }
     if (!options.table.isEmpty() && options.picture.isEmpty()) {
         complaint = u"--table says what --picture shows, and needs it"_s;
+        return false;
+    }
+    if (!options.form.isEmpty() && (options.picture.isEmpty() || !options.table.isEmpty())) {
+        complaint = u"--form says what --picture shows in place of --table"_s;
         return false;
     }
     return true;

@@ -19,6 +19,7 @@ struct WindowOptions {
     QString picture;       // the file to write; empty: none
     QSize size{1100, 700}; // of the picture
     QString table;         // a picture of the table view of that table
+    QString form;          // a picture of that form running
 
     bool printSamplePath = false;
     bool help = false;

@@ -4,6 +4,7 @@
 #include "app/ui/message_box_prompt.h"
 #include "app/window_options.h"
 #include "cli/console_prompt.h"
+#include "forms/ui/form_eng_view.h"
 
 #include <QApplication>
 
@@ -77,6 +78,10 @@ int TakePicture(const WindowOptions& options)
     if (!options.table.isEmpty()) {
         const QString statement = u"SELECT * FROM "_s + FieldReference(options.table);
         shown = frame.OpenTable({options.table, statement, options.table});
+    }
+    if (!options.form.isEmpty()) {
+        const std::optional<FormCall> call = core.commands.CallOfForm(options.form);
+        shown = call ? frame.OpenForm(*call) : nullptr;
     }
     if (!shown)
         return kFailed;

@@ -1,11 +1,13 @@
 #include "app/ui/main_frame.h"
 
+#include "app/form_view_options.h"
 #include "app/table_view_options.h"
 #include "app/ui/about_box.h"
 #include "app/ui/display_look.h"
 #include "app/ui/keys_dialog.h"
 #include "app/ui/lumo_view.h"
 #include "app/ui/shell_actions.h"
+#include "forms/ui/form_eng_view.h"
 #include "platform/ui/file_choice.h"
 #include "platform/ui/menu_keys.h"
 #include "platform/ui/window_place.h"
@@ -32,6 +34,7 @@ using namespace Qt::StringLiterals;
 const QString kFramePlace = u"frame"_s;
 const QString kTablePlace = u"table"_s;
 const QString kWidthsSection = u"Columns"_s;
+const QString kFormPlace = u"form"_s;
 constexpr QSize kFrameFirstSize(760, 560);
 constexpr QSize kTableFirstSize(960, 620);
 constexpr QSize kSmallestSize(160, 160);
@@ -175,6 +178,8 @@ void CMainFrame::Run(ShellCommand id)
     case ShellCommand::Open:
         if (const std::optional<TableRequest> request = commands_.RequestOfSelected())
             OpenTable(*request);
+        else if (const std::optional<FormCall> call = commands_.CallOfSelected())
+            OpenForm(*call);
         return;
     case ShellCommand::ExportCsv:
         if (const std::optional<TableRequest> request = commands_.RequestOfSelected()) {
@@ -252,26 +257,69 @@ QWidget* CMainFrame::OpenTable(const TableRequest& request)
     });
     connect(table, &CTableView::settingsChanged, this,
             [this](const TableViewSettings& options) { WriteTableViewSettings(settings_, options); });
-    if (IsHandheldSize(size())) {
-        table->setGeometry(geometry());
-        table->setWindowState(windowState());
-    } else {
-        RestorePlace(*table, profile_, kTablePlace, kTableFirstSize);
-    }
+    Place(*table, kTablePlace, kTableFirstSize);
     table->installEventFilter(this);
     table->show();
     return table;
 }
 
+CFormEngView* CMainFrame::OpenForm(const FormCall& call)
+{
+    auto* form = new CFormEngView(call,
+                                  {.connection = session_.Connection(),
+                                   .database = session_.Path(),
+                                   .store = session_.Store(),
+                                   .prompt = session_.Prompt(),
+                                   .settings = ReadFormViewSettings(settings_),
+                                   .activeTable = state_.CurrentTable()},
+                                  this);
+    form->setAttribute(Qt::WA_DeleteOnClose);
+    connect(form, &CFormEngView::formCalled, this, &CMainFrame::OpenForm);
+    connect(form, &CFormEngView::dataChanged, this, [this] {
+        commands_.Refill();
+        ShowState();
+    });
+    connect(form, &CFormEngView::keysRequested, form, [form] { ShowKeys(*form); });
+    connect(form, &CFormEngView::settingsChanged, this, [this](const FormViewSettings& options) {
+        WriteFormViewSettings(settings_, options);
+        for (CFormEngView* open : Forms())
+            open->ChangeSettings(options);
+    });
+    Place(*form, kFormPlace, form->PreferredSize());
+    form->installEventFilter(this);
+    form->show();
+    (void)form->Open(); // after show: what it has to say stands over its window
+    return form;
+}
+
+// On a handheld the window takes the frame's place.
+void CMainFrame::Place(QWidget& window, const QString& key, QSize firstSize)
+{
+    if (IsHandheldSize(size())) {
+        window.setGeometry(geometry());
+        window.setWindowState(windowState());
+    } else {
+        RestorePlace(window, profile_, key, firstSize);
+    }
+}
+
+void CMainFrame::KeepPlaceOf(QWidget& window)
+{
+    const auto* table = qobject_cast<CTableView*>(&window);
+    if (table)
+        KeepWidths(*table);
+    if (IsHandheldSize(window.size()))
+        return;
+    if (table)
+        KeepPlace(window, profile_, kTablePlace);
+    else if (qobject_cast<CFormEngView*>(&window))
+        KeepPlace(window, profile_, kFormPlace);
+}
+
 bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
 {
-    if (event->type() == QEvent::Close) {
-        if (const auto* table = qobject_cast<CTableView*>(watched)) {
-            KeepWidths(*table);
-            if (!IsHandheldSize(table->size()))
-                KeepPlace(*table, profile_, kTablePlace);
-        }
-    }
+    if (event->type() == QEvent::Close && watched->isWidgetType())
+        KeepPlaceOf(*static_cast<QWidget*>(watched));
     return QMainWindow::eventFilter(watched, event);
 }
 
@@ -303,35 +351,36 @@ QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)
 void CMainFrame::ChooseAndOpenDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandOpenDatabase, Str::CommandOpen, FileUse::Open);
-    if (!path.isEmpty() && CloseTables())
+    if (!path.isEmpty() && CloseWindows())
         commands_.OpenDatabase(path);
 }
 
 void CMainFrame::ChooseAndCreateDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandNewDatabase, Str::CommandNew, FileUse::Create);
-    if (!path.isEmpty() && CloseTables())
+    if (!path.isEmpty() && CloseWindows())
         commands_.NewDatabase(path);
 }
 
 void CMainFrame::ChooseAndDeleteDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandDeleteDatabase, Str::CommandDelete, FileUse::Delete);
-    if (!path.isEmpty() && CloseTables())
+    if (!path.isEmpty() && CloseWindows())
         commands_.DeleteDatabase(path);
 }
 
 void CMainFrame::OpenPath(const QString& path)
 {
-    if (!CloseTables())
+    if (!CloseWindows())
         return;
     commands_.OpenDatabase(path);
     ShowState();
 }
 
-bool CMainFrame::CloseTables()
+bool CMainFrame::CloseWindows()
 {
-    return std::ranges::all_of(Tables(), [](CTableView* table) { return table->close(); });
+    const auto close = [](QWidget* window) { return window->close(); };
+    return std::ranges::all_of(Forms(), close) && std::ranges::all_of(Tables(), close);
 }
 
 QList<CTableView*> CMainFrame::Tables() const
@@ -339,9 +388,14 @@ QList<CTableView*> CMainFrame::Tables() const
     return findChildren<CTableView*>(Qt::FindDirectChildrenOnly);
 }
 
+QList<CFormEngView*> CMainFrame::Forms() const
+{
+    return findChildren<CFormEngView*>(Qt::FindDirectChildrenOnly);
+}
+
 void CMainFrame::closeEvent(QCloseEvent* event)
 {
-    if (!CloseTables()) {
+    if (!CloseWindows()) {
         event->ignore();
         return;
     }

@@ -10,12 +10,13 @@ class QMenu;
 
 namespace mirel {
 
+class CFormEngView;
 class CLumoView;
 class CTableView;
 class ShellActions;
 
-// The program's window: the menus, and in its middle the main view. The running form and the form maker will take
-// the main view's place. Carries the commands of the menus to MainViewCommands; DatabaseSession is the document.
+// The program's window: the menus, and in its middle the main view. Table views and running forms are windows of
+// the frame. Carries the commands of the menus to MainViewCommands; DatabaseSession is the document.
 //
 // All arguments must outlive the frame.
 class CMainFrame : public QMainWindow {
@@ -29,6 +30,9 @@ public:
     // Opens the table view on a result, or brings forward the one that shows it already. Null when it does not
     // open; why was told then. Table views close with the database.
     QWidget* OpenTable(const TableRequest& request);
+    // The frame's command 5001: runs a form in a form engine of its own, also when one runs that form already.
+    // Form engines close with the database.
+    CFormEngView* OpenForm(const FormCall& call);
 
 protected:
     void closeEvent(QCloseEvent* event) override;
@@ -49,9 +53,13 @@ private:
     void ChooseAndCreateDatabase();
     void ChooseAndDeleteDatabase();
     void OpenPath(const QString& path);
-    // False when one of them holds an edit that cannot be saved: the user stays in it.
-    bool CloseTables();
+    // The windows on the open database. False when one of them holds an edit that is not to be lost: the user
+    // stays in it.
+    bool CloseWindows();
     QList<CTableView*> Tables() const;
+    QList<CFormEngView*> Forms() const;
+    void Place(QWidget& window, const QString& key, QSize firstSize);
+    void KeepPlaceOf(QWidget& window);
 
     DatabaseSession& session_;
     MainViewState& state_;

@@ -9,6 +9,7 @@
 #include <QLocale>
 #include <QMessageBox>
 #include <QProgressDialog>
+#include <QPushButton>
 
 #include <algorithm>
 #include <utility>
@@ -101,6 +102,20 @@ bool MessageBoxPrompt::AskYesNo(const UserMessage& question)
 {
     return Ask(question.Text(), QMessageBox::Question, QMessageBox::Yes | QMessageBox::No, QMessageBox::No) ==
            QMessageBox::Yes;
+}
+
+UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, const UserMessage& third)
+{
+    QMessageBox box(QMessageBox::Question, QApplication::applicationDisplayName(), LinesOf(question.Text()),
+                    QMessageBox::Yes | QMessageBox::No, FrontWindow());
+    const QAbstractButton* other = box.addButton(third.Text(), QMessageBox::AcceptRole);
+    box.setTextFormat(Qt::PlainText);
+    box.setDefaultButton(QMessageBox::No);
+    box.setEscapeButton(QMessageBox::No);
+    const int pressed = box.exec();
+    if (box.clickedButton() == other)
+        return Answer::Third;
+    return pressed == QMessageBox::Yes ? Answer::Yes : Answer::No;
 }
 
 void MessageBoxPrompt::Show(const UserMessage& message)

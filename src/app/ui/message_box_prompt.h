@@ -11,6 +11,7 @@ namespace mirel {
 class MessageBoxPrompt : public UserPrompt {
 public:
     bool AskYesNo(const UserMessage& question) override;
+    Answer AskYesNoOr(const UserMessage& question, const UserMessage& third) override;
     void Show(const UserMessage& message) override;
     void ShowError(const QString& text) override;
     std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,

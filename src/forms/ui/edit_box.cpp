@@ -1,0 +1,206 @@
+#include "forms/ui/edit_box.h"
+
+#include "forms/ui/control_look.h"
+#include "forms/ui/long_text_dialog.h"
+#include "platform/ui/day_chooser.h"
+#include "platform/user_locale.h"
+#include "resources/string_table.h"
+
+#include <QLineEdit>
+#include <QPlainTextEdit>
+#include <QSignalBlocker>
+#include <QStyleOptionToolButton>
+#include <QStylePainter>
+#include <QTextOption>
+#include <QToolButton>
+
+#include <algorithm>
+#include <limits>
+
+namespace mirel {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int kFrameRoomPx = 4; // what a frame takes of a box's height
+constexpr qreal kPixelsPerPoint = 96.0 / 72.0;
+constexpr int kUsualPoints = 9;
+
+// Several lines where the record asks for them and the box has room for two.
+bool HasLines(const ControlDef& definition)
+{
+    if (definition.windowStyle & style::kVerticalScrollBar)
+        return true;
+    const int points = definition.textStyle.pointSize > 0 ? definition.textStyle.pointSize : kUsualPoints;
+    const bool wraps = (definition.windowStyle & style::kAutoHorizontalScroll) == 0;
+    const bool high = definition.height >= 2 * points * kPixelsPerPoint;
+    return high && (wraps || definition.editKind == EditKind::Extendable);
+}
+
+// The strip at the right of an edit box. Lies under the box over the whole width where the form says so; it draws
+// and takes taps in the part that the box leaves free.
+class StripButton : public QToolButton {
+public:
+    StripButton(const QWidget& box, QWidget* parent)
+        : QToolButton(parent)
+        , box_(box)
+    {
+        setFocusPolicy(Qt::NoFocus); // the box has the focus, and a key for this
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QStylePainter painter(this);
+        QStyleOptionToolButton option;
+        initStyleOption(&option);
+        option.rect.setLeft(std::max(box_.geometry().right() + 1 - x(), 0));
+        const QStyle::State state = option.state;
+        option.state |= QStyle::State_Enabled;
+        painter.drawPrimitive(QStyle::PE_PanelButtonTool, option);
+        option.state = state;
+        const int side = std::min({option.rect.width(), option.rect.height(), 16}) - 2;
+        QRect sign(0, 0, side, side);
+        sign.moveCenter(option.rect.center());
+        option.rect = sign;
+        painter.drawPrimitive(QStyle::PE_IndicatorArrowDown, option);
+    }
+
+private:
+    const QWidget& box_;
+};
+
+// What the two editors have in common.
+class EditBox : public ControlWidget {
+    Q_OBJECT
+public:
+    EditBox(const ControlRun& control, QWidget& editor, QWidget& surface)
+        : ControlWidget(control, editor)
+    {
+        SetColors(QPalette::Base, QPalette::Text);
+        const bool picker = Definition().editKind == EditKind::DatePicker;
+        if (!picker && Definition().editKind != EditKind::Extendable)
+            return;
+        auto* strip = new StripButton(*Main(), &surface);
+        strip->setObjectName(Main()->objectName() + u".strip"_s);
+        strip->setToolTip(StringText(picker ? Str::CalendarTip : Str::LongTextTip));
+        strip->setAccessibleName(strip->toolTip());
+        strip->stackUnder(Main());
+        connect(strip, &QToolButton::clicked, this, &EditBox::OpenMore);
+        TakeStrip(*strip);
+    }
+
+    bool OpenMore() override
+    {
+        const std::optional<QString> changed = Definition().editKind == EditKind::DatePicker
+                                                   ? ChooseDay(text_, BelowBox(), *Main())
+                                                   : EditLongText(TextToEdit(), *Main());
+        if (changed && *changed != text_)
+            Q_EMIT textEdited(*changed);
+        return true;
+    }
+
+    void Show(const ControlRun& control) override
+    {
+        text_ = control.text;
+        if (EditorText() != text_) // not while it is typed: the cursor would jump
+            SetEditorText(text_);
+    }
+
+protected:
+    virtual QString EditorText() const = 0;
+    virtual void SetEditorText(const QString& text) = 0;
+    int TextRoomPx(int heightPx) const override
+    {
+        return std::max(heightPx - (Definition().windowStyle & style::kBorder ? kFrameRoomPx : 1), 1);
+    }
+    const QString& Text() const { return text_; }
+
+private:
+    QPoint BelowBox() const { return Main()->mapToGlobal(Main()->rect().bottomLeft()); }
+    LongText TextToEdit() const
+    {
+        return {.title = Main()->accessibleName(), .text = text_, .lines = Definition().lines};
+    }
+
+    QString text_;
+};
+
+class LineBox : public EditBox {
+public:
+    LineBox(const ControlRun& control, QWidget& surface)
+        : EditBox(control, *new QLineEdit(&surface), surface)
+        , line_(static_cast<QLineEdit*>(Main()))
+    {
+        line_->setMaxLength(std::numeric_limits<int>::max()); // the longest memo passes through whole
+        line_->setFrame(Definition().windowStyle & style::kBorder);
+        line_->setAlignment(AlignmentOf(Definition().windowStyle) | Qt::AlignVCenter);
+        if (Definition().editKind == EditKind::DatePicker)
+            line_->setPlaceholderText(UserLocale::Current().DateFormat());
+        connect(line_, &QLineEdit::textEdited, this, &ControlWidget::textEdited);
+    }
+
+protected:
+    QString EditorText() const override { return line_->text(); }
+    void SetEditorText(const QString& text) override
+    {
+        line_->setText(text);
+        if (line_->hasFocus())
+            line_->selectAll();
+        else
+            line_->setCursorPosition(0);
+    }
+
+private:
+    QLineEdit* line_;
+};
+
+class TextBox : public EditBox {
+public:
+    TextBox(const ControlRun& control, QWidget& surface)
+        : EditBox(control, *new QPlainTextEdit(&surface), surface)
+        , text_(static_cast<QPlainTextEdit*>(Main()))
+    {
+        const quint32 windowStyle = Definition().windowStyle;
+        text_->setTabChangesFocus(true);
+        text_->setFrameShape(windowStyle & style::kBorder ? QFrame::StyledPanel : QFrame::NoFrame);
+        text_->setVerticalScrollBarPolicy(windowStyle & style::kVerticalScrollBar ? Qt::ScrollBarAlwaysOn
+                                                                                  : Qt::ScrollBarAsNeeded);
+        text_->document()->setDefaultTextOption(QTextOption(AlignmentOf(windowStyle)));
+        text_->document()->setDocumentMargin(2);
+        connect(text_, &QPlainTextEdit::textChanged, this,
+                [this] { Q_EMIT textEdited(WithLineEndsOf(Text(), text_->toPlainText())); });
+    }
+
+protected:
+    QString EditorText() const override { return WithLineEndsOf(Text(), text_->toPlainText()); }
+    void SetEditorText(const QString& text) override
+    {
+        const QSignalBlocker quiet(text_);
+        text_->setPlainText(text);
+    }
+    int TextRoomPx(int) const override { return 0; }
+
+private:
+    QPlainTextEdit* text_;
+};
+
+} // namespace
+
+QString WithLineEndsOf(const QString& before, QString edited)
+{
+    const QString handheld = u"\r\n"_s;
+    return before.contains(handheld) ? edited.replace(u'\n', handheld) : edited;
+}
+
+std::unique_ptr<ControlWidget> MakeEditBox(const ControlRun& control, QWidget& surface)
+{
+    if (HasLines(*control.definition))
+        return std::make_unique<TextBox>(control, surface);
+    return std::make_unique<LineBox>(control, surface);
+}
+
+} // namespace mirel
+
+#include "edit_box.moc"

@@ -1,0 +1,221 @@
+#include "forms/ui/form_eng_view.h"
+
+#include "forms/ui/form_surface.h"
+#include "resources/string_table.h"
+#include "tableview/ui/filter_chip.h"
+
+#include <QApplication>
+#include <QCloseEvent>
+#include <QHeaderView>
+#include <QInputMethod>
+#include <QMenuBar>
+#include <QScrollArea>
+#include <QScrollBar>
+#include <QStackedWidget>
+#include <QTimer>
+#include <QToolBar>
+#include <QTreeWidget>
+#include <QVBoxLayout>
+
+namespace mirel {
+namespace {
+
+constexpr int kClockMs = 1000;
+constexpr qreal kPreferredScale = 1.4; // forms are laid out for a handheld's pixels
+
+} // namespace
+
+CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroundings, QWidget* parent)
+    : QMainWindow(parent)
+    , form_(call, {.connection = surroundings.connection,
+                   .database = surroundings.database,
+                   .store = surroundings.store,
+                   .prompt = surroundings.prompt,
+                   .host = *this,
+                   .settings = surroundings.settings,
+                   .activeTable = surroundings.activeTable})
+    , stack_(new QStackedWidget(this))
+    , scroller_(new QScrollArea(this))
+    , surface_(new FormSurface(form_, nullptr))
+    , detail_(new QTreeWidget(this))
+{
+    CreateActions();
+    chip_ = new FilterChip(ActionOf(FormCommand::RemoveFilter), this);
+    CreateMenus();
+    CreateToolBar();
+    LayOut();
+    connect(surface_, &FormSurface::acted, this, &CFormEngView::ShowState);
+    connect(surface_, &FormSurface::popupRequested, this, &CFormEngView::ShowPopup);
+    connect(surface_, &FormSurface::focusMoved, this, [this](QWidget* widget) {
+        lastFocused_ = surface_->ControlOf(widget);
+        scroller_->ensureWidgetVisible(widget, 0, widget->height() / 2);
+        ShowActions();
+    });
+    ShowScrollBar(form_.Form().formScrollBar != 0);
+    ShowState();
+}
+
+CFormEngView::~CFormEngView() = default;
+
+void CFormEngView::LayOut()
+{
+    auto* center = new QWidget(this);
+    auto* column = new QVBoxLayout(center);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(0);
+    column->addWidget(stack_, 1);
+    column->addWidget(chip_);
+    stack_->addWidget(scroller_);
+    stack_->addWidget(detail_);
+    scroller_->setWidget(surface_);
+    scroller_->setFrameShape(QFrame::NoFrame);
+    scroller_->setFocusPolicy(Qt::NoFocus);
+    scroller_->viewport()->setPalette(surface_->palette());
+    scroller_->viewport()->setAutoFillBackground(true);
+    scroller_->viewport()->installEventFilter(this);
+    detail_->setColumnCount(2);
+    detail_->setHeaderLabels({StringText(Str::DetailFieldColumn), StringText(Str::DetailValueColumn)});
+    detail_->setRootIsDecorated(false);
+    detail_->setUniformRowHeights(true);
+    detail_->setAlternatingRowColors(true);
+    detail_->setFrameShape(QFrame::NoFrame);
+    detail_->setAccessibleName(StringText(Str::GridName));
+    setCentralWidget(center);
+    setContextMenuPolicy(Qt::NoContextMenu);
+}
+
+bool CFormEngView::Open()
+{
+    QApplication::setOverrideCursor(Qt::WaitCursor);
+    const bool opened = form_.Open();
+    QApplication::restoreOverrideCursor();
+    ShowState();
+    surface_->FocusFirstInput();
+    if (form_.HasClock())
+        clock_.start(kClockMs, this);
+    if (form_.Form().raiseInputPanel != 0)
+        QTimer::singleShot(0, this, [] { QGuiApplication::inputMethod()->show(); });
+    return opened;
+}
+
+QSize CFormEngView::PreferredSize() const
+{
+    const QSize form = (QSizeF(surface_->FormSize()) * kPreferredScale).toSize();
+    const int bar = scroller_->verticalScrollBar()->sizeHint().width();
+    return form +
+           QSize(bar, menuBar()->sizeHint().height() + 2 * style()->pixelMetric(QStyle::PM_ButtonIconSize) + bar);
+}
+
+// --- the form's requests ------------------------------------------------------------------------------------
+
+void CFormEngView::CallForm(const FormCall& call)
+{
+    Q_EMIT formCalled(call);
+}
+
+void CFormEngView::CloseForm()
+{
+    closing_ = true;
+    QTimer::singleShot(0, this, &QWidget::close); // the form is in the middle of a call
+}
+
+void CFormEngView::DataChanged()
+{
+    Q_EMIT dataChanged();
+}
+
+void CFormEngView::closeEvent(QCloseEvent* event)
+{
+    if (!closing_ && form_.Close() != RunningForm::Outcome::Done) {
+        event->ignore();
+        ShowState();
+        return;
+    }
+    closing_ = true;
+    event->accept();
+}
+
+// --- showing ------------------------------------------------------------------------------------------------
+
+void CFormEngView::ShowState()
+{
+    surface_->ShowState();
+    const bool readOnly = form_.HasResult() && !form_.CanUpdate();
+    setWindowTitle(StringText(readOnly ? Str::TableViewTitleReadOnly : Str::TableViewTitle, {form_.Title()}));
+    setWindowModified(form_.IsDirty());
+    chip_->ShowConditions(form_.Conditions());
+    if (stack_->currentWidget() == detail_)
+        ShowDetail();
+    ShowActions();
+}
+
+void CFormEngView::ShowDetail()
+{
+    const std::span<const ResultField> fields = form_.Fields();
+    while (detail_->topLevelItemCount() > int(fields.size()))
+        delete detail_->takeTopLevelItem(detail_->topLevelItemCount() - 1);
+    while (detail_->topLevelItemCount() < int(fields.size()))
+        new QTreeWidgetItem(detail_);
+    for (int field = 0; field < int(fields.size()); ++field) {
+        QTreeWidgetItem* row = detail_->topLevelItem(field);
+        row->setText(0, fields[size_t(field)].name);
+        row->setText(1, form_.FieldText(field));
+        row->setToolTip(1, row->text(1).toHtmlEscaped());
+    }
+    detail_->resizeColumnToContents(0);
+}
+
+void CFormEngView::FitSurface()
+{
+    const QSize room = scroller_->viewport()->size();
+    const SurfaceScale scale =
+        form_.Settings().fitToWindow ? SurfaceScale::ToFit(surface_->FormSize(), room) : SurfaceScale{};
+    if (scale != surface_->Scale())
+        surface_->SetScale(scale);
+    ShowActions();
+}
+
+void CFormEngView::ShowScrollBar(bool shown)
+{
+    scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
+    ActionOf(FormCommand::ScrollBar)->setChecked(shown);
+}
+
+void CFormEngView::Scroll(int steps)
+{
+    QScrollBar* bar = scroller_->verticalScrollBar();
+    bar->setValue(bar->value() + steps * form_.Settings().scrollPixels);
+    ShowActions();
+}
+
+bool CFormEngView::eventFilter(QObject* watched, QEvent* event)
+{
+    if (watched == scroller_->viewport()) {
+        if (event->type() == QEvent::Resize)
+            FitSurface();
+        if (event->type() == QEvent::ContextMenu) {
+            ShowPopup(-1, static_cast<QContextMenuEvent*>(event)->globalPos());
+            return true;
+        }
+    }
+    return QMainWindow::eventFilter(watched, event);
+}
+
+void CFormEngView::changeEvent(QEvent* event)
+{
+    QMainWindow::changeEvent(event);
+    if (event->type() == QEvent::ApplicationFontChange)
+        surface_->SetScale(surface_->Scale());
+}
+
+void CFormEngView::timerEvent(QTimerEvent* event)
+{
+    if (event->timerId() != clock_.timerId()) {
+        QMainWindow::timerEvent(event);
+        return;
+    }
+    form_.Tick();
+    surface_->ShowState();
+}
+
+} // namespace mirel

@@ -1,0 +1,103 @@
+#pragma once
+
+#include "forms/running_form.h"
+#include "forms/ui/form_command.h"
+
+#include <QBasicTimer>
+#include <QHash>
+#include <QMainWindow>
+
+class QAction;
+class QMenu;
+class QScrollArea;
+class QStackedWidget;
+class QTreeWidget;
+
+namespace mirel {
+
+class FilterChip;
+class FormSurface;
+
+// What a form is run in. All of it must outlive the view.
+struct FormSurroundings {
+    DbConnection& connection;
+    QString database;
+    const FormStore& store;
+    UserPrompt& prompt;
+    FormViewSettings settings;
+    QString activeTable; // as in FormEnvironment
+};
+
+// The form engine's window: the surface of a running form, with its menus, tool bar and keys. Behaviour is the
+// running form's; the view shows its state and hands it the user's actions.
+//
+// Closing asks about unsaved changes, and the window stays when the user says No. A form that is done closes its
+// window by itself, after the call that ended it.
+class CFormEngView : public QMainWindow, private FormHost {
+    Q_OBJECT
+
+public:
+    CFormEngView(const FormCall& call, const FormSurroundings& surroundings, QWidget* parent = nullptr);
+    ~CFormEngView() override;
+
+    // Opens the form's first result. False when that failed; why was told then, and the form runs without one.
+    bool Open();
+
+    const RunningForm& Form() const { return form_; }
+    FormSurface& Surface() { return *surface_; }
+    // A window for which the whole form is in sight.
+    QSize PreferredSize() const;
+    void ChangeSettings(const FormViewSettings& settings);
+
+Q_SIGNALS:
+    void formCalled(const mirel::FormCall& call);                  // CALL FORM: to run in a window of its own
+    void dataChanged();                                            // data of the database are not what they were
+    void settingsChanged(const mirel::FormViewSettings& settings); // by the user; in force here already
+    void keysRequested();
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void timerEvent(QTimerEvent* event) override;
+
+private:
+    void CallForm(const FormCall& call) override;
+    void CloseForm() override;
+    void DataChanged() override;
+
+    void CreateActions();
+    void CreateMenus();
+    void CreateToolBar();
+    void FillMenu(QMenu* menu, std::span<const FormMenuEntry> entries);
+    void LayOut();
+    QAction* ActionOf(FormCommand id) const { return actions_.value(id); }
+
+    void Do(FormCommand id);
+    bool RunInForm(FormCommand id); // false: it is no command of the running form's
+    void ShowState();
+    void ShowActions();
+    void ShowDetail();
+    void FitSurface();
+    void Scroll(int steps);
+    void ShowScrollBar(bool shown);
+    void Copy();
+    void Paste();
+    void ChooseOptions();
+    void ShowPopup(int control, const QPoint& globalPosition);
+    int CommandControl() const { return popupControl_ >= 0 ? popupControl_ : lastFocused_; }
+
+    RunningForm form_;
+    QHash<FormCommand, QAction*> actions_;
+    QStackedWidget* stack_;
+    QScrollArea* scroller_;
+    FormSurface* surface_;
+    QTreeWidget* detail_;
+    FilterChip* chip_ = nullptr;
+    QBasicTimer clock_;
+    int lastFocused_ = -1;  // outlives the focus's way through a menu
+    int popupControl_ = -1; // while its popup menu is open
+    bool closing_ = false;
+};
+
+} // namespace mirel

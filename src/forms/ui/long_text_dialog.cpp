@@ -1,0 +1,52 @@
+#include "forms/ui/long_text_dialog.h"
+
+#include "forms/ui/edit_box.h"
+#include "platform/ui/window_place.h"
+
+#include <QDialog>
+#include <QDialogButtonBox>
+#include <QPlainTextEdit>
+#include <QShortcut>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace mirel {
+namespace {
+
+constexpr int kFewestLines = 8;
+constexpr int kMostLines = 30;
+constexpr int kCharacters = 60; // of a line
+
+} // namespace
+
+std::optional<QString> EditLongText(const LongText& longText, QWidget& parent)
+{
+    const QWidget& window = *parent.window();
+    QDialog dialog(&parent);
+    dialog.setWindowTitle(longText.title);
+    auto* editor = new QPlainTextEdit(longText.text, &dialog);
+    editor->setTabChangesFocus(true);
+    editor->setReadOnly(longText.readOnly);
+    editor->setAccessibleName(longText.title);
+    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
+    QObject::connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
+    QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
+    // Enter makes a line here, so the text is taken with it and Ctrl.
+    for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter})
+        QObject::connect(new QShortcut(Qt::CTRL | key, &dialog), &QShortcut::activated, &dialog, &QDialog::accept);
+    auto* column = new QVBoxLayout(&dialog);
+    column->addWidget(editor, 1);
+    column->addWidget(buttons);
+    const QFontMetrics metrics = editor->fontMetrics();
+    const int lines = std::clamp(longText.lines, kFewestLines, kMostLines);
+    const QSize wanted(metrics.averageCharWidth() * kCharacters,
+                       metrics.lineSpacing() * lines + 3 * metrics.height());
+    dialog.resize(IsHandheldSize(window.size()) ? window.size() : wanted);
+    editor->moveCursor(QTextCursor::End);
+    if (dialog.exec() != QDialog::Accepted || longText.readOnly)
+        return std::nullopt;
+    return WithLineEndsOf(longText.text, editor->toPlainText());
+}
+
+} // namespace mirel

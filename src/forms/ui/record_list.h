@@ -1,0 +1,80 @@
+#pragma once
+
+#include "forms/ui/control_widget.h"
+
+#include <QAbstractScrollArea>
+#include <QBasicTimer>
+
+class QHeaderView;
+class QStandardItemModel;
+
+namespace mirel {
+
+// Rows of texts under a header, read as they come into sight: a list of any length costs what its visible rows
+// do. Draws what it is given; a tap or a key asks for another row, and whoever answers calls SetRows.
+//
+// Rows count from 0.
+class RecordList : public QAbstractScrollArea {
+    Q_OBJECT
+
+public:
+    RecordList(ControlWidget::ListSource source, QWidget* parent);
+
+    void SetColumns(const QStringList& names);
+    // Reads the rows in sight anew.
+    void SetRows(qint64 rows, qint64 selected);
+    void SetSortMark(int column, Qt::SortOrder order); // -1: none
+
+    QRect RowRect(qint64 row) const; // in the viewport
+    QHeaderView* Header() const { return header_; }
+
+Q_SIGNALS:
+    void rowChosen(qint64 row);
+    void headerTapped(int column);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void scrollContentsBy(int dx, int dy) override;
+    void focusInEvent(QFocusEvent* event) override;
+    void focusOutEvent(QFocusEvent* event) override;
+
+private:
+    int RowHeightPx() const;
+    int WholeRows() const;
+    qint64 HighestTop() const;
+    void PlaceHeader();
+    void UpdateScrollBars();
+    void ReadRows();
+    void FitColumns();
+    void BringIntoSight(qint64 row);
+    QString Shown(const QString& text) const;
+
+    ControlWidget::ListSource source_;
+    QStandardItemModel* names_;
+    QHeaderView* header_;
+    qint64 rows_ = 0;
+    qint64 selected_ = -1;
+    qint64 top_ = 0;                 // the first row in sight
+    std::vector<QStringList> texts_; // from `top_` on
+    bool fitted_ = false;            // the columns, to the rows that came first
+    bool syncing_ = false;
+};
+
+class ListWidget : public ControlWidget {
+    Q_OBJECT
+public:
+    ListWidget(const ControlRun& control, const ListSource& source, QWidget& surface);
+    void Show(const ControlRun& control) override;
+
+protected:
+    int TextRoomPx(int) const override { return 0; }
+
+private:
+    RecordList* list_;
+};
+
+} // namespace mirel
