@@ -2,6 +2,9 @@
 
 #include "app/display_choice.h"
 #include "app/ui/look.h"
+#include "app/ui/shell_actions.h"
+#include "forms/ui/form_eng_view.h"
+#include "forms/ui/form_surface.h"
 #include "support/printing.h"
 #include "support/scripted_prompt.h"
 #include "tableview/ui/record_grid.h"
@@ -44,6 +47,23 @@ protected:
     }
     QString PathOf(const QString& name) const { return QDir(folder_.path()).filePath(name); }
     QWidget* OpenBirds() { return frame_.OpenTable({u"Birds"_s, u"SELECT * FROM Birds"_s, u"Birds"_s}); }
+    void AddBirdForm()
+    {
+        ControlDef box;
+        box.type = ControlType::EditBox;
+        box.name.Set(u"Name");
+        box.hasSource = 1;
+        box.SetSource(u"Birds.Name");
+        box.left = box.top = 5;
+        box.width = 100;
+        box.height = 18;
+        FormDef form;
+        form.SetName(u"Bird form");
+        form.SetTableName(u"Birds");
+        form.AddControl(box);
+        session_.Store().AddForm(form);
+        commands_.Refill();
+    }
     qsizetype TableViews() const { return frame_.findChildren<CTableView*>().size(); }
 
     // Drags one file onto the frame and lets it go; false when the frame does not want it.
@@ -112,6 +132,33 @@ TEST_F(MainFrameTest, ATableOpensOnceAndComesForwardAgain)
     EXPECT_FALSE(frame_.OpenTable({u"Bees"_s, u"SELECT * FROM Bees"_s, u"Bees"_s}));
     EXPECT_EQ(prompt_.shown.size(), 1);
     EXPECT_EQ(TableViews(), 1);
+}
+
+TEST_F(MainFrameTest, AFormRunsFromItsListAndEachTimeInAnEngineOfItsOwn)
+{
+    AddBirdForm();
+    state_.SetTab(MainTab::Form);
+    state_.Select({EntryKind::Form, u"Bird form"_s, u"Birds"_s, false});
+    frame_.ShowState();
+    auto* actions = frame_.findChild<ShellActions*>();
+    actions->Of(ShellCommand::Open)->trigger();
+    actions->Of(ShellCommand::Open)->trigger();
+    const auto forms = frame_.findChildren<CFormEngView*>();
+    ASSERT_EQ(forms.size(), 2);
+    EXPECT_EQ(forms.last()->Form().RecordCount(), 1);
+}
+
+TEST_F(MainFrameTest, TheProgramStaysWhileAFormsChangesAreNotGivenUp)
+{
+    AddBirdForm();
+    CFormEngView* form = frame_.OpenForm(*commands_.CallOfForm(u"Bird form"_s));
+    QTest::keyClicks(form->Surface().WidgetOf(0), u"x"_s);
+    ASSERT_TRUE(form->isWindowModified());
+    EXPECT_FALSE(frame_.close());
+    EXPECT_TRUE(form->isVisible());
+    prompt_.answers = {true};
+    EXPECT_TRUE(frame_.close());
+    EXPECT_FALSE(form->isVisible());
 }
 
 TEST_F(MainFrameTest, ADroppedDatabaseOpensAndClosesTheTablesOfTheOneBefore)

@@ -11,6 +11,8 @@ namespace {
 
 constexpr qreal kLeastPoints = 5.5;
 constexpr int kMostPoints = 400;
+constexpr double kPixelsPerPoint = 96.0 / 72.0; // of the form's pixels
+constexpr int kUsualPoints = 9;
 constexpr double kReadableContrast = 2.5;
 
 double Linear(double channel)
@@ -54,6 +56,12 @@ QFont FontOf(const TextStyle& style, qreal scale, int roomPx)
     if (height > roomPx)
         font.setPointSizeF(std::max(font.pointSizeF() * roomPx / height, kLeastPoints));
     return font;
+}
+
+int LineHeightOf(const TextStyle& style)
+{
+    const int points = style.pointSize > 0 ? std::min(style.pointSize, kMostPoints) : kUsualPoints;
+    return qRound(points * kPixelsPerPoint);
 }
 
 std::optional<QColor> ColorOf(quint32 stored)

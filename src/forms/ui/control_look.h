@@ -15,6 +15,9 @@ namespace mirel {
 // made smaller, down to what can just be read; 0: any.
 QFont FontOf(const TextStyle& style, qreal scale, int roomPx);
 
+// What a line of the style's text takes of the form's height, in the form's pixels.
+int LineHeightOf(const TextStyle& style);
+
 // A stored colour; none: the user's palette decides.
 std::optional<QColor> ColorOf(quint32 stored);
 

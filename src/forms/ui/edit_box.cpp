@@ -23,18 +23,14 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int kFrameRoomPx = 4; // what a frame takes of a box's height
-constexpr qreal kPixelsPerPoint = 96.0 / 72.0;
-constexpr int kUsualPoints = 9;
-
+constexpr int kFrameRoomPx = 2; // what a frame takes of a box's height
 // Several lines where the record asks for them and the box has room for two.
 bool HasLines(const ControlDef& definition)
 {
     if (definition.windowStyle & style::kVerticalScrollBar)
         return true;
-    const int points = definition.textStyle.pointSize > 0 ? definition.textStyle.pointSize : kUsualPoints;
     const bool wraps = (definition.windowStyle & style::kAutoHorizontalScroll) == 0;
-    const bool high = definition.height >= 2 * points * kPixelsPerPoint;
+    const bool high = definition.height >= 2 * LineHeightOf(definition.textStyle);
     return high && (wraps || definition.editKind == EditKind::Extendable);
 }
 
@@ -113,7 +109,7 @@ protected:
     virtual void SetEditorText(const QString& text) = 0;
     int TextRoomPx(int heightPx) const override
     {
-        return std::max(heightPx - (Definition().windowStyle & style::kBorder ? kFrameRoomPx : 1), 1);
+        return std::max(heightPx - (Definition().windowStyle & style::kBorder ? kFrameRoomPx : 0), 1);
     }
     const QString& Text() const { return text_; }
 
@@ -167,7 +163,11 @@ public:
         text_->setFrameShape(windowStyle & style::kBorder ? QFrame::StyledPanel : QFrame::NoFrame);
         text_->setVerticalScrollBarPolicy(windowStyle & style::kVerticalScrollBar ? Qt::ScrollBarAlwaysOn
                                                                                   : Qt::ScrollBarAsNeeded);
-        text_->document()->setDefaultTextOption(QTextOption(AlignmentOf(windowStyle)));
+        const bool wraps = (windowStyle & style::kAutoHorizontalScroll) == 0;
+        QTextOption option(AlignmentOf(windowStyle));
+        option.setWrapMode(wraps ? QTextOption::WrapAtWordBoundaryOrAnywhere : QTextOption::NoWrap);
+        text_->setLineWrapMode(wraps ? QPlainTextEdit::WidgetWidth : QPlainTextEdit::NoWrap);
+        text_->document()->setDefaultTextOption(option);
         text_->document()->setDocumentMargin(2);
         connect(text_, &QPlainTextEdit::textChanged, this,
                 [this] { Q_EMIT textEdited(WithLineEndsOf(Text(), text_->toPlainText())); });

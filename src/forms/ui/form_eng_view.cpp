@@ -1,6 +1,7 @@
 #include "forms/ui/form_eng_view.h"
 
 #include "forms/ui/form_surface.h"
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/filter_chip.h"
 
@@ -11,6 +12,7 @@
 #include <QMenuBar>
 #include <QScrollArea>
 #include <QScrollBar>
+#include <QScroller>
 #include <QStackedWidget>
 #include <QTimer>
 #include <QToolBar>
@@ -70,6 +72,8 @@ void CFormEngView::LayOut()
     scroller_->setWidget(surface_);
     scroller_->setFrameShape(QFrame::NoFrame);
     scroller_->setFocusPolicy(Qt::NoFocus);
+    scroller_->setAlignment(Qt::AlignHCenter | Qt::AlignTop);
+    QScroller::grabGesture(scroller_->viewport(), QScroller::TouchGesture);
     scroller_->viewport()->setPalette(surface_->palette());
     scroller_->viewport()->setAutoFillBackground(true);
     scroller_->viewport()->installEventFilter(this);
@@ -199,6 +203,16 @@ bool CFormEngView::eventFilter(QObject* watched, QEvent* event)
         }
     }
     return QMainWindow::eventFilter(watched, event);
+}
+
+void CFormEngView::resizeEvent(QResizeEvent* event)
+{
+    QMainWindow::resizeEvent(event);
+    // On a handheld every pixel of the bar is a button's.
+    for (QAction* action : toolBar_->actions()) {
+        if (action->isSeparator())
+            action->setVisible(!IsHandheldSize(size()));
+    }
 }
 
 void CFormEngView::changeEvent(QEvent* event)

@@ -11,6 +11,7 @@ class QAction;
 class QMenu;
 class QScrollArea;
 class QStackedWidget;
+class QToolBar;
 class QTreeWidget;
 
 namespace mirel {
@@ -59,6 +60,7 @@ protected:
     void closeEvent(QCloseEvent* event) override;
     void changeEvent(QEvent* event) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
     void timerEvent(QTimerEvent* event) override;
 
 private:
@@ -93,6 +95,7 @@ private:
     QScrollArea* scroller_;
     FormSurface* surface_;
     QTreeWidget* detail_;
+    QToolBar* toolBar_ = nullptr;
     FilterChip* chip_ = nullptr;
     QBasicTimer clock_;
     int lastFocused_ = -1;  // outlives the focus's way through a menu

@@ -68,19 +68,19 @@ void CFormEngView::FillMenu(QMenu* menu, std::span<const FormMenuEntry> entries)
 
 void CFormEngView::CreateToolBar()
 {
-    auto* bar = new QToolBar(StringText(Str::FormMenuRecord).remove(u'&'), this);
-    bar->setObjectName(QStringLiteral("records"));
-    bar->setMovable(false);
-    bar->setFloatable(false);
+    toolBar_ = new QToolBar(StringText(Str::FormMenuRecord).remove(u'&'), this);
+    toolBar_->setObjectName(QStringLiteral("records"));
+    toolBar_->setMovable(false);
+    toolBar_->setFloatable(false);
     const int side = style()->pixelMetric(QStyle::PM_SmallIconSize, nullptr, this);
-    bar->setIconSize(QSize(side, side)); // all of them fit on a handheld
+    toolBar_->setIconSize(QSize(side, side)); // all of them fit on a handheld
     for (const FormMenuEntry entry : FormToolBar()) {
         if (entry)
-            bar->addAction(ActionOf(*entry));
+            toolBar_->addAction(ActionOf(*entry));
         else
-            bar->addSeparator();
+            toolBar_->addSeparator();
     }
-    addToolBar(bar);
+    addToolBar(toolBar_);
 }
 
 void CFormEngView::ShowActions()

@@ -2,6 +2,7 @@
 
 #include "tableview/scroll_scale.h"
 
+#include <QGuiApplication>
 #include <QHeaderView>
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -41,7 +42,12 @@ RecordList::RecordList(ControlWidget::ListSource source, QWidget* parent)
     header_->setHighlightSections(false);
     header_->setMinimumSectionSize(2 * kMarginPx);
     connect(header_, &QHeaderView::sectionClicked, this, &RecordList::headerTapped);
+    header_->setAutoFillBackground(true);
     connect(header_, &QHeaderView::sectionResized, this, [this] {
+        // The header sizes its last section by itself as well.
+        if (fitting_ || !QGuiApplication::mouseButtons().testFlag(Qt::LeftButton))
+            return;
+        sizedByHand_ = true;
         UpdateScrollBars();
         viewport()->update();
     });
@@ -64,6 +70,7 @@ void RecordList::SetSortMark(int column, Qt::SortOrder order)
 void RecordList::SetRows(qint64 rows, qint64 selected)
 {
     const bool moved = selected_ != selected;
+    const bool first = rows_ == 0;
     rows_ = rows;
     selected_ = selected;
     top_ = std::clamp<qint64>(top_, 0, HighestTop());
@@ -71,7 +78,7 @@ void RecordList::SetRows(qint64 rows, qint64 selected)
         BringIntoSight(selected_);
     UpdateScrollBars();
     ReadRows();
-    if (!fitted_ && rows_ > 0)
+    if (first)
         FitColumns();
     viewport()->update();
 }
@@ -131,18 +138,22 @@ QString RecordList::Shown(const QString& text) const
     return SingleLine(text.left(most)) + u'…';
 }
 
-// To the rows that are seen first; from then on the widths are the user's. The last column takes what is left.
+// To the rows in sight, until the user sizes them. The last column takes what is left.
 void RecordList::FitColumns()
 {
-    const int columns = names_->columnCount();
-    for (int column = 0; column < columns; ++column) {
+    if (sizedByHand_)
+        return;
+    fitting_ = true;
+    header_->setStretchLastSection(false);
+    for (int column = 0; column < names_->columnCount(); ++column) {
         int width = header_->sectionSizeHint(column);
         for (const QStringList& row : texts_)
             width = std::max(width, fontMetrics().horizontalAdvance(Shown(row.value(column))) + 3 * kMarginPx);
         header_->resizeSection(column, width);
     }
     header_->setStretchLastSection(header_->length() <= viewport()->width());
-    fitted_ = !texts_.empty();
+    fitting_ = false;
+    UpdateScrollBars();
 }
 
 void RecordList::BringIntoSight(qint64 row)
@@ -197,6 +208,7 @@ void RecordList::resizeEvent(QResizeEvent*)
     top_ = std::clamp<qint64>(top_, 0, HighestTop());
     UpdateScrollBars();
     ReadRows();
+    FitColumns();
 }
 
 void RecordList::changeEvent(QEvent* event)
@@ -205,9 +217,7 @@ void RecordList::changeEvent(QEvent* event)
     if (event->type() != QEvent::FontChange)
         return;
     header_->setFont(font());
-    fitted_ = false;
     resizeEvent(nullptr);
-    FitColumns();
 }
 
 void RecordList::keyPressEvent(QKeyEvent* event)

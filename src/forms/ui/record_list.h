@@ -60,7 +60,8 @@ private:
     qint64 selected_ = -1;
     qint64 top_ = 0;                 // the first row in sight
     std::vector<QStringList> texts_; // from `top_` on
-    bool fitted_ = false;            // the columns, to the rows that came first
+    bool sizedByHand_ = false;       // the columns: they are not fitted any more
+    bool fitting_ = false;
     bool syncing_ = false;
 };
 

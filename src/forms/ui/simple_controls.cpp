@@ -8,6 +8,8 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QSignalBlocker>
+#include <QStyleOptionButton>
+#include <QStylePainter>
 
 #include <algorithm>
 #include <limits>
@@ -16,6 +18,9 @@ namespace mirel {
 namespace {
 
 constexpr int kLeastTargetPx = 24; // what a stylus hits
+constexpr int kFramePx = 4;        // above and below a text together
+constexpr qreal kLeastPoints = 6;
+constexpr int kMostSquarePx = 22; // of a check box
 
 // A drop-down box whose items are read when its list is opened.
 class LazyComboBox : public QComboBox {
@@ -33,6 +38,39 @@ public:
 };
 
 } // namespace
+
+// A check box without a caption, its square as large as the form has it. What can be hit around the square is as
+// large as a stylus needs.
+class TickBox : public QCheckBox {
+public:
+    using QCheckBox::QCheckBox;
+
+    void WidenTarget()
+    {
+        square_ = QRect(QPoint(), size());
+        const int higher = std::max(kLeastTargetPx - height(), 0);
+        setGeometry(
+            geometry().adjusted(0, -higher / 2, std::max(kLeastTargetPx - width(), 0), higher - higher / 2));
+        square_.translate(0, higher / 2);
+        const int side = std::min({square_.width(), square_.height(), kMostSquarePx});
+        square_ = QRect(square_.left(), square_.center().y() - side / 2, side, side);
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QStylePainter painter(this);
+        QStyleOptionButton option;
+        initStyleOption(&option);
+        option.rect = square_;
+        painter.drawPrimitive(QStyle::PE_IndicatorCheckBox, option);
+    }
+
+    bool hitButton(const QPoint& position) const override { return rect().contains(position); }
+
+private:
+    QRect square_;
+};
 
 // --- label --------------------------------------------------------------------------------------------------
 
@@ -114,14 +152,15 @@ void DropDownWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
     // A stored height may be that of the box with its list let down.
-    const int line = box_->fontMetrics().height();
-    if (box_->height() > 3 * line)
-        box_->resize(box_->width(), std::min(box_->height(), std::max(box_->sizeHint().height(), 2 * line)));
+    const ControlDef& definition = Definition();
+    const int closed = LineHeightOf(definition.textStyle) + kFramePx;
+    if (definition.height > 2 * closed)
+        box_->resize(box_->width(), qRound(closed * scale.y));
 }
 
 int DropDownWidget::TextRoomPx(int heightPx) const
 {
-    return std::max(heightPx - 4, 1);
+    return std::max(heightPx - kFramePx, 1);
 }
 
 bool DropDownWidget::OpenMore()
@@ -145,16 +184,29 @@ void ButtonWidget::Show(const ControlRun& control)
     button_->setText(control.text);
 }
 
+// A caption that is wider than its button is made smaller.
+void ButtonWidget::Place(const SurfaceScale& scale)
+{
+    ControlWidget::Place(scale);
+    const int room = button_->width() - kFramePx;
+    const int width = button_->fontMetrics().size(Qt::TextShowMnemonic, button_->text()).width();
+    if (width <= room)
+        return;
+    QFont font = button_->font();
+    font.setPointSizeF(std::max(font.pointSizeF() * room / width, kLeastPoints));
+    button_->setFont(font);
+}
+
 int ButtonWidget::TextRoomPx(int heightPx) const
 {
-    return std::max(heightPx - 4, 1);
+    return std::max(heightPx - kFramePx, 1);
 }
 
 // --- check box ----------------------------------------------------------------------------------------------
 
 CheckBoxWidget::CheckBoxWidget(const ControlRun& control, QWidget& surface)
-    : ControlWidget(control, *new QCheckBox(&surface))
-    , box_(static_cast<QCheckBox*>(Main()))
+    : ControlWidget(control, *new TickBox(&surface))
+    , box_(static_cast<TickBox*>(Main()))
 {
     box_->setAutoFillBackground(Definition().backgroundColor != kDefaultColor);
     SetColors(QPalette::Window, QPalette::WindowText);
@@ -166,16 +218,10 @@ void CheckBoxWidget::Show(const ControlRun& control)
     box_->setChecked(control.ticked);
 }
 
-// The box stands where the form has it; what can be hit around it is as large as a stylus needs.
 void CheckBoxWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
-    const QRect place = box_->geometry();
-    if (place.isEmpty())
-        return;
-    const int higher = std::max(kLeastTargetPx - place.height(), 0);
-    box_->setGeometry(
-        place.adjusted(0, -higher / 2, std::max(kLeastTargetPx - place.width(), 0), higher - higher / 2));
+    box_->WidenTarget();
 }
 
 } // namespace mirel

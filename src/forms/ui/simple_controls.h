@@ -2,12 +2,13 @@
 
 #include "forms/ui/control_widget.h"
 
-class QCheckBox;
 class QComboBox;
 class QLabel;
 class QPushButton;
 
 namespace mirel {
+
+class TickBox;
 
 class LabelWidget : public ControlWidget {
     Q_OBJECT
@@ -43,6 +44,7 @@ class ButtonWidget : public ControlWidget {
 public:
     ButtonWidget(const ControlRun& control, QWidget& surface);
     void Show(const ControlRun& control) override;
+    void Place(const SurfaceScale& scale) override;
 
 protected:
     int TextRoomPx(int heightPx) const override;
@@ -59,7 +61,7 @@ public:
     void Place(const SurfaceScale& scale) override;
 
 private:
-    QCheckBox* box_;
+    TickBox* box_;
 };
 
 } // namespace mirel

@@ -5,10 +5,12 @@
 namespace mirel {
 namespace {
 
-constexpr qreal kLeast = 0.85; // below it, labels of 9 points cannot be read
+// Below these, boxes of one line do not take a text of 9 points any more.
+constexpr qreal kLeastX = 0.85;
+constexpr qreal kLeastY = 0.93;
 constexpr qreal kMost = 2.4;
 constexpr qreal kMostStretch = 2.1; // of one direction against the other
-constexpr qreal kMostText = 1.5;
+constexpr qreal kMostText = 1.4;
 constexpr qreal kFarthestPx = 1 << 22; // what a window system's widget may measure, and some to spare
 
 int Pixels(qreal length)
@@ -29,8 +31,8 @@ SurfaceScale SurfaceScale::ToFit(QSize form, QSize window)
     const qreal wide = Ratio(form.width(), window.width());
     const qreal high = Ratio(form.height(), window.height());
     // What must be scrolled anyway need not be squeezed.
-    qreal x = wide < kLeast ? 1.0 : std::min(wide, kMost);
-    qreal y = high < kLeast ? std::clamp(x, 1.0, kMostText) : std::min(high, kMost);
+    qreal x = wide < kLeastX ? 1.0 : std::min(wide, kMost);
+    qreal y = high < kLeastY ? std::clamp(x, 1.0, kMostText) : std::min(high, kMost);
     x = std::min(x, y * kMostStretch);
     y = std::min(y, x * kMostStretch);
     return {x, y};
