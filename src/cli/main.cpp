@@ -1,5 +1,6 @@
 #include "cli/console_prompt.h"
 #include "cli/run.h"
+#include "provider/stop_check.h"
 
 #include <QCoreApplication>
 
@@ -22,6 +23,7 @@ int main(int argc, char** argv)
     for (int i = 1; i < argc; ++i)
         words += QString::fromUtf8(argv[i]);
     mirel::cli::CatchInterrupts();
+    mirel::SetStopCheck(mirel::cli::WasInterrupted);
     mirel::cli::Output output(STDOUT_FILENO);
     return int(mirel::cli::RunProgram(words, output));
 }

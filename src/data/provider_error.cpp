@@ -1,6 +1,7 @@
 #include "data/provider_error.h"
 
 #include "data/statement_text.h"
+#include "provider/stop_check.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
@@ -61,7 +62,7 @@ QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& co
 
 void ReportProviderError(UserPrompt& prompt, const DbRecordset* recordset, Hr hr)
 {
-    if (!Failed(hr))
+    if (!Failed(hr) || hr == kStopped)
         return;
     const bool withContext = recordset && ShowsContext(MessageOf(recordset, hr));
     const QString context = withContext ? recordset->ErrorContext() : QString();

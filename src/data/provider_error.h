@@ -10,7 +10,7 @@ namespace mirel {
 QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& context);
 
 // The single place where a failure of the provider becomes a message to the user. Nothing happens when `hr` is
-// no failure.
+// no failure, or says that the user stopped it.
 void ReportProviderError(UserPrompt& prompt, const DbRecordset* recordset, Hr hr);
 
 } // namespace mirel

@@ -1,5 +1,6 @@
 // Files that were made to do harm, or that no care was taken with: refused or shown, never followed.
 #include "provider/database_fixture.h"
+#include "provider/stop_check.h"
 
 #include <QElapsedTimer>
 #include <QFileInfo>
@@ -303,6 +304,24 @@ TEST_F(HostileFile, HasStrangeCompanions)
             provider->CloseDatabase(path);
         }
     }
+}
+
+TEST_F(HostileFile, AViewWithoutAnEndCanBeStopped)
+{
+    Run(u"CREATE TABLE T (A Integer)"_s);
+    Outside("WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<100000) INSERT INTO T SELECT n "
+            "FROM s; CREATE VIEW endless AS WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s) SELECT "
+            "n FROM s");
+    int asked = 0;
+    SetStopCheck([&asked] { return ++asked > 2; });
+    auto cursor = provider->CreateRecordset();
+    EXPECT_EQ(cursor->Open(u"endless"_s, path, CursorType::Static, LockType::ReadOnly), kStopped);
+    EXPECT_EQ(Try(u"SELECT COUNT(*) FROM endless"_s), kStopped);
+    EXPECT_GT(asked, 3);
+    SetStopCheck([] { return true; });
+    Run(u"UPDATE T SET A=7"_s); // what writes is not asked about
+    SetStopCheck({});
+    EXPECT_EQ(Rows(u"SELECT COUNT(*) FROM T WHERE A=7"_s), QStringList{u"100000"_s});
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 #include "provider/sqlite/functions.h"
 #include "provider/sqlite/schema_reader.h"
 #include "provider/sqlite/system_tables.h"
+#include "provider/stop_check.h"
 #include "resources/string_table.h"
 
 #include <QDir>
@@ -60,6 +61,15 @@ constexpr const char* kSettings = "PRAGMA cell_size_check=ON;"
 // The page size holds from the first page that is written.
 const QByteArray kNewDatabase =
     "PRAGMA page_size=16384; PRAGMA application_id=" + QByteArray::number(kApplicationId);
+
+// The engine takes a few milliseconds for so many operations.
+constexpr int kOperationsPerLook = 200'000;
+
+// A statement that writes is left alone: ending it would take back the whole run that it is part of.
+int EndLongRead(void* handle)
+{
+    return sqlite3_txn_state(static_cast<sqlite3*>(handle), "main") != SQLITE_TXN_WRITE && IsStopWanted() ? 1 : 0;
+}
 
 // What the engine keeps beside a database.
 constexpr std::array kCompanions = {"-journal", "-wal", "-shm"};
@@ -146,6 +156,7 @@ Outcome DatabaseFile::OpenHandle(bool readOnly)
         sqlite3_limit(raw, limit.what, limit.value);
     for (const Option& option : kOptions)
         sqlite3_db_config(raw, option.what, option.value, nullptr);
+    sqlite3_progress_handler(raw, kOperationsPerLook, EndLongRead, raw);
     result = RegisterFunctions(raw);
     if (result == SQLITE_OK)
         result = RegisterSystemTables(raw, schema_);

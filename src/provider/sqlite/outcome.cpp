@@ -1,6 +1,7 @@
 #include "provider/sqlite/outcome.h"
 
 #include "provider/sqlite/dialect_functions.h"
+#include "provider/stop_check.h"
 #include "resources/string_table.h"
 
 #include <sqlite3.h>
@@ -24,6 +25,8 @@ Outcome OutcomeOfSqlite(int resultCode, const QString& path, const QString& reas
         return {Hr::AccessDenied, StringText(Str::DatabaseFailure, {path, reason})};
     case SQLITE_CANTOPEN:
         return {Hr::CannotOpen, StringText(Str::DatabaseFailure, {path, reason})};
+    case SQLITE_INTERRUPT:
+        return {kStopped, {}};
     case SQLITE_NOMEM:
         return {Hr::OutOfMemory, {}};
     case SQLITE_FULL:
