@@ -170,6 +170,9 @@ bool BlockCommands::Write(qint64 first, const std::vector<int>& fields, const Te
         }
         return values;
     };
+    if (records * qint64(fields.size()) > RecordBrowser::kMostUndoneCells &&
+        !prompt_.AskYesNo({Str::BeyondUndo, {}}))
+        return false;
     RecordBrowser::ManyChanged changed;
     {
         const std::unique_ptr<Progress> progress = prompt_.StartProgress({Str::PastingCells, {}}, records);

@@ -219,6 +219,9 @@ public:
     bool AddRecord();
     bool DeleteRecord(); // all records that have selected cells
 
+    // What is more than this is not kept to be taken back: whoever changes so many cells asks first.
+    static constexpr qint64 kMostUndoneCells = 200'000;
+
     // What a change of many records came to. Where it stopped early, the records before are written.
     struct ManyChanged {
         qint64 records = 0;    // written
@@ -269,13 +272,14 @@ private:
 
     // The records.
     std::vector<FieldChange> NewRecordValues() const;
-    bool ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step& step);
-    bool AddOne(std::vector<FieldChange> values, UndoLog::Step& step);
+    // A step of null: it is not to be undone.
+    bool ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step* step);
+    bool AddOne(std::vector<FieldChange> values, UndoLog::Step* step);
     std::optional<RecordChange> NewChange(RecordChange::Kind kind) const; // none: it cannot be undone
     void NoteAdded(UndoLog::Step& step) const;
     void NoteDeleted(DbRecordset& table, UndoLog::Step& step);
     bool DeleteBlock();
-    bool DeleteFrom(qint64 first, qint64 last, UndoLog::Step& step);
+    bool DeleteFrom(qint64 first, qint64 last, UndoLog::Step* step);
 
     DbConnection& connection_;
     DbRecordset recordset_;

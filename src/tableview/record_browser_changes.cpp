@@ -61,7 +61,7 @@ bool RecordBrowser::AddRecord()
     if (!IsOpen() || FieldCount() == 0 || !WriteEdit())
         return false;
     UndoLog::Step step;
-    if (!AddOne({}, step)) {
+    if (!AddOne({}, &step)) {
         ReportFailure();
         return false;
     }
@@ -132,7 +132,8 @@ RecordBrowser::ChangeRecords(qint64 first, qint64 count,
         });
         if (refused != wanted.end())
             changed.refusedField = refused->field;
-        if (ChangeOne(first + changed.records, wanted, step))
+        const bool isUndone = count * qint64(wanted.size()) <= kMostUndoneCells;
+        if (ChangeOne(first + changed.records, wanted, isUndone ? &step : nullptr))
             ++changed.records;
         else
             changed.failure = ProviderErrorText(&recordset_, recordset_.LastResult(), recordset_.ErrorContext());
@@ -155,6 +156,9 @@ bool RecordBrowser::DeleteBlock()
     if (settings_.confirmDelete &&
         !prompt_.AskYesNo({Str::DeleteRecordsQuestion, {QString::number(block.Records())}}))
         return false;
+    const bool isUndone = block.Records() * FieldCount() <= kMostUndoneCells;
+    if (!isUndone && !prompt_.AskYesNo({Str::BeyondUndo, {}}))
+        return false;
     ProviderConnection& provider = *connection_.Provider();
     Hr result = provider.BeginBulk(database_);
     if (Failed(result)) {
@@ -162,7 +166,7 @@ bool RecordBrowser::DeleteBlock()
         return false;
     }
     UndoLog::Step step;
-    const bool deleted = DeleteFrom(block.firstRecord, block.lastRecord, step);
+    const bool deleted = DeleteFrom(block.firstRecord, block.lastRecord, isUndone ? &step : nullptr);
     if (!deleted)
         ReportFailure();
     result = provider.EndBulk(database_);
@@ -178,7 +182,7 @@ bool RecordBrowser::DeleteBlock()
 }
 
 // From the last to the first, so that those still to go keep their places. A stop is no failure.
-bool RecordBrowser::DeleteFrom(qint64 first, qint64 last, UndoLog::Step& step)
+bool RecordBrowser::DeleteFrom(qint64 first, qint64 last, UndoLog::Step* step)
 {
     constexpr qint64 kRecordsAStep = 64;
     const std::unique_ptr<Progress> progress =
@@ -189,20 +193,23 @@ bool RecordBrowser::DeleteFrom(qint64 first, qint64 last, UndoLog::Step& step)
             return true;
         if (!recordset_.MoveTo(record))
             return false;
-        NoteDeleted(table, step);
+        if (step)
+            NoteDeleted(table, *step);
         if (!recordset_.Delete())
             return false;
     }
     return true;
 }
 
-bool RecordBrowser::ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step& step)
+bool RecordBrowser::ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step* step)
 {
     if (record >= *count_)
         return AddOne(std::move(values), step);
     if (!recordset_.MoveTo(record))
         return false;
-    std::optional<RecordChange> change = NewChange(RecordChange::Kind::Changed);
+    std::optional<RecordChange> change;
+    if (step)
+        change = NewChange(RecordChange::Kind::Changed);
     const auto read = [&](Value RecordChange::Field::*into) {
         for (size_t i = 0; change && i < values.size(); ++i)
             change->fields[i].*into = recordset_.FieldValue(values[i].field);
@@ -216,11 +223,11 @@ bool RecordBrowser::ChangeOne(qint64 record, std::vector<FieldChange> values, Un
         return false;
     read(&RecordChange::Field::after);
     if (change)
-        step.push_back(std::move(*change));
+        step->push_back(std::move(*change));
     return true;
 }
 
-bool RecordBrowser::AddOne(std::vector<FieldChange> values, UndoLog::Step& step)
+bool RecordBrowser::AddOne(std::vector<FieldChange> values, UndoLog::Step* step)
 {
     for (const FieldChange& preset : NewRecordValues()) {
         if (std::ranges::find(values, preset.field, &FieldChange::field) == values.end())
@@ -228,7 +235,8 @@ bool RecordBrowser::AddOne(std::vector<FieldChange> values, UndoLog::Step& step)
     }
     if (!recordset_.AddNew(values))
         return false;
-    NoteAdded(step);
+    if (step)
+        NoteAdded(*step);
     return true;
 }
 

@@ -19,8 +19,10 @@ QString TableOf(const QList<KeyHint>& rows)
     for (const KeyHint& row : rows) {
         QString what = row.what;
         what.remove(u'&').remove(u" ..."_s);
-        html += u"<tr><td width=\"42%\"><b>%1</b></td><td>%2</td></tr>"_s.arg(row.keys.toHtmlEscaped(),
-                                                                              what.toHtmlEscaped());
+        QString keys = row.keys.toHtmlEscaped();
+        keys.replace(u", "_s, u"<br>"_s);
+        html +=
+            u"<tr><td style=\"white-space:pre\"><b>%1</b></td><td>%2</td></tr>"_s.arg(keys, what.toHtmlEscaped());
     }
     return html + u"</table>"_s;
 }

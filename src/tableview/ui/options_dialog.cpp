@@ -21,6 +21,17 @@ namespace {
 constexpr int kMostCharacters = 9999;
 constexpr int kLongestHoldMs = 5000;
 
+// A box takes no text of several lines by itself.
+void BreakInTwo(QCheckBox& box, int roomPx)
+{
+    if (box.sizeHint().width() <= roomPx)
+        return;
+    QString text = box.text();
+    const qsizetype blank = text.indexOf(u' ', text.size() / 2);
+    if (blank >= 0)
+        box.setText(text.replace(blank, 1, u'\n'));
+}
+
 } // namespace
 
 COptionsDialog::COptionsDialog(const TableViewSettings& settings, QWidget* parent)
@@ -101,6 +112,8 @@ void COptionsDialog::LayOut()
     whole->addWidget(buttons);
     resize((scroller->sizeHint() + QSize(2, 3) * fontMetrics().height()).boundedTo(screen()->availableSize()));
     FillSmallWindow(*this, *parentWidget()->window());
+    for (QCheckBox* box : {confirmDelete_, popup_, sortByHeader_})
+        BreakInTwo(*box, width() - 5 * margin);
     characters_->setAccessibleName(StringText(Str::OptionColumnGroup));
     holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup));
 }
