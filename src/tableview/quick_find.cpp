@@ -43,7 +43,6 @@ void QuickFind::Begin(const QString& text, Direction direction, From from)
     state_ = nothing ? State::NotFound : State::Searching;
     if (nothing)
         return;
-    count_ = browser_.Recordset().RecordCount();
     const auto at = std::ranges::find(fields_, browser_.SelectedField());
     start_ = {browser_.SelectedRecord(), at == fields_.end() ? 0 : int(at - fields_.begin())};
     next_ = start_.record;
@@ -92,30 +91,30 @@ std::optional<int> QuickFind::MatchIn(std::span<const Cell> cells, qint64 record
     return {};
 }
 
+// The way on needs no count of the records: a large result would have to be walked through for it first.
 bool QuickFind::ReadOn(int budgetMs, std::optional<CellPlace>& found)
 {
     QElapsedTimer clock;
     clock.start();
-    const qint64 end = wrapped_ ? start_.record + 1 : count_;
+    bool atEnd = true;
     qint64 record = next_;
-    const ReadRange range{.first = next_, .count = end - next_, .fields = fields_};
+    const qint64 count = wrapped_ ? start_.record + 1 - next_ : -1;
+    const ReadRange range{.first = next_, .count = count, .fields = fields_};
     const bool read = browser_.Recordset().Read(range, [&](std::span<const Cell> cells) {
         if (const std::optional<int> column = MatchIn(cells, record))
             found = CellPlace{record, *column};
         ++record;
-        return !found && (record % kRecordsALook != 0 || clock.elapsed() < budgetMs);
+        atEnd = !found && (record % kRecordsALook != 0 || clock.elapsed() < budgetMs);
+        return atEnd;
     });
     looked_ += record - next_;
-    const bool stuck = record == next_; // another program has taken the rest away
     next_ = record;
-    if (found || (next_ < end && !stuck))
+    if (found || !atEnd)
         return read;
-    if (wrapped_) {
+    if (wrapped_)
         state_ = State::NotFound;
-    } else {
-        wrapped_ = true;
-        next_ = 0;
-    }
+    wrapped_ = true;
+    next_ = 0;
     return read;
 }
 
@@ -142,7 +141,7 @@ bool QuickFind::ReadBack(int budgetMs, std::optional<CellPlace>& found)
         if (wrapped_)
             state_ = State::NotFound;
         wrapped_ = true;
-        next_ = count_ - 1;
+        next_ = browser_.Recordset().RecordCount() - 1;
     } while (read && !found && state_ == State::Searching && clock.elapsed() < budgetMs);
     return read;
 }

@@ -54,7 +54,6 @@ private:
     State state_ = State::Idle;
     std::vector<int> fields_;
     CellPlace start_; // its column is an index of fields_
-    qint64 count_ = 0;
     qint64 next_ = 0; // the record to look at
     qint64 looked_ = 0;
     bool wrapped_ = false;
