@@ -41,6 +41,14 @@ Value PastedValue(const QString& text, FieldType type, const YesNoWords& words)
     return Value::Text(IsNumber(type) || type == FieldType::Date ? text.trimmed() : text);
 }
 
+QStringList AllOf(const TextRows& rows)
+{
+    QStringList all;
+    for (const QStringList& row : rows)
+        all += row;
+    return all;
+}
+
 } // namespace
 
 std::optional<TextRows> BlockCommands::Copy(FieldNames names)
@@ -110,16 +118,21 @@ bool BlockCommands::AskAboutRoom(TextRows& rows, qint64 width, qint64 room)
     return true;
 }
 
+bool BlockCommands::AskAboutRecords(qint64 first, qint64 records)
+{
+    const qint64 count = browser_.Recordset().RecordCount();
+    const qint64 added = IsDetail() ? 0 : first + records - count;
+    return added <= 0 ||
+           prompt_.AskYesNo({Str::PasteAddsRecords,
+                             {QString::number(records), QString::number(count - first), QString::number(added)}});
+}
+
 bool BlockCommands::Paste(TextRows rows)
 {
     if (!browser_.CanUpdate() || rows.empty() || !browser_.WriteEdit())
         return false;
-    if (IsDetail()) {
-        QStringList all;
-        for (const QStringList& row : rows)
-            all += row;
-        rows = {all};
-    }
+    if (IsDetail())
+        rows = {AllOf(rows)};
     const CellBlock block = browser_.Block();
     const qint64 first = IsDetail() ? browser_.SelectedRecord() : std::max<qint64>(block.firstRecord, 0);
     std::vector<int> fields = FieldsFrom(block.IsEmpty() ? 0 : block.firstColumn);
@@ -138,13 +151,7 @@ bool BlockCommands::Paste(TextRows rows)
         prompt_.Show({Str::PasteReadOnly, {browser_.FieldName(*fixed)}});
         return false;
     }
-    const qint64 count = browser_.Recordset().RecordCount();
-    const qint64 added = IsDetail() ? 0 : first + records - count;
-    if (added > 0 &&
-        !prompt_.AskYesNo({Str::PasteAddsRecords,
-                           {QString::number(records), QString::number(count - first), QString::number(added)}}))
-        return false;
-    return Write(first, fields, rows, records);
+    return AskAboutRecords(first, records) && Write(first, fields, rows, records);
 }
 
 bool BlockCommands::Clear()
@@ -182,14 +189,18 @@ bool BlockCommands::Write(qint64 first, const std::vector<int>& fields, const Te
         const int column = browser_.Page().ColumnOfField(fields.front());
         browser_.SelectBlock({first, first + changed.records - 1, column, column + int(fields.size()) - 1});
     }
-    if (changed.records == records)
-        return true;
+    return changed.records == records || Tell(changed, first, records, fields.front());
+}
+
+// Why not all was written; the refused cell is the selected one then.
+bool BlockCommands::Tell(const RecordBrowser::ManyChanged& changed, qint64 first, qint64 records, int firstField)
+{
     const QStringList counts = {QString::number(changed.records), QString::number(records)};
     if (changed.failure.isEmpty()) {
         prompt_.Show({Str::PasteStopped, counts});
         return false;
     }
-    const int refused = changed.refusedField < 0 ? fields.front() : changed.refusedField;
+    const int refused = changed.refusedField < 0 ? firstField : changed.refusedField;
     (void)browser_.GoToCell(std::min(first + changed.records, browser_.Recordset().RecordCount() - 1), refused);
     const QString place =
         StringText(Str::PasteFailedAt, {browser_.FieldName(refused), QString::number(first + changed.records + 1),

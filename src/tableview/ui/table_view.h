@@ -71,6 +71,7 @@ private:
     void ConnectParts();
 
     void Do(TableCommand command);
+    void DoHere(TableCommand command); // what neither the browser nor the result's commands do
     bool Run(bool (*call)(RecordBrowser&)) { return Settle(call(browser_)); }
     // After every call of the browser: shows what it holds now. When a write was refused, the user is told why
     // once the event that led here is over, and stays in the editor. Gives `done` back.

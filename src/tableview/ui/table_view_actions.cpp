@@ -220,6 +220,16 @@ void CTableView::Do(TableCommand command)
             Q_EMIT lookRequested(look->item);
         return;
     }
+    if (const std::optional<bool> done = resultCommands_->Do(command)) {
+        Settle(*done);
+        stack_->currentWidget()->setFocus();
+        return;
+    }
+    DoHere(command);
+}
+
+void CTableView::DoHere(TableCommand command)
+{
     switch (command) {
     case Command::EditCell:
         return Edit(nullptr);
@@ -259,11 +269,7 @@ void CTableView::Do(TableCommand command)
     case Command::Close:
         close();
         return;
-    default: // the rest is the browser's, above, or the result's
-        if (const std::optional<bool> done = resultCommands_->Do(command)) {
-            Settle(*done);
-            stack_->currentWidget()->setFocus();
-        }
+    default: // the rest was done above
         return;
     }
 }
