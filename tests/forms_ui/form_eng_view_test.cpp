@@ -435,8 +435,8 @@ TEST(SurfaceScale, FillsTheWindowAndStaysReadable)
     } rows[] = {{"as it is", {240, 260}, {240, 260}, {240, 260}},
                 {"a little too wide is squeezed", {250, 260}, {240, 260}, {240, 260}},
                 {"far too large is scrolled", {600, 900}, {240, 260}, {600, 900}},
-                {"a low form is stretched, not beyond its shape", {240, 50}, {240, 500}, {240, 105}},
-                {"a large window has its limit", {100, 100}, {1000, 1000}, {240, 240}},
+                {"a low form is stretched, not beyond its shape", {240, 50}, {240, 500}, {240, 100}},
+                {"a large window has its limit", {100, 100}, {1000, 1000}, {200, 200}},
                 {"no size at all", {0, 0}, {240, 260}, {0, 0}}};
     for (const auto& row : rows)
         EXPECT_EQ(SurfaceScale::ToFit(row.form, row.window).Of(row.form), row.shown) << row.what;

@@ -17,10 +17,22 @@
 namespace mirel {
 namespace {
 
-constexpr int kLeastTargetPx = 24; // what a stylus hits
-constexpr int kFramePx = 4;        // above and below a text together
-constexpr qreal kLeastPoints = 6;
+constexpr int kLeastTargetPx = 24;   // what a stylus hits
+constexpr int kFramePx = 4;          // above and below a text together
+constexpr qreal kLeastCaption = 0.6; // of its font: what a caption is narrowed to before it is cut
+constexpr qreal kLeastLabel = 0.85;
 constexpr int kMostSquarePx = 22; // of a check box
+
+// Makes the font of a text that is wider than its room smaller, down to that part of it.
+void Narrow(QWidget& widget, const QString& text, int roomPx, qreal least)
+{
+    const int width = widget.fontMetrics().size(Qt::TextShowMnemonic, text).width();
+    if (width <= roomPx)
+        return;
+    QFont font = widget.font();
+    font.setPointSizeF(font.pointSizeF() * std::max(qreal(roomPx) / width, least));
+    widget.setFont(font);
+}
 
 // A drop-down box whose items are read when its list is opened.
 class LazyComboBox : public QComboBox {
@@ -93,14 +105,21 @@ void LabelWidget::Show(const ControlRun& control)
 void LabelWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
+    if (IsSingleLine())
+        Narrow(*label_, text_, label_->contentsRect().width(), kLeastLabel);
     ShowText();
+}
+
+bool LabelWidget::IsSingleLine() const
+{
+    return Definition().height < 2 * LineHeightOf(Definition().textStyle);
 }
 
 // A label of one line stands in the middle, as the text of the box beside it does, and gives way in its own
 // middle; a higher one breaks its lines.
 void LabelWidget::ShowText()
 {
-    const bool single = label_->height() < 2 * label_->fontMetrics().height();
+    const bool single = IsSingleLine();
     label_->setWordWrap(!single);
     label_->setAlignment(AlignmentOf(Definition().windowStyle) | (single ? Qt::AlignVCenter : Qt::AlignTop));
     const QString shown =
@@ -184,17 +203,10 @@ void ButtonWidget::Show(const ControlRun& control)
     button_->setText(control.text);
 }
 
-// A caption that is wider than its button is made smaller.
 void ButtonWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
-    const int room = button_->width() - kFramePx;
-    const int width = button_->fontMetrics().size(Qt::TextShowMnemonic, button_->text()).width();
-    if (width <= room)
-        return;
-    QFont font = button_->font();
-    font.setPointSizeF(std::max(font.pointSizeF() * room / width, kLeastPoints));
-    button_->setFont(font);
+    Narrow(*button_, button_->text(), button_->width() - kFramePx, kLeastCaption);
 }
 
 int ButtonWidget::TextRoomPx(int heightPx) const

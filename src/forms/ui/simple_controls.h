@@ -18,6 +18,7 @@ public:
     void Place(const SurfaceScale& scale) override;
 
 private:
+    bool IsSingleLine() const;
     void ShowText();
 
     QLabel* label_;

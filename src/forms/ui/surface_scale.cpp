@@ -8,7 +8,7 @@ namespace {
 // Below these, boxes of one line do not take a text of 9 points any more.
 constexpr qreal kLeastX = 0.85;
 constexpr qreal kLeastY = 0.93;
-constexpr qreal kMost = 2.4;
+constexpr qreal kMost = 2.0;
 constexpr qreal kMostStretch = 2.1; // of one direction against the other
 constexpr qreal kMostText = 1.4;
 constexpr qreal kFarthestPx = 1 << 22; // what a window system's widget may measure, and some to spare
