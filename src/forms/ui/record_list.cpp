@@ -44,8 +44,11 @@ RecordList::RecordList(ControlWidget::ListSource source, QWidget* parent)
     connect(header_, &QHeaderView::sectionClicked, this, &RecordList::headerTapped);
     header_->setAutoFillBackground(true);
     connect(header_, &QHeaderView::sectionResized, this, [this] {
-        // The header sizes its last section by itself as well.
-        if (fitting_ || !QGuiApplication::mouseButtons().testFlag(Qt::LeftButton))
+        // The header sizes its last section by itself as well; and a form opened by a double click is laid out
+        // while the button is down.
+        const bool dragged =
+            header_->viewport()->underMouse() && QGuiApplication::mouseButtons().testFlag(Qt::LeftButton);
+        if (fitting_ || !dragged)
             return;
         sizedByHand_ = true;
         UpdateScrollBars();
