@@ -4,6 +4,7 @@
 #include "cli/run.h"
 #include "forms/default_form.h"
 #include "forms/form_file.h"
+#include "platform/shared_file.h"
 #include "resources/string_table.h"
 
 #include <QFile>
@@ -126,6 +127,10 @@ ExitStatus RunFormsExport(Run& run)
     if (QFileInfo::exists(path) && !run.Args().Has(Opt::Yes)) {
         run.Prompt().Show({Str::CliFileExists, {path}});
         return ExitStatus::BadArguments;
+    }
+    if (IsSameFile(path, run.Session().Path()) || IsSameFile(path, store->Path())) {
+        run.Prompt().Show({Str::FileCreationFail, {path}});
+        return ExitStatus::Failed;
     }
     QString error;
     if (ExportForm(*form, path, error))

@@ -10,6 +10,12 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
+bool IsSameFile(const QString& path, const QString& other)
+{
+    const QString place = QFileInfo(path).canonicalFilePath();
+    return !place.isEmpty() && place == QFileInfo(other).canonicalFilePath();
+}
+
 std::optional<QByteArray> ReadWholeFile(const QString& path)
 {
     QFile file(path);

@@ -8,6 +8,9 @@
 
 namespace mirel {
 
+// Whether both paths lead to one file that is there, whatever links are on the way.
+bool IsSameFile(const QString& path, const QString& other);
+
 // Small text files that several programs change: the profile, the favourites.
 
 // Empty when the file is missing or cannot be read.

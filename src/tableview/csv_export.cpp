@@ -1,6 +1,7 @@
 #include "tableview/csv_export.h"
 
 #include "data/provider_error.h"
+#include "platform/shared_file.h"
 #include "resources/string_table.h"
 
 #include <QBuffer>
@@ -12,13 +13,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-// Whatever links lead there.
-bool IsSameFile(const QString& path, const QString& other)
-{
-    const QString place = QFileInfo(path).canonicalFilePath();
-    return !place.isEmpty() && place == QFileInfo(other).canonicalFilePath();
-}
 
 constexpr qint64 kRecordsPerStep = 1024; // between two looks at the progress display
 

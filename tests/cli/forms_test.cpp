@@ -164,6 +164,7 @@ TEST_F(FormsCommands, CarryFormsFromFileToFile)
     Do({u"forms"_s, u"delete"_s, u"a.cdb"_s, u"Copy"_s, u"--yes"_s});
     EXPECT_FALSE(Do(list).contains(u"Copy"_s));
     for (const QStringList& words : {QStringList{u"export"_s, u"a.cdb"_s, u"Nobody"_s, u"n.pfs"_s},
+                                     {u"export"_s, u"a.cdb"_s, u"DefaultForm"_s, u"a.cdb"_s, u"--yes"_s},
                                      {u"show"_s, u"a.cdb"_s, u"Nobody"_s},
                                      {u"delete"_s, u"a.cdb"_s, u"Nobody"_s, u"--yes"_s},
                                      {u"import"_s, u"a.cdb"_s, u"missing.pfs"_s},
