@@ -71,7 +71,9 @@ QString TextOfRows(const TextRows& rows)
             cells += Quoted(cell);
         lines += cells.join(u'\t');
     }
-    return lines.join(u'\n');
+    // An empty cell at the end would be taken for the line end behind the row before it.
+    const bool endsEmpty = lines.size() > 1 && lines.back().isEmpty();
+    return lines.join(u'\n') + (endsEmpty ? u"\n"_s : QString());
 }
 
 TextRows RowsOfText(QStringView text)

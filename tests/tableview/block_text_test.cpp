@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <QRandomGenerator>
+
 namespace mirel {
 namespace {
 
@@ -21,6 +23,8 @@ TEST(BlockText, IsWhatSpreadsheetsWriteAndRead)
         {"a row", {{u"Ann"_s, u""_s, u"3"_s}}, u"Ann\t\t3"_s},
         {"two rows", {{u"a"_s, u"b"_s}, {u"c"_s, u"d"_s}}, u"a\tb\nc\td"_s},
         {"empty cells at the ends", {{u""_s, u"b"_s}, {u"c"_s, u""_s}}, u"\tb\nc\t"_s},
+        {"an empty cell at the very end", {{u"a"_s}, {u""_s}}, u"a\n\n"_s},
+        {"nothing but empty cells", {{u""_s}, {u""_s}}, u"\n\n"_s},
         {"a tab inside", {{u"a\tb"_s, u"c"_s}}, u"\"a\tb\"\tc"_s},
         {"a line end inside", {{u"a\r\nb"_s}, {u"c"_s}}, u"\"a\r\nb\"\nc"_s},
         {"both and quotation marks", {{u"say \"hi\"\nnow"_s}}, u"\"say \"\"hi\"\"\nnow\""_s},
@@ -49,6 +53,20 @@ TEST(BlockText, IsReadAsOthersWriteIt)
     };
     for (const auto& row : cases)
         EXPECT_EQ(RowsOfText(row.text), row.rows) << row.what;
+}
+
+TEST(BlockText, ComesBackAsItWasWhateverItHolds)
+{
+    constexpr int kTexts = 5000;
+    const QString letters = u"a\t\n\r\"\" "_s;
+    QRandomGenerator random(1);
+    for (int i = 0; i < kTexts; ++i) {
+        QString text;
+        for (int length = random.bounded(12); length > 0; --length)
+            text += letters[random.bounded(int(letters.size()))];
+        const TextRows rows = RowsOfText(text);
+        ASSERT_EQ(RowsOfText(TextOfRows(rows)), rows) << text.toStdString();
+    }
 }
 
 TEST(BlockText, IsEscapedAsHtml)
