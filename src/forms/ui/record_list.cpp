@@ -16,6 +16,7 @@ namespace mirel {
 namespace {
 
 constexpr int kLeastRowPx = 20;
+constexpr int kLeastColumnChars = 8;
 constexpr int kMarginPx = 4;
 constexpr int kWheelRows = 3;
 
@@ -141,7 +142,8 @@ QString RecordList::Shown(const QString& text) const
     return SingleLine(text.left(most)) + u'…';
 }
 
-// To the rows in sight, until the user sizes them. The last column takes what is left.
+// To the rows in sight, until the user sizes them. The last column takes what is left; where they do not fit, the
+// widest one gives way, as far as it stays readable.
 void RecordList::FitColumns()
 {
     if (sizedByHand_)
@@ -154,9 +156,23 @@ void RecordList::FitColumns()
             width = std::max(width, fontMetrics().horizontalAdvance(Shown(row.value(column))) + 3 * kMarginPx);
         header_->resizeSection(column, width);
     }
+    NarrowWidestColumn();
     header_->setStretchLastSection(header_->length() <= viewport()->width());
     fitting_ = false;
     UpdateScrollBars();
+}
+
+void RecordList::NarrowWidestColumn()
+{
+    const int excess = header_->length() - viewport()->width();
+    int widest = 0;
+    for (int column = 1; column < names_->columnCount(); ++column) {
+        if (header_->sectionSize(column) > header_->sectionSize(widest))
+            widest = column;
+    }
+    const int room = header_->sectionSize(widest) - kLeastColumnChars * fontMetrics().averageCharWidth();
+    if (excess > 0 && room > 0)
+        header_->resizeSection(widest, header_->sectionSize(widest) - std::min(excess, room));
 }
 
 void RecordList::BringIntoSight(qint64 row)

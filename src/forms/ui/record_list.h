@@ -50,6 +50,7 @@ private:
     void UpdateScrollBars();
     void ReadRows();
     void FitColumns();
+    void NarrowWidestColumn();
     void BringIntoSight(qint64 row);
     QString Shown(const QString& text) const;
 
