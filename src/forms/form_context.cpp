@@ -27,6 +27,8 @@ bool IsOrderComparison(OpCode code)
     }
 }
 
+} // namespace
+
 Value ValueOf(const Cell& cell, FieldType type)
 {
     switch (cell.kind) {
@@ -45,8 +47,6 @@ Value ValueOf(const Cell& cell, FieldType type)
     }
     return Value::Null();
 }
-
-} // namespace
 
 void CompareYesNoAsNumber(ExprNode& tree)
 {

@@ -171,6 +171,27 @@ QString RunningForm::FieldText(int field) const
     return DisplayText(records.FieldValue(field), records.TypeOfField(field), environment_.settings.words);
 }
 
+std::vector<QStringList> RunningForm::RecordTexts(qint64 first, int count)
+{
+    std::vector<QStringList> texts;
+    if (!HasResult() || first < 0 || count <= 0)
+        return texts;
+    DbRecordset& records = result_.Records();
+    const bool read =
+        records.Read({.first = first, .count = count, .fields = {}}, [&](std::span<const Cell> cells) {
+            QStringList record;
+            for (size_t field = 0; field < cells.size(); ++field) {
+                const FieldType type = records.TypeOfField(int(field));
+                record += DisplayText(ValueOf(cells[field], type), type, environment_.settings.words);
+            }
+            texts.push_back(std::move(record));
+            return true;
+        });
+    if (!read)
+        result_.Report();
+    return texts;
+}
+
 // --- what the user does to controls -----------------------------------------------------------------------------
 
 void RunningForm::SetText(int index, const QString& text)

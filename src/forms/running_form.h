@@ -137,6 +137,9 @@ public:
 
     std::span<const ResultField> Fields() const { return result_.Records().Fields(); }
     QString FieldText(int field) const; // of the current record, uncut, as the grid shows it
+    // The same of any records, a QStringList a record. Fewer than asked for at the end.
+    std::vector<QStringList> RecordTexts(qint64 first, int count);
+    Outcome SortByField(int field, SortOrder order);
 
 private:
     // The result.
@@ -149,7 +152,6 @@ private:
     // Runs `rewrite` on the result after the leave-record check, and shows what came of it.
     template <typename Rewrite>
     Outcome Rearrange(Rewrite rewrite);
-    Outcome SortByField(int field, SortOrder order);
     bool NewRecordValues(std::vector<FieldChange>& values);
     void ShowRecord(FormControls::Edits edits = FormControls::Edits::Drop);
     // The aggregates and the lists as well.

@@ -383,6 +383,29 @@ TEST_F(FormView, TheScrollBarIsTheFormsAndScrollingTheSettings)
     EXPECT_FALSE(bar->isVisible());
 }
 
+TEST_F(FormView, ShowsItsRecordsAsAListToo)
+{
+    settings.sortByHeader = true;
+    Show({Edit(u"Name"_s)});
+    ActionOf(Str::FormList)->trigger();
+    auto* list = qobject_cast<RecordList*>(QApplication::focusWidget());
+    ASSERT_TRUE(list && list->isVisible());
+    Press(Qt::Key_Down);
+    EXPECT_EQ(TextOf(u"Name"_s), u"Bob"_s);
+    const auto tapHeader = [list](int column) {
+        const int x = list->Header()->sectionViewportPosition(column) + 12;
+        QTest::mouseClick(list->Header()->viewport(), Qt::LeftButton, {}, QPoint(x, 5));
+    };
+    tapHeader(0);
+    tapHeader(0);
+    EXPECT_EQ(TextOf(u"Name"_s), u"Cid"_s);
+    ActionOf(Str::FormDetail)->trigger();
+    EXPECT_FALSE(list->isVisible());
+    EXPECT_FALSE(ActionOf(Str::FormList)->isChecked());
+    ActionOf(Str::FormDetail)->trigger();
+    EXPECT_EQ(QApplication::focusWidget(), Find(u"Name"_s));
+}
+
 TEST_F(FormView, CallsOtherFormsAndClosesWhenItsButtonSaysSo)
 {
     FormDef other = FormOf({});

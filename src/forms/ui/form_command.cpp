@@ -25,6 +25,7 @@ constexpr std::array kCommands = {
     FormCommandDef{ScrollBar, Str::FormScrollBar, Str::FormScrollBarTip, u"mirel-scrollbar", u"", kCheckable},
     FormCommandDef{FitToWindow, Str::FormFit, Str::FormFitTip, u"", u"", kCheckable},
     FormCommandDef{Detail, Str::FormDetail, Str::FormDetailTip, u"view-list-details", u"Ctrl+D", kCheckable},
+    FormCommandDef{List, Str::FormList, Str::FormListTip, u"view-list-text", u"Ctrl+L", kCheckable},
     FormCommandDef{Save, Str::FormSave, Str::FormSaveTip, u"document-save", u"Ctrl+S"},
     FormCommandDef{Recalculate, Str::FormRecalculate, Str::FormRecalculateTip, u"view-refresh", u"F5"},
     FormCommandDef{Zoom, Str::FormZoom, Str::ZoomTip, u"zoom-in", u"Shift+F2"},
@@ -59,7 +60,8 @@ constexpr std::array<FormMenuEntry, 10> kFileMenu = {Save,     Recalculate, Zoom
 constexpr std::array<FormMenuEntry, 14> kRecordMenu = {
     First,    Previous,        Next,         Last,  kLine,         AddRecord,     DeleteRecord, kLine,
     FilterBy, FilterExcluding, RemoveFilter, kLine, SortAscending, SortDescending};
-constexpr std::array<FormMenuEntry, 6> kViewMenu = {ScrollBar, ScrollUp, ScrollDown, kLine, FitToWindow, Detail};
+constexpr std::array<FormMenuEntry, 7> kViewMenu = {ScrollBar,   ScrollUp, ScrollDown, kLine,
+                                                    FitToWindow, Detail,   List};
 constexpr std::array<FormMenuEntry, 10> kPopupMenu = {
     FilterBy, FilterExcluding, RemoveFilter, kLine, SortAscending, SortDescending, kLine, Copy, Paste, Zoom};
 

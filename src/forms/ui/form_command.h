@@ -21,6 +21,7 @@ enum class FormCommand {
     ScrollBar,
     FitToWindow,
     Detail,
+    List,
     Save,
     Recalculate,
     Zoom,

@@ -1,6 +1,7 @@
 #include "forms/ui/form_eng_view.h"
 
 #include "forms/ui/form_surface.h"
+#include "forms/ui/record_list.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/filter_chip.h"
@@ -40,6 +41,9 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
     , scroller_(new QScrollArea(this))
     , surface_(new FormSurface(form_, nullptr))
     , detail_(new QTreeWidget(this))
+    , list_(new RecordList({.rows = [this](qint64 first, int count) { return form_.RecordTexts(first, count); },
+                            .maxColumnChars = surroundings.settings.maxColumnChars},
+                           this))
 {
     CreateActions();
     chip_ = new FilterChip(ActionOf(FormCommand::RemoveFilter), this);
@@ -52,6 +56,11 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
         lastFocused_ = surface_->ControlOf(widget);
         scroller_->ensureWidgetVisible(widget, 0, widget->height() / 2);
         ShowActions();
+    });
+    connect(list_, &RecordList::headerTapped, this, &CFormEngView::SortByHeader);
+    connect(list_, &RecordList::rowChosen, this, [this](qint64 row) {
+        (void)form_.GoToRecord(row);
+        ShowState();
     });
     ShowScrollBar(form_.Form().formScrollBar != 0);
     ShowState();
@@ -69,6 +78,9 @@ void CFormEngView::LayOut()
     column->addWidget(chip_);
     stack_->addWidget(scroller_);
     stack_->addWidget(detail_);
+    stack_->addWidget(list_);
+    list_->setFrameShape(QFrame::NoFrame);
+    list_->setAccessibleName(StringText(Str::GridName));
     scroller_->setWidget(surface_);
     scroller_->setFrameShape(QFrame::NoFrame);
     scroller_->setFocusPolicy(Qt::NoFocus);
@@ -148,9 +160,50 @@ void CFormEngView::ShowState()
     setWindowTitle(StringText(readOnly ? Str::TableViewTitleReadOnly : Str::TableViewTitle, {form_.Title()}));
     setWindowModified(form_.IsDirty());
     chip_->ShowConditions(form_.Conditions());
-    if (stack_->currentWidget() == detail_)
+    if (CurrentPage() == Page::Detail)
         ShowDetail();
+    if (CurrentPage() == Page::List)
+        ShowList();
     ShowActions();
+}
+
+CFormEngView::Page CFormEngView::CurrentPage() const
+{
+    return Page(stack_->currentIndex()); // they were added in that order
+}
+
+void CFormEngView::ShowPage(Page page)
+{
+    stack_->setCurrentIndex(int(page));
+    ShowState();
+    if (page == Page::Form)
+        surface_->FocusFirstInput();
+    else
+        stack_->currentWidget()->setFocus();
+}
+
+void CFormEngView::ShowList()
+{
+    QStringList names;
+    for (const ResultField& field : form_.Fields())
+        names += field.name;
+    if (names != list_->Columns())
+        list_->SetColumns(names);
+    list_->SetSortMark(sortedField_, sortedDescending_ ? Qt::DescendingOrder : Qt::AscendingOrder);
+    list_->SetRows(form_.RecordCount(), form_.CurrentRecord());
+}
+
+void CFormEngView::SortByHeader(int field)
+{
+    if (!form_.Settings().sortByHeader)
+        return;
+    const bool descending = sortedField_ == field && !sortedDescending_;
+    if (form_.SortByField(field, descending ? SortOrder::Descending : SortOrder::Ascending) ==
+        RunningForm::Outcome::Done) {
+        sortedField_ = field;
+        sortedDescending_ = descending;
+    }
+    ShowState();
 }
 
 void CFormEngView::ShowDetail()

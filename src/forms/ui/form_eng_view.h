@@ -18,6 +18,7 @@ namespace mirel {
 
 class FilterChip;
 class FormSurface;
+class RecordList;
 
 // What a form is run in. All of it must outlive the view.
 struct FormSurroundings {
@@ -79,7 +80,13 @@ private:
     bool RunInForm(FormCommand id); // false: it is no command of the running form's
     void ShowState();
     void ShowActions();
+    // The form itself, all fields of its record, or all its records.
+    enum class Page { Form, Detail, List };
+    Page CurrentPage() const;
+    void ShowPage(Page page);
     void ShowDetail();
+    void ShowList();
+    void SortByHeader(int field);
     void FitSurface();
     void Scroll(int steps);
     void ShowScrollBar(bool shown);
@@ -95,9 +102,12 @@ private:
     QScrollArea* scroller_;
     FormSurface* surface_;
     QTreeWidget* detail_;
+    RecordList* list_;
     QToolBar* toolBar_ = nullptr;
     FilterChip* chip_ = nullptr;
     QBasicTimer clock_;
+    int sortedField_ = -1; // of the list, by its header; -1: none
+    bool sortedDescending_ = false;
     int lastFocused_ = -1;  // outlives the focus's way through a menu
     int popupControl_ = -1; // while its popup menu is open
     bool closing_ = false;

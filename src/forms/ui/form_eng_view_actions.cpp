@@ -94,7 +94,8 @@ void CFormEngView::ShowActions()
     ActionOf(Command::AddRecord)->setEnabled(form_.CanUpdate());
     ActionOf(Command::DeleteRecord)->setEnabled(form_.CanUpdate() && record >= 0);
     ActionOf(Command::Recalculate)->setEnabled(form_.HasResult());
-    ActionOf(Command::Detail)->setEnabled(form_.HasResult() || stack_->currentWidget() == detail_);
+    ActionOf(Command::Detail)->setChecked(CurrentPage() == Page::Detail);
+    ActionOf(Command::List)->setChecked(CurrentPage() == Page::List);
     const bool saves = form_.FirstUpdateButton() >= 0;
     ActionOf(Command::Save)->setEnabled(saves);
     ActionOf(Command::Save)->setToolTip(StringText(saves ? Str::FormSaveTip : Str::FormSaveNone));
@@ -185,11 +186,9 @@ void CFormEngView::Do(Command id)
         return;
     }
     case Command::Detail:
-        stack_->setCurrentIndex(ActionOf(id)->isChecked() ? 1 : 0);
-        (stack_->currentWidget() == detail_ ? static_cast<QWidget*>(detail_) : scroller_)->setFocus();
-        if (stack_->currentWidget() == scroller_)
-            surface_->FocusFirstInput();
-        return ShowState();
+        return ShowPage(ActionOf(id)->isChecked() ? Page::Detail : Page::Form);
+    case Command::List:
+        return ShowPage(ActionOf(id)->isChecked() ? Page::List : Page::Form);
     case Command::Zoom:
         surface_->OpenMoreOf(CommandControl());
         return;

@@ -30,6 +30,7 @@ CFormOptionsDialog::CFormOptionsDialog(const FormViewSettings& settings, QWidget
     , thirdAnswer_(new QCheckBox(StringText(Str::FormOptionThirdAnswer), this))
     , aggregate_(new QCheckBox(StringText(Str::FormOptionAggregate), this))
     , fit_(new QCheckBox(StringText(Str::FormOptionFit), this))
+    , sort_(new QCheckBox(StringText(Str::FormOptionSort), this))
     , limit_(new QCheckBox(StringText(Str::OptionMaximum), this))
     , characters_(new QSpinBox(this))
     , popup_(new QCheckBox(StringText(Str::OptionHoldPopup), this))
@@ -60,6 +61,7 @@ void CFormOptionsDialog::ShowSettings()
     thirdAnswer_->setEnabled(settings_.confirmSave);
     aggregate_->setChecked(settings_.updateAggregate);
     fit_->setChecked(settings_.fitToWindow);
+    sort_->setChecked(settings_.sortByHeader);
     limit_->setChecked(limited);
     characters_->setValue(limited ? settings_.maxColumnChars : defaults.maxColumnChars);
     characters_->setEnabled(limited);
@@ -79,7 +81,7 @@ void CFormOptionsDialog::LayOut()
     scroller->setWidgetResizable(true);
     scroller->setFrameShape(QFrame::NoFrame);
     auto* column = new QVBoxLayout(page);
-    for (QCheckBox* box : {confirmDelete_, confirmSave_, thirdAnswer_, aggregate_, fit_})
+    for (QCheckBox* box : {confirmDelete_, confirmSave_, thirdAnswer_, aggregate_, fit_, sort_})
         column->addWidget(box);
     AddNumbers(*column);
     auto* wordsLabel = new QLabel(StringText(Str::OptionYesNoWords), this);
@@ -129,6 +131,7 @@ FormViewSettings CFormOptionsDialog::Chosen() const
     chosen.saveAsThirdAnswer = thirdAnswer_->isChecked();
     chosen.updateAggregate = aggregate_->isChecked();
     chosen.fitToWindow = fit_->isChecked();
+    chosen.sortByHeader = sort_->isChecked();
     chosen.maxColumnChars = limit_->isChecked() ? characters_->value() : FormViewSettings::kNoColumnLimit;
     chosen.holdTimeMs = popup_->isChecked() ? holdMs_->value() : 0;
     chosen.scrollPixels = scrollPx_->value();

@@ -32,6 +32,7 @@ private:
     QCheckBox* thirdAnswer_;
     QCheckBox* aggregate_;
     QCheckBox* fit_;
+    QCheckBox* sort_;
     QCheckBox* limit_;
     QSpinBox* characters_;
     QCheckBox* popup_;

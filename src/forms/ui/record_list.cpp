@@ -59,6 +59,8 @@ RecordList::RecordList(ControlWidget::ListSource source, QWidget* parent)
 
 void RecordList::SetColumns(const QStringList& names)
 {
+    columns_ = names;
+    names_->clear();
     names_->setHorizontalHeaderLabels(names);
     PlaceHeader();
     FitColumns();
@@ -143,7 +145,7 @@ QString RecordList::Shown(const QString& text) const
 }
 
 // To the rows in sight, until the user sizes them. The last column takes what is left; where they do not fit, the
-// widest one gives way, as far as it stays readable.
+// widest one gives way, if that is enough and it stays readable.
 void RecordList::FitColumns()
 {
     if (sizedByHand_)
@@ -171,8 +173,8 @@ void RecordList::NarrowWidestColumn()
             widest = column;
     }
     const int room = header_->sectionSize(widest) - kLeastColumnChars * fontMetrics().averageCharWidth();
-    if (excess > 0 && room > 0)
-        header_->resizeSection(widest, header_->sectionSize(widest) - std::min(excess, room));
+    if (excess > 0 && excess <= room)
+        header_->resizeSection(widest, header_->sectionSize(widest) - excess);
 }
 
 void RecordList::BringIntoSight(qint64 row)

@@ -21,6 +21,7 @@ public:
     RecordList(ControlWidget::ListSource source, QWidget* parent);
 
     void SetColumns(const QStringList& names);
+    const QStringList& Columns() const { return columns_; }
     // Reads the rows in sight anew.
     void SetRows(qint64 rows, qint64 selected);
     void SetSortMark(int column, Qt::SortOrder order); // -1: none
@@ -55,6 +56,7 @@ private:
     QString Shown(const QString& text) const;
 
     ControlWidget::ListSource source_;
+    QStringList columns_;
     QStandardItemModel* names_;
     QHeaderView* header_;
     qint64 rows_ = 0;
