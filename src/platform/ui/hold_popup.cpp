@@ -17,17 +17,16 @@ HoldPopup::HoldPopup(QWidget* widget, std::function<int()> holdMs)
 
 bool HoldPopup::eventFilter(QObject* watched, QEvent* event)
 {
-    const auto* mouse = static_cast<const QMouseEvent*>(event);
     switch (event->type()) {
     case QEvent::MouseButtonPress:
-        at_ = mouse->position().toPoint();
-        if (mouse->button() == Qt::LeftButton && holdMs_() > 0)
-            timer_.start(holdMs_(), this);
+        Press(*static_cast<const QMouseEvent*>(event));
         break;
-    case QEvent::MouseMove:
-        if ((mouse->position().toPoint() - at_).manhattanLength() >= QApplication::startDragDistance())
+    case QEvent::MouseMove: {
+        const QPoint way = static_cast<const QMouseEvent*>(event)->position().toPoint() - at_;
+        if (way.manhattanLength() >= QApplication::startDragDistance())
             timer_.stop();
         break;
+    }
     case QEvent::MouseButtonRelease:
     case QEvent::MouseButtonDblClick:
     case QEvent::Hide:
@@ -37,6 +36,13 @@ bool HoldPopup::eventFilter(QObject* watched, QEvent* event)
         break;
     }
     return QObject::eventFilter(watched, event);
+}
+
+void HoldPopup::Press(const QMouseEvent& press)
+{
+    at_ = press.position().toPoint();
+    if (press.button() == Qt::LeftButton && holdMs_() > 0)
+        timer_.start(holdMs_(), this);
 }
 
 void HoldPopup::timerEvent(QTimerEvent*)

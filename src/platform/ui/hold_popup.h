@@ -6,6 +6,7 @@
 
 #include <functional>
 
+class QMouseEvent;
 class QWidget;
 
 namespace mirel {
@@ -24,6 +25,8 @@ protected:
     void timerEvent(QTimerEvent* event) override;
 
 private:
+    void Press(const QMouseEvent& press);
+
     QWidget* widget_;
     std::function<int()> holdMs_;
     QBasicTimer timer_;
