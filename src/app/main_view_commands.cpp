@@ -1,6 +1,7 @@
 #include "app/main_view_commands.h"
 
 #include "app/shell_commands.h"
+#include "forms/default_form.h"
 #include "resources/string_table.h"
 
 #include <QFileInfo>
@@ -184,8 +185,32 @@ bool MainViewCommands::DeleteFromStore(const MainEntry& entry)
 
 void MainViewCommands::New()
 {
-    if (const std::optional<Str> message = OutcomeOfNew(state_).message)
-        session_.Prompt().Show({*message, {}});
+    const NewOutcome outcome = OutcomeOfNew(state_);
+    if (outcome.message)
+        session_.Prompt().Show({*outcome.message, {}});
+    else if (outcome.make == EntryKind::Form)
+        NewForm(state_.CurrentTable());
+}
+
+void MainViewCommands::NewForm(const QString& table)
+{
+    UserPrompt& prompt = session_.Prompt();
+    if (!prompt.AskYesNo({Str::CreateFormForTable, {table}}))
+        return;
+    std::optional<FormDef> form = DefaultFormOf(session_.Connection(), session_.Path(), table, prompt);
+    if (!form)
+        return;
+    const bool stored = session_.Store().Apply([&form](FormStore& store) {
+        form->SetName(FreeFormName(store, form->name.Text()));
+        store.AddForm(*form);
+        return true;
+    });
+    if (!stored) {
+        prompt.ShowError(session_.Store().LastError());
+        return;
+    }
+    Refill();
+    state_.Select({EntryKind::Form, form->name.Text(), table, false});
 }
 
 std::optional<TableRequest> MainViewCommands::RequestOfSelected() const

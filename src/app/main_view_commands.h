@@ -51,7 +51,8 @@ public:
     bool RemoveFavorite();
     bool DeleteSelected(); // asks; on the favorites it removes the favorite alone
 
-    // Says what must be chosen before there can be a new thing on the tab in front.
+    // On the tab in front: asks, makes the default form of the selected table and selects it; or says what must be
+    // chosen first.
     void New();
 
     // What the table view is to show for the selected entry; empty for a form, or when there is nothing to show.
@@ -64,6 +65,7 @@ private:
     bool RemoveFavorite(const MainEntry& entry);
     bool DropTable(const QString& name);
     bool DeleteFromStore(const MainEntry& entry);
+    void NewForm(const QString& table);
 
     DatabaseSession& session_;
     MainViewState& state_;

@@ -91,6 +91,8 @@ Availability AvailabilityOfNew(const MainViewState& state)
     const NewOutcome outcome = OutcomeOfNew(state);
     if (outcome.message)
         return {true, Str::TipNew};
+    if (outcome.make == EntryKind::Form)
+        return {true, Str::TipNewForm};
     return {false, outcome.make ? ToolsOf(*outcome.make).newTip : Str::TipNewFavorite};
 }
 

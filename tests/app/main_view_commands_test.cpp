@@ -188,6 +188,22 @@ TEST_F(MainViewCommandsTest, NewSaysWhatMustBeChosenFirst)
     EXPECT_EQ(prompt_.shown, QStringList{u"Please choose a Database and Table first."_s});
 }
 
+TEST_F(MainViewCommandsTest, NewMakesAFormForTheSelectedTableAndAsksFirst)
+{
+    ASSERT_TRUE(MakeShop());
+    program_->SelectOn(MainTab::Table, u"Birds");
+    program_->state.SetTab(MainTab::Form);
+    prompt_.answers = {false, true, true};
+    program_->commands.New();
+    EXPECT_TRUE(program_->Names(MainTab::Form).isEmpty());
+    program_->commands.New();
+    program_->commands.New();
+    EXPECT_EQ(prompt_.questions.last(), u"Create a form based on the table \"Birds\" ?"_s);
+    EXPECT_EQ(program_->Names(MainTab::Form), QStringList({u"DefaultForm"_s, u"DefaultForm2"_s}));
+    ASSERT_TRUE(program_->commands.CallOfSelected());
+    EXPECT_EQ(program_->commands.CallOfSelected()->form.name.Text(), u"DefaultForm2"_s);
+}
+
 TEST_F(MainViewCommandsTest, TheSampleIsMadeOnceAndIsTheUsersFromThenOn)
 {
     ASSERT_TRUE(program_->commands.OpenSample()) << prompt_.shown.join(u'\n').toStdString();

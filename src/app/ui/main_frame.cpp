@@ -189,7 +189,7 @@ void CMainFrame::Run(ShellCommand id)
         return;
     case ShellCommand::New:
         commands_.New();
-        return;
+        break;
     case ShellCommand::Delete:
         commands_.DeleteSelected();
         break;
