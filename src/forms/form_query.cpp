@@ -110,7 +110,7 @@ QString Trimmed(const QString& statement)
 
 QString CompleteQuery(const QString& query, const QString& table, const ControlTextOf& controlText)
 {
-    const QString statement = Trimmed(WithControlTexts(query, controlText));
+    QString statement = Trimmed(WithControlTexts(query, controlText));
     if (table.isEmpty() || !IsWithoutFrom(statement))
         return statement;
     const Token clause = FindToken(statement, {Keyword::Inner, Keyword::Join, Keyword::Where, Keyword::Group,

@@ -8,7 +8,7 @@ namespace mirel {
 // here and the texts in the program come from that one file. Numbers below 60000 are the ones that people and
 // documents know; later texts take theirs from 60000.
 enum class Str : int {
-#define MIREL_STRING(name, number, text) name = number,
+#define MIREL_STRING(name, number, text) name = (number),
 #include "resources/strings.def"
 #undef MIREL_STRING
 };
