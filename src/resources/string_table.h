@@ -8,9 +8,11 @@ namespace mirel {
 // here and the texts in the program come from that one file. Numbers below 60000 are the ones that people and
 // documents know; later texts take theirs from 60000.
 enum class Str : int {
+#ifndef Q_MOC_RUN // which cannot follow includes inside an enum
 #define MIREL_STRING(name, number, text) name = (number),
 #include "resources/strings.def"
 #undef MIREL_STRING
+#endif
 };
 
 } // namespace mirel
