@@ -301,13 +301,13 @@ void Turns::Writes()
         return [this, source, goOn](const QString& path) {
             constexpr int kDamage = 7;
             Result result(connection_, source, path);
-            result.Check(result.UpdateAll(kDamage, Value::Integer(7), goOn));
+            result.Check(result.UpdateAll(kDamage, Value::Integer(7), -1, goOn));
         };
     };
     const auto remove = [&](const QString& source) {
         return [this, source, goOn](const QString& path) {
             Result result(connection_, source, path);
-            result.Check(result.DeleteAll(goOn));
+            result.Check(result.DeleteAll(-1, goOn));
         };
     };
     CompareWrites("update all", "1.15", update(all), "UPDATE Birds SET Damage=7");

@@ -170,14 +170,14 @@ void ChangeRecords(ProviderConnection& provider, const QString& table)
     if (!Failed(rows->GetValue(0, value))) {
         const std::array change{FieldChange{0, value}};
         (void)rows->Update(change);
-        (void)rows->AddNew(change);
+        (void)rows->AddNew(change, {});
     }
-    (void)rows->AddNew({});
+    (void)rows->AddNew({}, {});
     (void)rows->MoveFirst();
     (void)rows->Delete();
     ReadStatic(*rows);
-    (void)rows->UpdateAll(0, Value::Text(u"1"_s), {});
-    (void)rows->DeleteAll([](qint64) { return false; });
+    (void)rows->UpdateAll(0, Value::Text(u"1"_s), -1, {});
+    (void)rows->DeleteAll(-1, [](qint64) { return false; });
     ReadStatic(*rows);
 }
 

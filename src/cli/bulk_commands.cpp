@@ -2,8 +2,8 @@
 #include "cli/run.h"
 #include "data/provider_error.h"
 #include "resources/string_table.h"
+#include "result/cell_text.h"
 #include "tableview/bulk_run.h"
-#include "tableview/cell_text.h"
 
 #include <array>
 

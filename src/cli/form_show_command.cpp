@@ -121,8 +121,10 @@ private:
         caller_.reset();
         const bool failed = form.PressButton(int(button - controls.begin())) == RunningForm::Outcome::Failed;
         caller_.reset();
-        if (failed)
+        if (failed && form.WhyPressFailed().isEmpty())
             run_.Prompt().Show({Str::PressFailed, {name}});
+        else if (failed)
+            run_.Prompt().ShowError(form.WhyPressFailed());
         return !failed && opened_;
     }
 

@@ -125,12 +125,37 @@ qint64 DbRecordset::Position() const
     return open_ ? cursor_->Position() : -1;
 }
 
-std::optional<qint64> DbRecordset::RecordId() const
+bool DbRecordset::IsGone() const
 {
-    return open_ ? cursor_->RecordId() : std::nullopt;
+    return open_ && cursor_->IsGone();
 }
 
-bool DbRecordset::MoveToRecord(qint64 id)
+bool DbRecordset::TakeUpChanges(ProviderRecordset::Values values)
+{
+    return Keep(open_ ? cursor_->TakeUpChanges(values) : Hr::NotOpen);
+}
+
+RecordId DbRecordset::Id() const
+{
+    return open_ ? cursor_->Id() : RecordId();
+}
+
+RecordId DbRecordset::IdInTable() const
+{
+    return open_ ? cursor_->IdInTable() : RecordId();
+}
+
+bool DbRecordset::Ids(qint64 first, qint64 count, std::vector<RecordId>& ids)
+{
+    return Keep(open_ ? cursor_->Ids(first, count, ids) : Hr::NotOpen);
+}
+
+bool DbRecordset::ReadRecords(std::span<const RecordId> ids, const RecordSink& sink)
+{
+    return Keep(open_ ? cursor_->ReadRecords(ids, sink) : Hr::NotOpen);
+}
+
+bool DbRecordset::MoveToRecord(const RecordId& id)
 {
     return Keep(open_ ? cursor_->MoveToRecord(id) : Hr::NotOpen);
 }
@@ -173,9 +198,9 @@ bool DbRecordset::Read(const ReadRange& range, const CellSink& sink)
     return Keep(open_ ? cursor_->Read(range, sink) : Hr::NotOpen);
 }
 
-bool DbRecordset::AddNew(std::span<const FieldChange> values)
+bool DbRecordset::AddNew(std::span<const FieldChange> values, const RecordId& preferred)
 {
-    return Keep(open_ ? cursor_->AddNew(values) : Hr::NotOpen);
+    return Keep(open_ ? cursor_->AddNew(values, preferred) : Hr::NotOpen);
 }
 
 bool DbRecordset::Update(std::span<const FieldChange> values)
@@ -194,14 +219,14 @@ bool DbRecordset::Delete()
     return Keep(open_ ? cursor_->Delete() : Hr::NotOpen);
 }
 
-bool DbRecordset::UpdateAll(int field, const Value& value, const BulkProgress& progress)
+bool DbRecordset::UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress)
 {
-    return Keep(open_ ? cursor_->UpdateAll(field, value, progress) : Hr::NotOpen);
+    return Keep(open_ ? cursor_->UpdateAll(field, value, confirmed, progress) : Hr::NotOpen);
 }
 
-bool DbRecordset::DeleteAll(const BulkProgress& progress)
+bool DbRecordset::DeleteAll(qint64 confirmed, const BulkProgress& progress)
 {
-    return Keep(open_ ? cursor_->DeleteAll(progress) : Hr::NotOpen);
+    return Keep(open_ ? cursor_->DeleteAll(confirmed, progress) : Hr::NotOpen);
 }
 
 } // namespace mirel

@@ -5,8 +5,8 @@
 #include <QString>
 
 #include <memory>
-#include <optional>
 #include <span>
+#include <vector>
 
 namespace mirel {
 
@@ -51,16 +51,23 @@ public:
     bool IsEof() const;
     bool IsBof() const;
     qint64 Position() const; // -1 at either end
+    bool IsGone() const;     // the current record has been deleted by others
+    [[nodiscard]] bool TakeUpChanges(ProviderRecordset::Values values = ProviderRecordset::Values::ReadAgain);
 
-    // See ProviderRecordset: a record's number in its table, and the way back to it. False when it is not there.
-    std::optional<qint64> RecordId() const;
-    [[nodiscard]] bool MoveToRecord(qint64 id);
+    // See ProviderRecordset: a record's identity in this result and in its table, and the way back to it. False
+    // when it is not there.
+    RecordId Id() const;
+    RecordId IdInTable() const;
+    [[nodiscard]] bool Ids(qint64 first, qint64 count, std::vector<RecordId>& ids);
+    [[nodiscard]] bool ReadRecords(std::span<const RecordId> ids, const RecordSink& sink);
+    [[nodiscard]] bool MoveToRecord(const RecordId& id);
 
     qint64 RecordCount();         // finishes counting; -1 when not open or forward-only
     bool CountStep(int budgetMs); // true once the count is known
     quint64 Generation() const;   // grows when records may have changed or moved
 
-    // The current record's value; integer 0 when there is no such column, null at either end.
+    // The current record's value, as ProviderRecordset::GetValue gives it; integer 0 when there is no such column,
+    // null at either end.
     Value FieldValue(int index) const;
     Value FieldValue(QStringView name) const;
     // The value as text: VariantText of it, with empty text for NULL.
@@ -68,12 +75,12 @@ public:
 
     [[nodiscard]] bool Read(const ReadRange& range, const CellSink& sink);
 
-    [[nodiscard]] bool AddNew(std::span<const FieldChange> values);
+    [[nodiscard]] bool AddNew(std::span<const FieldChange> values, const RecordId& preferred = {});
     [[nodiscard]] bool Update(std::span<const FieldChange> values);
     [[nodiscard]] bool Update(int index, const Value& value);
     [[nodiscard]] bool Delete();
-    [[nodiscard]] bool UpdateAll(int field, const Value& value, const BulkProgress& progress);
-    [[nodiscard]] bool DeleteAll(const BulkProgress& progress);
+    [[nodiscard]] bool UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress);
+    [[nodiscard]] bool DeleteAll(qint64 confirmed, const BulkProgress& progress);
 
 private:
     bool Keep(Hr result) const; // remembers the result; true when it is no failure

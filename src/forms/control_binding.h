@@ -4,6 +4,7 @@
 #include "forms/control_source.h"
 #include "forms/form_context.h"
 #include "forms/form_records.h"
+#include "platform/record_id.h"
 
 #include <QString>
 
@@ -32,7 +33,7 @@ struct ControlBinding {
 
     QString recordText; // what the record gave it last
     bool recordTicked = false;
-    qint64 shownRecord = -1;
+    RecordId shownRecord; // whose value the control was given; null: none
 };
 
 ControlBinding BindControl(const ControlDef& control);

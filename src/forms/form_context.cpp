@@ -1,5 +1,7 @@
 #include "forms/form_context.h"
 
+#include "provider/cell_value.h"
+
 #include "platform/ole_date.h"
 
 #include <algorithm>
@@ -28,25 +30,6 @@ bool IsOrderComparison(OpCode code)
 }
 
 } // namespace
-
-Value ValueOf(const Cell& cell, FieldType type)
-{
-    switch (cell.kind) {
-    case Cell::Kind::Integer:
-        return type == FieldType::YesNo ? Value::Bool(cell.integer != 0) : Value::Double(double(cell.integer));
-    case Cell::Kind::Real:
-        return Value::Double(cell.real);
-    case Cell::Kind::Text: {
-        const std::optional<double> date = type == FieldType::Date ? OleDateFromStored(cell.bytes) : std::nullopt;
-        return date ? Value::Date(*date)
-                    : Value::Text(QString::fromUtf8(cell.bytes.data(), qsizetype(cell.bytes.size())));
-    }
-    case Cell::Kind::Null:
-    case Cell::Kind::Binary:
-        break;
-    }
-    return Value::Null();
-}
 
 void CompareYesNoAsNumber(ExprNode& tree)
 {
@@ -118,7 +101,7 @@ void RowContext::Lend(qint64 position, std::span<const Cell> cells)
 {
     position_ = position;
     for (size_t i = 0; i < std::min(cells.size(), values_.size()); ++i)
-        values_[i] = ValueOf(cells[i], types_[i]);
+        values_[i] = ValueOfCell(cells[i], types_[i]);
 }
 
 } // namespace mirel

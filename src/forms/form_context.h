@@ -15,9 +15,6 @@ namespace mirel {
 // expressions else see a word, which never equals a number. For trees that a FormContext evaluates.
 void CompareYesNoAsNumber(ExprNode& tree);
 
-// A cell as a value of the field's type.
-Value ValueOf(const Cell& cell, FieldType type);
-
 // The current record as the expressions of a form see it.
 class FormContext : public RecordContext {
 public:

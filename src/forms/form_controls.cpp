@@ -109,7 +109,7 @@ std::optional<QString> FormControls::TextOf(QStringView name) const
     return control < 0 ? std::nullopt : std::optional(ShownText(control));
 }
 
-int FormControls::ColumnOf(int control, const FormResult& result) const
+int FormControls::ColumnOf(int control, const FormSource& result) const
 {
     return result.IsOpen() ? ShownColumn(bindings_[size_t(control)], (*this)[control].type, result.Context()) : -1;
 }
@@ -132,7 +132,7 @@ void FormControls::ShowTicked(ControlRun& control, bool ticked)
     Touch(control);
 }
 
-void FormControls::ShowPlaceInList(ControlRun& control, const FormResult& result)
+void FormControls::ShowPlaceInList(ControlRun& control, const FormSource& result)
 {
     const qint64 rows = std::max<qint64>(result.Count(), 0);
     if (control.rows == rows && control.selectedRow == result.Index())
@@ -142,7 +142,7 @@ void FormControls::ShowPlaceInList(ControlRun& control, const FormResult& result
     Touch(control);
 }
 
-void FormControls::Show(size_t index, const FormResult& result)
+void FormControls::Show(size_t index, const FormSource& result)
 {
     ControlRun& control = controls_[index];
     ControlBinding& binding = bindings_[index];
@@ -162,7 +162,7 @@ void FormControls::Show(size_t index, const FormResult& result)
         else
             ShowText(control, binding.recordText);
     }
-    binding.shownRecord = result.Index();
+    binding.shownRecord = result.Records().Id();
 }
 
 void FormControls::ShowNothing(size_t index)
@@ -170,15 +170,15 @@ void FormControls::ShowNothing(size_t index)
     ControlBinding& binding = bindings_[index];
     binding.recordText.clear();
     binding.recordTicked = false;
-    binding.shownRecord = -1;
+    binding.shownRecord = {};
     ShowTicked(controls_[index], false);
     ShowText(controls_[index], {});
 }
 
-void FormControls::ShowRecord(const FormResult& result, Edits edits)
+void FormControls::ShowRecord(const FormSource& result, Edits edits)
 {
     hasRecord_ = result.Index() >= 0;
-    if (edits == Edits::Drop || !hasRecord_)
+    if (edits == Edits::Drop)
         ForgetEdits();
     for (size_t i = 0; i < controls_.size(); ++i) {
         if (controls_[i].type == ControlType::List)
@@ -187,12 +187,12 @@ void FormControls::ShowRecord(const FormResult& result, Edits edits)
             continue;
         if (hasRecord_ || controls_[i].isClock)
             Show(i, result);
-        else
+        else if (!controls_[i].edited)
             ShowNothing(i);
     }
 }
 
-void FormControls::ShowAggregates(const FormResult& result, bool computed)
+void FormControls::ShowAggregates(const FormSource& result, bool computed)
 {
     for (size_t i = 0; i < controls_.size(); ++i) {
         if (!bindings_[i].tree || !bindings_[i].wholeResult)
@@ -222,7 +222,7 @@ bool FormControls::HasClock() const
     return std::ranges::any_of(controls_, &ControlRun::isClock);
 }
 
-void FormControls::ShowTime(const FormResult& result)
+void FormControls::ShowTime(const FormSource& result)
 {
     for (size_t i = 0; i < controls_.size(); ++i) {
         if (controls_[i].isClock)
@@ -252,7 +252,7 @@ void FormControls::MarkSorted(int index, int column, bool descending)
     }
 }
 
-std::vector<QStringList> FormControls::ListRows(int control, FormResult& result, qint64 first, int count)
+std::vector<QStringList> FormControls::ListRows(int control, FormSource& result, qint64 first, int count)
 {
     std::vector<ControlBinding::Column>& columns = bindings_[size_t(control)].columns;
     RowContext context(result.Context(), result.Count());
@@ -273,7 +273,7 @@ std::vector<QStringList> FormControls::ListRows(int control, FormResult& result,
         return true;
     });
     if (!read)
-        result.Report();
+        result.Result().Report();
     return rows;
 }
 
@@ -293,10 +293,11 @@ void FormControls::SetTicked(int index, bool ticked)
     MarkEdited(control, ticked != bindings_[size_t(index)].recordTicked);
 }
 
-// Only what would be lost is an edit: there is a record, and the control is one that shows it or goes into it.
+// Only what would be lost is an edit: the control shows the record, or goes into it. Without a record, what is
+// typed can still become one.
 void FormControls::MarkEdited(ControlRun& control, bool edited)
 {
-    edited = edited && control.keepsInput && hasRecord_;
+    edited = edited && control.keepsInput;
     if (control.edited != edited)
         Touch(control);
     control.edited = edited;
@@ -330,14 +331,14 @@ void FormControls::ClearInputs()
     }
 }
 
-bool FormControls::IsUntouched(const FieldAssignment& assignment, const FormResult& result) const
+bool FormControls::IsUntouched(const FieldAssignment& assignment, const FormSource& result) const
 {
     const int index = assignment.controlName.isEmpty() ? -1 : FindInput(assignment.controlName);
     if (index < 0 || ColumnOf(index, result) != assignment.field)
         return false;
     const ControlRun& control = (*this)[index];
     const ControlBinding& binding = bindings_[size_t(index)];
-    if (binding.shownRecord != result.Index())
+    if (binding.shownRecord != result.Records().Id())
         return false;
     return control.type == ControlType::CheckBox ? control.ticked == binding.recordTicked
                                                  : control.text == binding.recordText;

@@ -5,7 +5,7 @@
 #include "forms/control_binding.h"
 #include "forms/control_run.h"
 #include "forms/form_query.h"
-#include "forms/form_result.h"
+#include "forms/form_source.h"
 
 #include <QHash>
 
@@ -35,26 +35,26 @@ public:
     // The same by name, for expressions and queries; empty where no control of that name holds a value.
     std::optional<QString> TextOf(QStringView name) const;
     // The result's column that a control shows; -1: none, or more than that.
-    int ColumnOf(int control, const FormResult& result) const;
+    int ColumnOf(int control, const FormSource& result) const;
 
     // --- showing ------------------------------------------------------------------------------------------
 
     // The current record in all controls that show one, without a record nothing but the time.
     enum class Edits { Drop, Keep }; // kept ones stay as long as they differ from what the record gives
-    void ShowRecord(const FormResult& result, Edits edits = Edits::Drop);
+    void ShowRecord(const FormSource& result, Edits edits = Edits::Drop);
     // The aggregates, computed anew over the whole result; nothing where `computed` says that there are none.
-    void ShowAggregates(const FormResult& result, bool computed);
+    void ShowAggregates(const FormSource& result, bool computed);
     std::span<ControlBinding> Bindings() { return bindings_; }
     void TouchLists(); // their rows may hold other texts
     void Touch(int control);
-    void ShowTime(const FormResult& result); // in the clocks alone
+    void ShowTime(const FormSource& result); // in the clocks alone
     bool HasClock() const;
     void SetItems(int control, QStringList items);
     // Which column a list is sorted by; -1: none. No other list is sorted then.
     void MarkSorted(int control, int column, bool descending);
     void ForgetSorting() { MarkSorted(-1, -1, false); }
     // The rows of a list as far as there are any.
-    std::vector<QStringList> ListRows(int control, FormResult& result, qint64 first, int count);
+    std::vector<QStringList> ListRows(int control, FormSource& result, qint64 first, int count);
 
     // --- edits --------------------------------------------------------------------------------------------
 
@@ -65,16 +65,16 @@ public:
     void ForgetEdits();
     void ForgetEditsOf(const QStringList& names); // what these controls hold was written
     // Whether the assignment would only write back what the current record put into its control.
-    bool IsUntouched(const FieldAssignment& assignment, const FormResult& result) const;
+    bool IsUntouched(const FieldAssignment& assignment, const FormSource& result) const;
 
 private:
     int FindInput(QStringView name) const;
     void MarkUpdateReferences(const FormDef& form);
-    void Show(size_t control, const FormResult& result);
+    void Show(size_t control, const FormSource& result);
     void ShowNothing(size_t control);
     void ShowText(ControlRun& control, const QString& text);
     void ShowTicked(ControlRun& control, bool ticked);
-    void ShowPlaceInList(ControlRun& control, const FormResult& result);
+    void ShowPlaceInList(ControlRun& control, const FormSource& result);
     void MarkEdited(ControlRun& control, bool edited);
     void Touch(ControlRun& control) { control.revision = ++revision_; }
 

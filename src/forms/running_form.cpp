@@ -4,8 +4,10 @@
 #include "forms/aggregate_pass.h"
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
+#include "provider/cell_value.h"
 #include "provider/conversion.h"
 #include "resources/string_table.h"
+#include "result/cell_text.h"
 
 #include <QElapsedTimer>
 #include <QSet>
@@ -22,11 +24,6 @@ using namespace Qt::StringLiterals;
 
 constexpr int kMaxItems = 10'000; // of a drop-down box: nobody looks through more
 
-QString DisplayText(const Value& value, FieldType type, const YesNoWords& words)
-{
-    return type == FieldType::YesNo && !value.IsNull() ? words.Of(value.Number() != 0) : VariantText(value);
-}
-
 } // namespace
 
 RunningForm::RunningForm(FormCall call, FormEnvironment environment)
@@ -35,7 +32,7 @@ RunningForm::RunningForm(FormCall call, FormEnvironment environment)
     , callRecord_(call.record)
     , environment_(std::move(environment))
     , controls_(form_)
-    , result_(
+    , source_(
           environment_.connection, environment_.database, environment_.prompt, environment_.settings.words,
           [this](QStringView name) { return ControlText(name); }, environment_.clock)
 {
@@ -46,7 +43,7 @@ RunningForm::~RunningForm() = default;
 void RunningForm::ChangeSettings(const FormViewSettings& settings)
 {
     environment_.settings = settings;
-    result_.Context().SetWords(settings.words);
+    source_.Context().SetWords(settings.words);
     if (!IsDirty())
         ShowRecord();
 }
@@ -89,7 +86,7 @@ bool RunningForm::ReadItems(const QString& query, QStringList& items)
 bool RunningForm::FillDropDown(int control)
 {
     const ControlBinding& binding = controls_.Bindings()[size_t(control)];
-    const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, result_.Context());
+    const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, source_.Context());
     QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
     QStringList fromQuery;
     const bool filled = binding.dropDown.query.isEmpty() || ReadItems(binding.dropDown.query, fromQuery);
@@ -124,7 +121,7 @@ void RunningForm::RefreshItems(int control)
 
 void RunningForm::ShowRecord(FormControls::Edits edits)
 {
-    controls_.ShowRecord(result_, edits);
+    controls_.ShowRecord(source_, edits);
 }
 
 void RunningForm::ShowResult(FormControls::Edits edits)
@@ -136,38 +133,38 @@ void RunningForm::ShowResult(FormControls::Edits edits)
 
 void RunningForm::RecomputeAggregates()
 {
-    bool computed = result_.Count() > 0;
+    bool computed = source_.Count() > 0;
     if (computed) {
         computed =
-            ComputeAggregates(result_.Records(), result_.Context(), environment_.prompt, controls_.Bindings());
+            ComputeAggregates(source_.Records(), source_.Context(), environment_.prompt, controls_.Bindings());
         if (!computed)
-            result_.Report();
+            source_.Result().Report();
     }
-    controls_.ShowAggregates(result_, computed);
+    controls_.ShowAggregates(source_, computed);
 }
 
 std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int count)
 {
     if (!controls_.Is(control, ControlType::List) || !HasResult() || first < 0 || count <= 0)
         return {};
-    return controls_.ListRows(control, result_, first, count);
+    return controls_.ListRows(control, source_, first, count);
 }
 
 QString RunningForm::CounterText() const
 {
-    return HasResult() ? u"%1/%2"_s.arg(result_.Index() + 1).arg(result_.Count()) : QString();
+    return HasResult() ? u"%1/%2"_s.arg(source_.Index() + 1).arg(source_.Count()) : QString();
 }
 
 bool RunningForm::CanUpdate() const
 {
-    return HasResult() && result_.Records().Lock() != LockType::ReadOnly;
+    return HasResult() && source_.Records().Lock() != LockType::ReadOnly;
 }
 
 QString RunningForm::FieldText(int field) const
 {
-    if (result_.Index() < 0)
+    if (source_.Index() < 0)
         return {};
-    const DbRecordset& records = result_.Records();
+    const DbRecordset& records = source_.Records();
     return DisplayText(records.FieldValue(field), records.TypeOfField(field), environment_.settings.words);
 }
 
@@ -176,19 +173,19 @@ std::vector<QStringList> RunningForm::RecordTexts(qint64 first, int count)
     std::vector<QStringList> texts;
     if (!HasResult() || first < 0 || count <= 0)
         return texts;
-    DbRecordset& records = result_.Records();
+    DbRecordset& records = source_.Records();
     const bool read =
         records.Read({.first = first, .count = count, .fields = {}}, [&](std::span<const Cell> cells) {
             QStringList record;
             for (size_t field = 0; field < cells.size(); ++field) {
                 const FieldType type = records.TypeOfField(int(field));
-                record += DisplayText(ValueOf(cells[field], type), type, environment_.settings.words);
+                record += DisplayText(ValueOfCell(cells[field], type), type, environment_.settings.words);
             }
             texts.push_back(std::move(record));
             return true;
         });
     if (!read)
-        result_.Report();
+        source_.Result().Report();
     return texts;
 }
 
@@ -208,9 +205,9 @@ void RunningForm::SetTicked(int index, bool ticked)
 
 RunningForm::Outcome RunningForm::SelectListRow(int index, qint64 row)
 {
-    if (!controls_.Is(index, ControlType::List) || row < 0 || row >= result_.Count())
+    if (!controls_.Is(index, ControlType::List) || row < 0 || row >= source_.Count())
         return Outcome::Failed;
-    if (row == result_.Index())
+    if (row == source_.Index())
         return Outcome::Done;
     const Outcome outcome = LeaveAndMoveTo(row);
     if (outcome != Outcome::Done)
@@ -220,11 +217,11 @@ RunningForm::Outcome RunningForm::SelectListRow(int index, qint64 row)
 
 RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
 {
-    if (!controls_.Is(index, ControlType::List) || result_.Count() < 1 || column < 0 ||
+    if (!controls_.Is(index, ControlType::List) || source_.Count() < 1 || column < 0 ||
         column >= controls_[index].columns.size())
         return Outcome::Done;
     const ControlBinding& binding = controls_.Bindings()[size_t(index)];
-    const int field = ColumnOf(binding.columns[size_t(column)].tree.get(), result_.Context());
+    const int field = ColumnOf(binding.columns[size_t(column)].tree.get(), source_.Context());
     if (field < 0)
         return Outcome::Done;
     const bool descending = controls_[index].sortedColumn == column && !controls_[index].sortedDescending;
@@ -262,10 +259,14 @@ bool RunningForm::LeaveRecordCheck()
 
 RunningForm::Outcome RunningForm::LeaveAndMoveTo(qint64 record)
 {
+    OpenResult& result = source_.Result();
+    const std::vector<RecordId> meant = result.IdsFrom(record, 1);
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
-    if (!result_.MoveTo(record)) {
-        result_.Close();
+    // Others go on while a question is asked: the record that was meant is found wherever it is by now.
+    const bool isThere = !meant.empty() && result.MoveToRecord(meant.front());
+    if (!isThere && !result.MoveTo(record)) {
+        result.Close();
         ShowResult();
         return Outcome::Failed;
     }
@@ -273,13 +274,19 @@ RunningForm::Outcome RunningForm::LeaveAndMoveTo(qint64 record)
     return Outcome::Done;
 }
 
-// Another program may have added or deleted records: moves go from where the record stands now.
 void RunningForm::TakeUpChanges()
 {
-    const qint64 before = result_.Count();
-    result_.Recount();
-    if (result_.Count() == before)
+    if (!HasResult())
         return;
+    OpenResult& result = source_.Result();
+    const bool isTyping = IsDirty();
+    const bool isOther =
+        result.TakeUpChanges(isTyping ? ProviderRecordset::Values::Keep : ProviderRecordset::Values::ReadAgain);
+    const bool leavesGone = result.IsGone() && !isTyping;
+    if (!isOther && !leavesGone)
+        return;
+    if (leavesGone || (!isTyping && source_.Index() < 0 && source_.Count() > 0))
+        (void)result.MoveTo(std::max<qint64>(source_.Index(), 0));
     ShowRecord(FormControls::Edits::Keep);
     controls_.TouchLists();
 }
@@ -292,40 +299,40 @@ RunningForm::Outcome RunningForm::GoToFirst()
 RunningForm::Outcome RunningForm::GoToLast()
 {
     TakeUpChanges();
-    return result_.Count() < 1 ? Outcome::Failed : LeaveAndMoveTo(result_.Count() - 1);
+    return source_.Count() < 1 ? Outcome::Failed : LeaveAndMoveTo(source_.Count() - 1);
 }
 
 RunningForm::Outcome RunningForm::GoToNext()
 {
     TakeUpChanges();
-    return result_.Index() + 1 >= result_.Count() ? Outcome::Failed : LeaveAndMoveTo(result_.Index() + 1);
+    // Behind a record that is gone comes the one that has its place now.
+    const qint64 next = source_.Index() + (source_.Result().IsGone() ? 0 : 1);
+    if (next < source_.Count())
+        return LeaveAndMoveTo(next);
+    whyFailed_ = StringText(Str::NoNextRecord);
+    return Outcome::Failed;
 }
 
 RunningForm::Outcome RunningForm::GoToPrevious()
 {
     TakeUpChanges();
-    if (result_.Count() < 1)
+    if (source_.Count() < 1) {
+        whyFailed_ = StringText(Str::NoPreviousRecord);
         return Outcome::Failed;
-    return result_.Index() <= 0 ? Outcome::Done : LeaveAndMoveTo(result_.Index() - 1);
+    }
+    return source_.Index() <= 0 ? Outcome::Done : LeaveAndMoveTo(source_.Index() - 1);
 }
 
 RunningForm::Outcome RunningForm::GoToRecord(qint64 record)
 {
     TakeUpChanges();
-    return record < 0 || record >= result_.Count() ? Outcome::Failed : LeaveAndMoveTo(record);
+    return record < 0 || record >= source_.Count() ? Outcome::Failed : LeaveAndMoveTo(record);
 }
 
 bool RunningForm::NewRecordValues(std::vector<FieldChange>& values)
 {
-    const DbRecordset& records = result_.Records();
-    const std::optional<double> today = OleDate(environment_.clock().date().startOfDay());
-    for (int field = 0; field < records.FieldCount(); ++field) {
-        const bool isColumn = !records.Fields()[size_t(field)].column.isEmpty();
-        if (isColumn && records.TypeOfField(field) == FieldType::Date && today)
-            values.push_back({field, Value::Date(*today)});
-        else if (isColumn && records.TypeOfField(field) == FieldType::YesNo)
-            values.push_back({field, Value::Bool(false)});
-    }
+    const DbRecordset& records = source_.Records();
+    values = source_.Result().NewRecordValues(environment_.clock());
     for (int i = 0; i < int(Controls().size()); ++i) {
         const QString text = controls_[i].definition->defaultValue.Text();
         const int field = text.isEmpty() ? -1 : FieldOfControl(i);
@@ -335,7 +342,7 @@ bool RunningForm::NewRecordValues(std::vector<FieldChange>& values)
         if (const Hr hr =
                 ConvertForColumn(Value::Text(text), records.TypeOfField(field), records.FieldSize(field), value);
             Failed(hr)) {
-            ReportRefusedField(field, hr);
+            environment_.prompt.ShowError(RefusedField(field, hr));
             return false;
         }
         std::erase_if(values, [field](const FieldChange& change) { return change.field == field; });
@@ -351,24 +358,76 @@ RunningForm::Outcome RunningForm::AddRecord()
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
     std::vector<FieldChange> values;
-    if (!NewRecordValues(values) || !result_.Add(values))
+    if (!NewRecordValues(values))
         return Outcome::Failed;
+    if (source_.Result().Add(values) != OpenResult::Written::Done) {
+        environment_.prompt.ShowError(source_.Result().LastFailure());
+        return Outcome::Failed;
+    }
     DataHasChanged();
     return Outcome::Done;
 }
 
+// What is meant for a record that others have deleted must not reach the one behind it.
+bool RunningForm::IsRecordStillThere()
+{
+    const RecordId before = source_.Records().Id();
+    TakeUpChanges();
+    if (source_.Records().Id() == before && !source_.Result().IsGone())
+        return true;
+    environment_.prompt.Show({Str::RecordDeletedMeanwhile, {}});
+    return false;
+}
+
 RunningForm::Outcome RunningForm::DeleteRecord()
 {
-    if (result_.Count() < 1)
+    if (source_.Count() < 1)
         return Outcome::Done;
+    const SeenRecord asked = source_.Result().Seen(); // what the form shows, whatever is there by now
+    if (source_.Index() >= 0 && !IsRecordStillThere())
+        return Outcome::Failed;
+    OpenResult& result = source_.Result();
     if (environment_.settings.confirmDelete && !environment_.prompt.AskYesNo({Str::DeleteRecordQuestion, {}}))
         return Outcome::Stopped;
-    const bool deleted = result_.Delete();
-    if (deleted)
+    switch (result.Delete(asked, environment_.settings.words)) {
+    case OpenResult::Written::Done:
         DataHasChanged();
-    else
-        ShowResult();
-    return deleted ? Outcome::Done : Outcome::Failed;
+        return Outcome::Done;
+    case OpenResult::Written::Refused:
+        environment_.prompt.ShowError(result.LastFailure());
+        result.RunAgain();
+        ShowResult(FormControls::Edits::Keep);
+        return Outcome::Failed;
+    case OpenResult::Written::Gone:
+        environment_.prompt.Show({Str::RecordDeletedMeanwhile, {}});
+        TakeUpChanges();
+        return Outcome::Failed;
+    case OpenResult::Written::GaveWay:
+        break;
+    }
+    ShowRecord(FormControls::Edits::Keep);
+    return Outcome::Stopped;
+}
+
+RunningForm::Outcome RunningForm::Undo()
+{
+    return Turn(CanUndo(), &OpenResult::Undo);
+}
+
+RunningForm::Outcome RunningForm::Redo()
+{
+    return Turn(CanRedo(), &OpenResult::Redo);
+}
+
+RunningForm::Outcome RunningForm::Turn(bool can, ChangeLog::Outcome (OpenResult::*turn)())
+{
+    if (!can || !HasResult())
+        return Outcome::Done;
+    if (!LeaveRecordCheck())
+        return Outcome::Stopped;
+    const bool done = (source_.Result().*turn)().done;
+    DataHasChanged();
+    return done ? Outcome::Done : Outcome::Failed;
 }
 
 // After each change that was written: the aggregates only where the user wants them brought up to date, because
@@ -377,22 +436,22 @@ void RunningForm::DataHasChanged(FormControls::Edits edits)
 {
     dataChanged_ = true;
     ShowRecord(edits);
-    if (environment_.settings.updateAggregate || result_.Count() < 1)
+    if (environment_.settings.updateAggregate || source_.Count() < 1)
         RecomputeAggregates();
     controls_.TouchLists();
 }
 
-void RunningForm::ReportRefusedField(int field, Hr hr)
+QString RunningForm::RefusedField(int field, Hr hr) const
 {
-    const QString place = StringText(Str::FormFieldRefused, {result_.Records().FieldName(field)});
-    environment_.prompt.ShowError(ProviderErrorText(&result_.Records(), hr, place));
+    const QString place = StringText(Str::FormFieldRefused, {source_.Records().FieldName(field)});
+    return ProviderErrorText(&source_.Records(), hr, place);
 }
 
 // --- filter and sort --------------------------------------------------------------------------------------------
 
 int RunningForm::FieldOfControl(int control) const
 {
-    return control < 0 || control >= int(Controls().size()) ? -1 : controls_.ColumnOf(control, result_);
+    return control < 0 || control >= int(Controls().size()) ? -1 : controls_.ColumnOf(control, source_);
 }
 
 template <typename Rewrite>
@@ -411,13 +470,13 @@ RunningForm::Outcome RunningForm::Rearrange(Rewrite rewrite)
 RunningForm::Outcome RunningForm::FilterByControl(int control, CellFilter filter)
 {
     const int field = FieldOfControl(control);
-    if (field < 0 || result_.Index() < 0)
+    if (field < 0 || source_.Index() < 0)
         return Outcome::Done;
-    const DbRecordset& records = result_.Records();
+    const DbRecordset& records = source_.Records();
     const YesNoWords& words = environment_.settings.words;
     const Value value = records.FieldValue(field);
     const FieldType type = records.TypeOfField(field);
-    return AddCondition(ConditionFromCell(filter, result_.ReferenceOf(field), type, value,
+    return AddCondition(ConditionFromCell(filter, source_.Result().ReferenceOf(field), type, value,
                                           DisplayText(value, type, words), words));
 }
 
@@ -430,26 +489,26 @@ RunningForm::Outcome RunningForm::SortByControl(int control, SortOrder order)
 RunningForm::Outcome RunningForm::SortByField(int field, SortOrder order)
 {
     const QString word = order == SortOrder::Ascending ? u"ASC"_s : u"DESC"_s;
-    return SortByTerms(u"%1 %2"_s.arg(result_.ReferenceOf(field), word));
+    return SortByTerms(u"%1 %2"_s.arg(source_.Result().ReferenceOf(field), word));
 }
 
 RunningForm::Outcome RunningForm::AddCondition(const QString& condition)
 {
-    if (condition.isEmpty() || result_.Count() < 1)
+    if (condition.isEmpty() || source_.Count() < 1)
         return Outcome::Done;
-    return Rearrange([&] { return result_.AddCondition(condition); });
+    return Rearrange([&] { return source_.Result().AddCondition(condition); });
 }
 
 RunningForm::Outcome RunningForm::SortByTerms(const QString& terms)
 {
-    if (terms.isEmpty() || result_.Count() < 1)
+    if (terms.isEmpty() || source_.Count() < 1)
         return Outcome::Done;
-    return Rearrange([&] { return result_.SortBy(terms); });
+    return Rearrange([&] { return source_.Result().OrderBy(terms); });
 }
 
 RunningForm::Outcome RunningForm::RemoveFilter()
 {
-    return Rearrange([&] { return result_.RemoveFilter(); });
+    return Rearrange([&] { return source_.Result().RemoveConditions(); });
 }
 
 } // namespace mirel

@@ -4,7 +4,7 @@
 #include "data/filter_condition.h"
 #include "forms/form_controls.h"
 #include "forms/form_host.h"
-#include "forms/form_result.h"
+#include "forms/form_source.h"
 #include "forms/form_store.h"
 #include "forms/form_view_settings.h"
 #include "platform/user_prompt.h"
@@ -15,6 +15,7 @@
 #include <QStringList>
 
 #include <functional>
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -72,13 +73,18 @@ public:
     // Grows with every change of a control; those whose own revision is greater than the one last seen changed.
     quint64 Revision() const { return controls_.Revision(); }
 
-    bool HasResult() const { return result_.IsOpen(); }
-    qint64 RecordCount() const { return result_.Count(); }   // -1: no result
-    qint64 CurrentRecord() const { return result_.Index(); } // -1: none
+    bool HasResult() const { return source_.IsOpen(); }
+    qint64 RecordCount() const { return source_.Count(); }   // -1: no result
+    qint64 CurrentRecord() const { return source_.Index(); } // -1: none
     QString CounterText() const;                             // "3/12", "0/0"; empty without a result
     bool IsDirty() const { return controls_.AreEdited(); }
     bool CanUpdate() const;
-    const QString& CurrentQuery() const { return result_.Query(); }
+    const QString& CurrentQuery() const { return source_.Result().Statement(); }
+
+    // Shows what others changed since the last look, in this program or another. The form stays on its record;
+    // where that is gone, the one behind it is shown. Once something is typed, the record stays as it was shown:
+    // its save tells what happened to it.
+    void TakeUpChanges();
 
     // The texts of a list's rows, a QStringList a row, uncut. Fewer than asked for at the end.
     std::vector<QStringList> ListRows(int control, qint64 first, int count);
@@ -92,6 +98,8 @@ public:
     // nothing on an expression.
     Outcome TapListHeader(int control, int column);
     Outcome PressButton(int control);
+    // Why the last press failed, where nobody was told yet; empty otherwise.
+    QString WhyPressFailed() const { return whyFailed_; }
     // Reads the items of a drop-down box anew, before its list is shown: its query may name other controls.
     void RefreshItems(int control);
     // The button that saves; -1: the form has none.
@@ -113,10 +121,18 @@ public:
     // Asks about unsaved changes alone. True: whoever asked may go on.
     bool LeaveRecordCheck();
 
+    // --- the way back -------------------------------------------------------------------------------------
+
+    // What this form wrote, added and deleted, step by step; what is typed is asked about first.
+    bool CanUndo() const { return source_.Result().CanUndo(); }
+    bool CanRedo() const { return source_.Result().CanRedo(); }
+    Outcome Undo();
+    Outcome Redo();
+
     // --- time ---------------------------------------------------------------------------------------------
 
     bool HasClock() const { return controls_.HasClock(); } // then call Tick once a second
-    void Tick() { controls_.ShowTime(result_); }
+    void Tick() { controls_.ShowTime(source_); }
 
     void RecomputeAggregates();
 
@@ -129,13 +145,13 @@ public:
     Outcome SortByControl(int control, SortOrder order);
     Outcome AddCondition(const QString& condition);
     Outcome SortByTerms(const QString& terms);
-    bool IsFiltered() const { return !result_.Conditions().isEmpty(); }
-    const QStringList& Conditions() const { return result_.Conditions(); }
+    bool IsFiltered() const { return !Conditions().isEmpty(); }
+    const QStringList& Conditions() const { return source_.Result().Conditions(); }
     Outcome RemoveFilter(); // back to the query that was run, its order included
 
     // --- the result as records: for the list, zoom and detail modes -----------------------------------------
 
-    std::span<const ResultField> Fields() const { return result_.Records().Fields(); }
+    std::span<const ResultField> Fields() const { return source_.Records().Fields(); }
     QString FieldText(int field) const; // of the current record, uncut, as the grid shows it
     // The same of any records, a QStringList a record. Fewer than asked for at the end.
     std::vector<QStringList> RecordTexts(qint64 first, int count);
@@ -145,8 +161,9 @@ private:
     // The result.
     bool OpenFirstResult();
     bool MayRun(const QString& statement);
+    bool OpenAt(const QString& statement, qint64 record);
     Outcome RunQuery(const QString& query, qint64 record);
-    void TakeUpChanges();
+    bool IsRecordStillThere();
     UserPrompt::Answer AskAboutChanges();
     Outcome LeaveAndMoveTo(qint64 record);
     // Runs `rewrite` on the result after the leave-record check, and shows what came of it.
@@ -157,7 +174,8 @@ private:
     // The aggregates and the lists as well.
     void ShowResult(FormControls::Edits edits = FormControls::Edits::Drop);
     void DataHasChanged(FormControls::Edits edits = FormControls::Edits::Drop);
-    void ReportRefusedField(int field, Hr hr);
+    QString RefusedField(int field, Hr hr) const;
+    Outcome Turn(bool can, ChangeLog::Outcome (OpenResult::*turn)());
 
     // Items of drop-down boxes.
     [[nodiscard]] bool FillDropDown(int control);
@@ -168,16 +186,19 @@ private:
     // Buttons.
     Outcome RunButton(const ControlDef& button);
     Outcome RunSelect(const ControlDef& button);
-    Outcome RunUpdate(const ControlDef& button, qint64 first, qint64 last);
+    Outcome RunUpdate(const ControlDef& button);
+    Outcome RunUpdateAll(const ControlDef& button);
+    Outcome SaveToNoRecord(const ControlDef& button);
     Outcome RunInsert(const ControlDef& button);
     Outcome RunCallForm(const ControlDef& button);
     Outcome RunClearForm();
     Outcome RunRecalc();
     std::vector<FieldAssignment> AssignmentsOf(const ControlDef& button);
     int FieldOfTarget(const TargetName& target);
-    bool UpdateInBulk(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
-    bool UpdateRecords(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last, qint64& written);
-    bool UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written);
+    // What the assignments store in the current record. None: a value is refused, and `failure` says why.
+    enum class Values { All, Touched }; // Touched: without what still shows what the record itself gave
+    std::optional<std::vector<FieldChange>> ValuesOf(std::vector<FieldAssignment>& assignments, Values which,
+                                                     QString& failure);
     QString ControlText(QStringView name) const { return controls_.TextOf(name).value_or(QString()); }
     void TellDataChanged();
 
@@ -186,9 +207,10 @@ private:
     qint64 callRecord_;
     FormEnvironment environment_;
     FormControls controls_;
-    FormResult result_;
+    FormSource source_;
     QHash<QString, QStringList> itemsOfQuery_; // while many drop-down boxes are filled
     bool dataChanged_ = false;
+    QString whyFailed_;
 };
 
 } // namespace mirel

@@ -69,12 +69,21 @@ bool RunningForm::MayRun(const QString& statement)
     return false;
 }
 
+// On that record, or on the first one where there is no such record.
+bool RunningForm::OpenAt(const QString& statement, qint64 record)
+{
+    OpenResult& result = source_.Result();
+    if (!result.Open(statement))
+        return false;
+    return record <= 0 || record >= result.Count() || result.MoveTo(record);
+}
+
 RunningForm::Outcome RunningForm::RunQuery(const QString& query, qint64 record)
 {
     const QString statement = CompleteQuery(query, form_.tableName.Text(), TextsForQueries());
-    const bool opened = MayRun(statement) && result_.Open(statement, record);
+    const bool opened = MayRun(statement) && OpenAt(statement, record);
     if (!opened)
-        result_.Close();
+        source_.Result().Close();
     controls_.ForgetSorting();
     ShowResult();
     return opened ? Outcome::Done : Outcome::Failed;
@@ -91,6 +100,7 @@ int RunningForm::FirstUpdateButton() const
 
 RunningForm::Outcome RunningForm::PressButton(int control)
 {
+    whyFailed_.clear();
     return controls_.Is(control, ControlType::Button) ? RunButton(*controls_[control].definition)
                                                       : Outcome::Failed;
 }
@@ -103,7 +113,7 @@ RunningForm::Outcome RunningForm::RunButton(const ControlDef& button)
     case ButtonFunction::DeleteRecord:
         return DeleteRecord();
     case ButtonFunction::Update:
-        return RunUpdate(button, result_.Index(), result_.Index());
+        return RunUpdate(button);
     case ButtonFunction::Insert:
         return RunInsert(button);
     case ButtonFunction::First:
@@ -123,7 +133,7 @@ RunningForm::Outcome RunningForm::RunButton(const ControlDef& button)
     case ButtonFunction::CallForm:
         return RunCallForm(button);
     case ButtonFunction::UpdateAll:
-        return RunUpdate(button, 0, result_.Count() - 1);
+        return RunUpdateAll(button);
     case ButtonFunction::None:
     case ButtonFunction::Nothing:
         break;
@@ -154,7 +164,7 @@ RunningForm::Outcome RunningForm::RunAgain()
         return Outcome::Failed;
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
-    const bool done = result_.RunAgain();
+    const bool done = source_.Result().RunAgain();
     FillDropDowns();
     ShowResult();
     return done ? Outcome::Done : Outcome::Failed;
@@ -181,8 +191,8 @@ RunningForm::Outcome RunningForm::RunCallForm(const ControlDef& button)
     FormCall call;
     call.form.CopyFrom(*called);
     if (button.option1 != 0 && HasResult()) {
-        call.query = result_.Query();
-        call.record = result_.Index();
+        call.query = CurrentQuery();
+        call.record = source_.Index();
     }
     const bool closes = button.option2 != 0;
     TellDataChanged();
@@ -215,10 +225,10 @@ int RunningForm::FieldOfTarget(const TargetName& target)
 {
     const QString written =
         target.table.isEmpty() ? u"[%1]"_s.arg(target.field) : u"[%1].[%2]"_s.arg(target.table, target.field);
-    const int field = result_.Context().FindColumn(written);
+    const int field = source_.Context().FindColumn(written);
     if (field < 0 || target.table.isEmpty())
         return field;
-    const QString& table = result_.Records().Fields()[size_t(field)].table;
+    const QString& table = source_.Records().Fields()[size_t(field)].table;
     const bool same = table.isEmpty() || table.compare(target.table, Qt::CaseInsensitive) == 0;
     return same ? field : -1;
 }
@@ -231,96 +241,142 @@ std::vector<FieldAssignment> RunningForm::AssignmentsOf(const ControlDef& button
     for (const SourceAssignment& source : SplitAssignments(button.source.Text())) {
         FieldAssignment assignment = ParseAssignment(source);
         assignment.field = FieldOfTarget(assignment.target);
-        assignment.type = result_.Records().TypeOfField(assignment.field);
-        assignment.size = result_.Records().FieldSize(assignment.field);
+        assignment.type = source_.Records().TypeOfField(assignment.field);
+        assignment.size = source_.Records().FieldSize(assignment.field);
         assignments.push_back(std::move(assignment));
     }
     return assignments;
 }
 
-bool RunningForm::UpdateRecord(std::vector<FieldAssignment>& assignments, bool& written)
+std::optional<std::vector<FieldChange>> RunningForm::ValuesOf(std::vector<FieldAssignment>& assignments,
+                                                              Values which, QString& failure)
 {
-    const bool isShown = result_.Records().Position() == result_.Index(); // others pass by in a bulk update
-    std::vector<FieldChange> changes;
+    std::vector<FieldChange> values;
     for (FieldAssignment& assignment : assignments) {
         if (assignment.field < 0 || !assignment.tree)
             continue;
         // What the record itself put into a control may show less than the store holds: a number's last digits, a
         // date's fraction of a second. Writing it back would lose them.
-        if (isShown && controls_.IsUntouched(assignment, result_))
+        if (which == Values::Touched && controls_.IsUntouched(assignment, source_))
             continue;
         FieldChange change{assignment.field, {}};
         const Hr hr = ValueToStore(
-            assignment, result_.Context(), [this](QStringView name) { return ControlText(name); }, change.value);
+            assignment, source_.Context(), [this](QStringView name) { return ControlText(name); }, change.value);
         if (Failed(hr)) {
-            ReportRefusedField(assignment.field, hr);
-            return false;
+            failure = RefusedField(assignment.field, hr);
+            return {};
         }
-        changes.push_back(std::move(change));
+        values.push_back(std::move(change));
     }
-    if (changes.empty())
-        return true;
-    written = result_.Records().Update(changes);
-    if (!written)
-        result_.Report();
-    return written;
+    return values;
 }
 
-bool RunningForm::UpdateRecords(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last,
-                                qint64& written)
+RunningForm::Outcome RunningForm::RunUpdate(const ControlDef& button)
 {
-    constexpr qint64 kTellEvery = 64;
-    const std::unique_ptr<Progress> progress =
-        environment_.prompt.StartProgress({Str::FormUpdatingRecords, {}}, last - first + 1);
-    for (qint64 record = first; record <= last; ++record) {
-        if (record != result_.Records().Position() && !result_.Records().MoveTo(record)) {
-            result_.Report();
-            return false;
-        }
-        bool wrote = false;
-        if (!UpdateRecord(assignments, wrote))
-            return false;
-        written += wrote ? 1 : 0;
-        const qint64 done = record - first + 1;
-        if (done % kTellEvery == 0 && !progress->Advance(done))
-            return false;
-    }
-    return true;
-}
-
-RunningForm::Outcome RunningForm::RunUpdate(const ControlDef& button, qint64 first, qint64 last)
-{
-    if (result_.Count() <= 0 || first < 0)
+    if (!HasResult())
         return Outcome::Done;
-    const qint64 count = last - first + 1;
-    if (count > 1 && !environment_.prompt.AskYesNo({Str::FormUpdateAllQuestion, {QString::number(count)}}))
+    if (source_.Index() < 0)
+        return SaveToNoRecord(button);
+    if (!IsRecordStillThere())
+        return Outcome::Failed;
+    OpenResult& result = source_.Result();
+    std::vector<FieldAssignment> assignments = AssignmentsOf(button);
+    QString failure;
+    const std::optional<std::vector<FieldChange>> values = ValuesOf(assignments, Values::Touched, failure);
+    if (!values) {
+        environment_.prompt.ShowError(failure);
+        return Outcome::Failed;
+    }
+    OpenResult::Written written = OpenResult::Written::Done;
+    if (!values->empty())
+        written = result.Update(*values, environment_.settings.words);
+    else if (result.IsGone())
+        written = OpenResult::Written::Gone;
+    switch (written) {
+    case OpenResult::Written::Refused:
+        environment_.prompt.ShowError(result.LastFailure());
+        return Outcome::Failed;
+    case OpenResult::Written::Gone:
+        environment_.prompt.Show({Str::RecordDeletedMeanwhile, {}});
+        return Outcome::Failed;
+    case OpenResult::Written::GaveWay:
+        ShowRecord();
+        return Outcome::Stopped;
+    case OpenResult::Written::Done:
+        break;
+    }
+    controls_.ForgetEditsOf(ControlsOf(assignments));
+    if (!values->empty())
+        DataHasChanged(FormControls::Edits::Keep);
+    return Outcome::Done;
+}
+
+// What is typed has no record to go to: it can become one.
+RunningForm::Outcome RunningForm::SaveToNoRecord(const ControlDef& button)
+{
+    if (!controls_.AreEdited())
+        return Outcome::Done;
+    if (!CanUpdate() || !environment_.prompt.AskYesNo({Str::SaveAsNewRecord, {}}))
         return Outcome::Stopped;
     std::vector<FieldAssignment> assignments = AssignmentsOf(button);
-    const qint64 current = result_.Index();
-    qint64 written = 0;
-    const bool done = count > 1 ? UpdateInBulk(assignments, first, last, written)
-                                : UpdateRecords(assignments, first, last, written);
-    if (result_.Records().Position() != current)
-        (void)result_.MoveTo(current);
-    if (written > 0 || done)
-        controls_.ForgetEditsOf(ControlsOf(assignments));
-    if (written > 0)
-        DataHasChanged(FormControls::Edits::Keep);
-    return done ? Outcome::Done : Outcome::Failed;
+    std::vector<FieldChange> values;
+    QString failure;
+    const std::optional<std::vector<FieldChange>> typed = ValuesOf(assignments, Values::All, failure);
+    if (!typed || !NewRecordValues(values)) {
+        if (!typed)
+            environment_.prompt.ShowError(failure);
+        return Outcome::Failed;
+    }
+    for (const FieldChange& change : *typed) {
+        std::erase_if(values, [&](const FieldChange& preset) { return preset.field == change.field; });
+        values.push_back(change);
+    }
+    if (source_.Result().Add(values) != OpenResult::Written::Done) {
+        environment_.prompt.ShowError(source_.Result().LastFailure());
+        return Outcome::Failed;
+    }
+    controls_.ForgetEdits();
+    DataHasChanged();
+    return Outcome::Done;
 }
 
-// One transaction: what was written before a refused record or a stop is committed, a power loss leaves nothing.
-bool RunningForm::UpdateInBulk(std::vector<FieldAssignment>& assignments, qint64 first, qint64 last,
-                               qint64& written)
+RunningForm::Outcome RunningForm::RunUpdateAll(const ControlDef& button)
 {
-    ProviderConnection* provider = environment_.connection.Provider();
-    Hr hr = provider->BeginBulk(environment_.database);
-    const bool done = !Failed(hr) && UpdateRecords(assignments, first, last, written);
-    if (!Failed(hr))
-        hr = provider->EndBulk(environment_.database);
-    if (Failed(hr))
-        environment_.prompt.ShowError(ProviderErrorText(nullptr, hr, {}));
-    return done && !Failed(hr);
+    TakeUpChanges();
+    if (source_.Count() <= 0)
+        return Outcome::Done;
+    OpenResult& result = source_.Result();
+    qint64 count = source_.Count();
+    std::vector<FieldAssignment> assignments = AssignmentsOf(button);
+    const RecordId current = source_.Records().Id();
+    OpenResult::ManyWritten written;
+    QString failure;
+    for (bool isAskedAgain = false;; isAskedAgain = true) {
+        if ((count > 1 || isAskedAgain) &&
+            !environment_.prompt.AskYesNo({Str::FormUpdateAllQuestion, {QString::number(count)}}))
+            return Outcome::Stopped;
+        const std::unique_ptr<Progress> progress =
+            environment_.prompt.StartProgress({Str::FormUpdatingRecords, {}}, count);
+        const auto values = [&] {
+            // Others pass by: only the shown record has put its own values into the controls.
+            const Values which = source_.Records().Id() == current ? Values::Touched : Values::All;
+            return ValuesOf(assignments, which, failure);
+        };
+        written = result.WriteAll(count, values, *progress);
+        if (result.LastResult() != Hr::RecordChanged)
+            break;
+        count = result.Count();
+    }
+    if (!result.MoveToRecord(current))
+        (void)result.MoveTo(std::max<qint64>(result.Position(), 0));
+    const bool done = written.failure.isEmpty() && failure.isEmpty();
+    if (!done)
+        environment_.prompt.ShowError(failure.isEmpty() ? written.failure : failure);
+    else if (written.records > 0)
+        controls_.ForgetEditsOf(ControlsOf(assignments));
+    if (written.records > 0)
+        DataHasChanged(FormControls::Edits::Keep);
+    return done ? Outcome::Done : Outcome::Failed;
 }
 
 RunningForm::Outcome RunningForm::RunInsert(const ControlDef& button)
@@ -343,7 +399,7 @@ RunningForm::Outcome RunningForm::RunInsert(const ControlDef& button)
         }
         columns += ReferenceOf(assignment.target);
         values +=
-            LiteralToInsert(assignment, result_.Context(), [this](QStringView name) { return ControlText(name); });
+            LiteralToInsert(assignment, source_.Context(), [this](QStringView name) { return ControlText(name); });
     }
     const QString table = environment_.activeTable.isEmpty() ? form_.tableName.Text() : environment_.activeTable;
     const QString statement = u"INSERT INTO [%1] [%2)] %3)"_s.arg(table, columns, values);
@@ -352,8 +408,8 @@ RunningForm::Outcome RunningForm::RunInsert(const ControlDef& button)
         ReportProviderError(environment_.prompt, &rows, rows.LastResult());
         return Outcome::Failed;
     }
-    result_.Recount();
     controls_.ForgetEditsOf(ControlsOf(assignments));
+    TakeUpChanges();
     DataHasChanged(FormControls::Edits::Keep);
     return Outcome::Done;
 }

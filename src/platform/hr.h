@@ -15,6 +15,7 @@ enum class Hr : quint32 {
     BadLiteral = 0x80040E07,  // a text that does not read as the column's type
     SyntaxError = 0x80040E14, // the context names the place
     NoSuchColumn = 0x80040E11,
+    RecordChanged = 0x80040E38,      // another window or program was faster: nothing was written
     IntegrityViolation = 0x80040E2F, // a rule of the table refuses the record: the context names it
     IndexExists = 0x80040E34,
     NoSuchIndex = 0x80040E35,

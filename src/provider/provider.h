@@ -3,6 +3,7 @@
 #include "platform/cell.h"
 #include "platform/field_type.h"
 #include "platform/hr.h"
+#include "platform/record_id.h"
 #include "platform/value.h"
 
 #include <QString>
@@ -43,6 +44,9 @@ struct FieldChange {
 // Takes one record: its cells in the order of the requested fields, borrowed for the call. False ends the walk.
 using CellSink = std::function<bool(std::span<const Cell> cells)>;
 
+// Takes one record of those that were asked for, by its index there.
+using RecordSink = std::function<void(size_t index, std::span<const Cell> cells)>;
+
 // Told how many records a bulk run has done; false asks it to stop there.
 using BulkProgress = std::function<bool(qint64 done)>;
 
@@ -60,8 +64,13 @@ struct ReadRange {
 // and yields no records.
 //
 // Positions count from 0. A static cursor knows every position: own additions go to the end, own deletions
-// leave, changed values are seen as they are now, changes by other programs are taken up before the next page
-// is read. A forward-only cursor moves on and knows no count.
+// leave, and what other results or other programs change is taken up before positions are used again. The current
+// record is then found by its identity; when it has been deleted it is gone, and no neighbor takes its place until
+// the next move. A forward-only cursor moves on and knows no count.
+//
+// Writes are optimistic: they compare the record with what GetValue gave, inside their transaction. Update
+// compares the values that it replaces, Delete all of the result; either compares all once the file's structure is
+// another. A difference is RecordChanged, a record that is gone NoCurrentRecord, and nothing is written.
 class ProviderRecordset {
 public:
     virtual ~ProviderRecordset() = default;
@@ -91,24 +100,37 @@ public:
 
     virtual bool AtBegin() const = 0;    // before the first record
     virtual bool AtEnd() const = 0;      // behind the last record; also when there is none
-    virtual qint64 Position() const = 0; // of the current record; -1 at either end
+    virtual bool IsGone() const = 0;     // the current record has been deleted by others
+    virtual qint64 Position() const = 0; // of the current record; -1 at either end, and when it is gone
+
+    // Takes up what others changed since: positions, the current record's place, and, unless values are to be kept
+    // for the comparison of a write, its values.
+    enum class Values { Keep, ReadAgain };
+    [[nodiscard]] virtual Hr TakeUpChanges(Values values) = 0;
 
     [[nodiscard]] virtual Hr MoveFirst() = 0;
     [[nodiscard]] virtual Hr MoveLast() = 0;
+    // From a record that is gone, these two go to the records that were beside it.
     [[nodiscard]] virtual Hr MoveNext() = 0;
     [[nodiscard]] virtual Hr MovePrevious() = 0;
     // To a position from 0. Past the last record it stands at the end, below 0 before the first; both are Ok.
     [[nodiscard]] virtual Hr MoveTo(qint64 position) = 0;
 
-    // The current record's number in the table that this result can change: the same in every result over that
-    // table, whatever its order, for as long as the record is there. None at either end, or where nothing can
-    // be changed.
-    virtual std::optional<qint64> RecordId() const = 0;
-    // To the record of that number. NoCurrentRecord, and nothing moved, when the result does not hold it, or draws
-    // on more than one table.
-    [[nodiscard]] virtual Hr MoveToRecord(qint64 id) = 0;
+    // The current record's identity among the records of this result. A result over one table gives its records
+    // the same ones in every order and under every condition. Null without a current record, and where records are
+    // kept rows of their own (groups, DISTINCT).
+    virtual RecordId Id() const = 0;
+    // The identity in the table that this result can change; null where nothing can be changed.
+    virtual RecordId IdInTable() const = 0;
+    // Of the records from `first` on, as positions are now; fewer at the end.
+    [[nodiscard]] virtual Hr Ids(qint64 first, qint64 count, std::vector<RecordId>& ids) = 0;
+    // All fields of these records, as they are now; those that are not there are left out.
+    [[nodiscard]] virtual Hr ReadRecords(std::span<const RecordId> ids, const RecordSink& sink) = 0;
+    // NoCurrentRecord, and nothing moved, when the result does not hold that record.
+    [[nodiscard]] virtual Hr MoveToRecord(const RecordId& id) = 0;
 
-    // The current record's value. NoCurrentRecord at either end.
+    // The current record's value, as it was when the first of them was asked for since the record became current,
+    // was written, or changes were taken up. NoCurrentRecord at either end.
     [[nodiscard]] virtual Hr GetValue(int field, Value& value) = 0;
 
     // Hands records over without moving the current one: a page, an export, a sum. One read transaction; the
@@ -117,13 +139,17 @@ public:
 
     // Each is one transaction, on disk when the call returns (inside a bulk run: when that ends). Values are
     // checked and converted for their column: what does not read is BadLiteral, what does not fit Overflow.
-    [[nodiscard]] virtual Hr AddNew(std::span<const FieldChange> values) = 0; // the new record becomes current
+    // The new record becomes current. It gets the identity `preferred` where that is not null and is free: so a
+    // deleted record comes back as the one it was.
+    [[nodiscard]] virtual Hr AddNew(std::span<const FieldChange> values, const RecordId& preferred) = 0;
     [[nodiscard]] virtual Hr Update(std::span<const FieldChange> values) = 0;
     [[nodiscard]] virtual Hr Delete() = 0; // the record behind it becomes current, or the end
 
     // All records of the result, as one transaction. A refused record or a stop commits the records before it.
-    [[nodiscard]] virtual Hr UpdateAll(int field, const Value& value, const BulkProgress& progress) = 0;
-    [[nodiscard]] virtual Hr DeleteAll(const BulkProgress& progress) = 0;
+    // With more than `confirmed` records (-1: any number will do) it is RecordChanged, and none is touched.
+    [[nodiscard]] virtual Hr UpdateAll(int field, const Value& value, qint64 confirmed,
+                                       const BulkProgress& progress) = 0;
+    [[nodiscard]] virtual Hr DeleteAll(qint64 confirmed, const BulkProgress& progress) = 0;
 };
 
 // Appends records to one table at the speed of the store: what the CSV import feeds. Records are one
@@ -145,6 +171,16 @@ public:
     [[nodiscard]] virtual Hr Commit() = 0;
 };
 
+// Changes that are one transaction, on disk when Commit returns: all that is written to the database from its
+// making on. Destroyed without Commit, it takes them back. They nest: an inner one that is taken back fails the
+// outer one.
+class ProviderTransaction {
+public:
+    virtual ~ProviderTransaction() = default;
+    [[nodiscard]] virtual Hr Commit() = 0;
+    virtual QString ErrorContext() const = 0;
+};
+
 // A provider with the database files that are open in it: one handle a file, opened by the first result that
 // names its path and kept until CloseDatabase. Results and appenders must be gone before their connection.
 class ProviderConnection {
@@ -158,9 +194,10 @@ public:
                                                            const QStringList& columns, Hr& result,
                                                            QString& context) = 0;
 
-    // Changes between the two are one transaction, on disk when EndBulk returns; they nest.
-    [[nodiscard]] virtual Hr BeginBulk(const QString& database) = 0;
-    [[nodiscard]] virtual Hr EndBulk(const QString& database) = 0;
+    // Takes the write lock at once, so that what is compared cannot change before it is written. On failure null;
+    // `result` and `context` say why. Must be gone before the connection.
+    virtual std::unique_ptr<ProviderTransaction> BeginTransaction(const QString& database, Hr& result,
+                                                                  QString& context) = 0;
 
     // Gives the file up. Results still open on it are closed: their calls fail with NotOpen from then on.
     virtual void CloseDatabase(const QString& database) = 0;

@@ -2,7 +2,7 @@
 
 #include "data/provider_error.h"
 #include "resources/string_table.h"
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 
 #include <algorithm>
 #include <array>
@@ -133,6 +133,8 @@ bool BlockCommands::Paste(TextRows rows)
         return false;
     if (IsDetail())
         rows = {AllOf(rows)};
+    if (!browser_.IsEmpty() && browser_.SelectedRecord() >= 0 && !browser_.IsRecordStillThere())
+        return false;
     const CellBlock block = browser_.Block();
     const qint64 first = IsDetail() ? browser_.SelectedRecord() : std::max<qint64>(block.firstRecord, 0);
     std::vector<int> fields = FieldsFrom(block.IsEmpty() ? 0 : block.firstColumn);
@@ -151,7 +153,8 @@ bool BlockCommands::Paste(TextRows rows)
         prompt_.Show({Str::PasteReadOnly, {browser_.FieldName(*fixed)}});
         return false;
     }
-    return AskAboutRecords(first, records) && Write(first, fields, rows, records);
+    const std::vector<SeenRecord> asked = browser_.SeenFrom(first, records);
+    return AskAboutRecords(first, records) && Write(first, asked, fields, rows, records);
 }
 
 bool BlockCommands::Clear()
@@ -162,7 +165,8 @@ bool BlockCommands::Clear()
     return Paste({{QString()}});
 }
 
-bool BlockCommands::Write(qint64 first, const std::vector<int>& fields, const TextRows& rows, qint64 records)
+bool BlockCommands::Write(qint64 first, const std::vector<SeenRecord>& asked, const std::vector<int>& fields,
+                          const TextRows& rows, qint64 records)
 {
     const qsizetype width = std::ranges::max(rows, {}, &QStringList::size).size();
     const auto valuesOf = [&](qint64 record) {
@@ -177,23 +181,24 @@ bool BlockCommands::Write(qint64 first, const std::vector<int>& fields, const Te
         }
         return values;
     };
-    if (records * qint64(fields.size()) > RecordBrowser::kMostUndoneCells &&
-        !prompt_.AskYesNo({Str::BeyondUndo, {}}))
+    if (records * qint64(fields.size()) > ChangeLog::kMostCells && !prompt_.AskYesNo({Str::BeyondUndo, {}}))
         return false;
-    RecordBrowser::ManyChanged changed;
+    OpenResult::ManyWritten changed;
     {
         const std::unique_ptr<Progress> progress = prompt_.StartProgress({Str::PastingCells, {}}, records);
-        changed = browser_.ChangeRecords(first, records, valuesOf, *progress);
+        changed = browser_.ChangeRecords(asked, records, valuesOf, *progress);
     }
     if (changed.records > 0 && !IsDetail()) {
         const int column = browser_.Page().ColumnOfField(fields.front());
         browser_.SelectBlock({first, first + changed.records - 1, column, column + int(fields.size()) - 1});
     }
-    return changed.records == records || Tell(changed, first, records, fields.front());
+    if (changed.leftAlone > 0)
+        prompt_.Show({Str::LeftAlone, {QString::number(changed.leftAlone)}});
+    return changed.records + changed.leftAlone == records || Tell(changed, first, records, fields.front());
 }
 
 // Why not all was written; the refused cell is the selected one then.
-bool BlockCommands::Tell(const RecordBrowser::ManyChanged& changed, qint64 first, qint64 records, int firstField)
+bool BlockCommands::Tell(const OpenResult::ManyWritten& changed, qint64 first, qint64 records, int firstField)
 {
     const QStringList counts = {QString::number(changed.records), QString::number(records)};
     if (changed.failure.isEmpty()) {

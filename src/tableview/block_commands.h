@@ -37,8 +37,9 @@ private:
     std::vector<int> FieldsFrom(int column) const;
     bool AskAboutRoom(TextRows& rows, qint64 width, qint64 room);
     bool AskAboutRecords(qint64 first, qint64 records);
-    bool Tell(const RecordBrowser::ManyChanged& changed, qint64 first, qint64 records, int firstField);
-    bool Write(qint64 first, const std::vector<int>& fields, const TextRows& rows, qint64 records);
+    bool Tell(const OpenResult::ManyWritten& changed, qint64 first, qint64 records, int firstField);
+    bool Write(qint64 first, const std::vector<SeenRecord>& asked, const std::vector<int>& fields,
+               const TextRows& rows, qint64 records);
 
     RecordBrowser& browser_;
     UserPrompt& prompt_;

@@ -45,7 +45,7 @@ bool BulkCommands::ShowAggregate(Aggregate kind)
 
 bool BulkCommands::DeleteAll()
 {
-    BulkRun run(browser_.Recordset(), prompt_);
+    BulkRun run(browser_.Result(), prompt_);
     if (!IsReady() || !run.AskDeleteAll())
         return false;
     bool done = false;
@@ -58,7 +58,7 @@ bool BulkCommands::DeleteAll()
 
 bool BulkCommands::UpdateAll()
 {
-    BulkRun run(browser_.Recordset(), prompt_);
+    BulkRun run(browser_.Result(), prompt_);
     if (!IsReady() || !browser_.CanEdit())
         return false;
     const int field = browser_.SelectedField();

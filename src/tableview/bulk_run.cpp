@@ -6,31 +6,44 @@
 
 namespace mirel {
 
-bool BulkRun::Run(Str what, qint64 total, const std::function<bool(const BulkProgress&)>& work)
+void BulkRun::Report()
+{
+    if (result_)
+        prompt_.ShowError(result_->LastFailure());
+    else
+        ReportProviderError(prompt_, &records_, records_.LastResult());
+}
+
+bool BulkRun::Run(Str what, qint64 total, const Work& work)
 {
     done_ = 0;
     stopped_ = false;
-    bool ended = false;
-    {
-        const std::unique_ptr<Progress> progress = prompt_.StartProgress({what, {}}, total);
-        ended = work([&](qint64 done) {
-            done_ = done;
-            stopped_ = !progress->Advance(done);
-            return !stopped_;
-        });
-    } // the display goes before a message comes
-    if (!ended)
-        ReportProviderError(prompt_, &records_, records_.LastResult());
-    return ended;
+    const std::unique_ptr<Progress> progress = prompt_.StartProgress({what, {}}, total);
+    return work([&](qint64 done) {
+        done_ = done;
+        stopped_ = !progress->Advance(done);
+        return !stopped_;
+    });
 }
 
-bool BulkRun::Change(Str what, const std::function<bool(const BulkProgress&)>& work)
+bool BulkRun::Change(Str what, const std::function<bool(qint64 confirmed, const BulkProgress&)>& change)
 {
-    const qint64 total = records_.RecordCount();
-    const bool ended = Run(what, total, work);
-    if (ended && stopped_ && done_ < total)
-        prompt_.Show({Str::StoppedAt, {QString::number(done_), QString::number(total)}});
-    return ended;
+    for (;;) {
+        const qint64 confirmed = confirmed_;
+        const qint64 total = confirmed < 0 ? records_.RecordCount() : confirmed;
+        if (Run(what, total, [&](const BulkProgress& progress) { return change(confirmed, progress); })) {
+            if (stopped_ && done_ < total)
+                prompt_.Show({Str::StoppedAt, {QString::number(done_), QString::number(total)}});
+            return true;
+        }
+        if (LastResult() != Hr::RecordChanged) {
+            Report();
+            return false;
+        }
+        confirmed_ = records_.RecordCount();
+        if (!prompt_.AskYesNo({Str::ResultGrewQuestion, {QString::number(confirmed_), QString::number(total)}}))
+            return false;
+    }
 }
 
 std::optional<AggregateResult> BulkRun::Sum(int field, Aggregate kind)
@@ -42,37 +55,44 @@ std::optional<AggregateResult> BulkRun::Sum(int field, Aggregate kind)
         return {};
     }
     std::optional<AggregateResult> result;
-    Run(Str::SummingRecords, records_.RecordCount(), [&](const BulkProgress& progress) {
+    const bool ended = Run(Str::SummingRecords, records_.RecordCount(), [&](const BulkProgress& progress) {
         result = RunAggregate(records_, field, kind, progress);
         return !Failed(records_.LastResult());
     });
+    if (!ended)
+        ReportProviderError(prompt_, &records_, records_.LastResult());
     return result;
 }
 
 bool BulkRun::AskDeleteAll()
 {
-    const QString count = QString::number(records_.RecordCount());
+    confirmed_ = records_.RecordCount();
+    const QString count = QString::number(confirmed_);
     return prompt_.AskYesNo({Str::DeleteAllQuestion, {count}}) &&
            prompt_.AskYesNo({Str::DeleteAllReally, {count}});
 }
 
 bool BulkRun::AskUpdateAll(int field, const QString& shownValue)
 {
-    const QString count = QString::number(records_.RecordCount());
+    confirmed_ = records_.RecordCount();
+    const QString count = QString::number(confirmed_);
     return prompt_.AskYesNo({Str::UpdateAllQuestion, {count, records_.FieldName(field), shownValue}}) &&
            prompt_.AskYesNo({Str::UpdateAllReally, {count}});
 }
 
 bool BulkRun::DeleteAll()
 {
-    return Change(Str::DeletingRecords,
-                  [&](const BulkProgress& progress) { return records_.DeleteAll(progress); });
+    return Change(Str::DeletingRecords, [&](qint64 confirmed, const BulkProgress& progress) {
+        return result_ ? result_->DeleteAll(confirmed, progress) : records_.DeleteAll(confirmed, progress);
+    });
 }
 
 bool BulkRun::UpdateAll(int field, const Value& value)
 {
-    return Change(Str::UpdatingRecords,
-                  [&](const BulkProgress& progress) { return records_.UpdateAll(field, value, progress); });
+    return Change(Str::UpdatingRecords, [&](qint64 confirmed, const BulkProgress& progress) {
+        return result_ ? result_->UpdateAll(field, value, confirmed, progress)
+                       : records_.UpdateAll(field, value, confirmed, progress);
+    });
 }
 
 } // namespace mirel

@@ -2,6 +2,7 @@
 
 #include "data/db_recordset.h"
 #include "platform/user_prompt.h"
+#include "result/open_result.h"
 #include "tableview/aggregate.h"
 
 #include <optional>
@@ -20,11 +21,19 @@ public:
         , prompt_(prompt)
     {
     }
+    // What it does can be undone, up to a size.
+    BulkRun(OpenResult& result, UserPrompt& prompt)
+        : records_(result.Records())
+        , result_(&result)
+        , prompt_(prompt)
+    {
+    }
 
     // Empty when the field cannot be summed up, which the user is told, or the walk did not come to its end.
     std::optional<AggregateResult> Sum(int field, Aggregate kind);
 
-    // The questions, two of them before each run; false: the user does not want it.
+    // The questions, two of them before each run; false: the user does not want it. What is done then is done to
+    // no more records than they named: when there are more meanwhile, another question names those.
     bool AskDeleteAll();
     bool AskUpdateAll(int field, const QString& shownValue);
     // True when the run went through, or the user ended it on the way: how far it came is then told.
@@ -35,11 +44,17 @@ public:
     qint64 RecordsDone() const { return done_; }
 
 private:
-    bool Run(Str what, qint64 total, const std::function<bool(const BulkProgress&)>& work);
-    bool Change(Str what, const std::function<bool(const BulkProgress&)>& work);
+    using Work = std::function<bool(const BulkProgress&)>;
+
+    bool Run(Str what, qint64 total, const Work& work);
+    bool Change(Str what, const std::function<bool(qint64 confirmed, const BulkProgress&)>& change);
+    Hr LastResult() const { return result_ ? result_->LastResult() : records_.LastResult(); }
+    void Report();
 
     DbRecordset& records_;
+    OpenResult* result_ = nullptr;
     UserPrompt& prompt_;
+    qint64 confirmed_ = -1; // records that the questions named
     qint64 done_ = 0;
     bool stopped_ = false;
 };

@@ -1,7 +1,7 @@
 #include "tableview/cell_edit.h"
 
 #include "platform/user_locale.h"
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 
 namespace mirel {
 

@@ -1,7 +1,7 @@
 #include "tableview/quick_find.h"
 
 #include "data/provider_error.h"
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 
 #include <QElapsedTimer>
 

@@ -5,31 +5,24 @@
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
 #include "resources/string_table.h"
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 
 #include <QDateTime>
 
 #include <algorithm>
+#include <utility>
 
 // The result and the editor; the page and the selection are in record_browser_page.cpp, what is written in
 // record_browser_changes.cpp.
 
 namespace mirel {
-namespace {
 
 using namespace Qt::StringLiterals;
 
-// How long a small result may take to be counted before its first page is shown.
-constexpr int kFirstCountMs = 3;
-
-} // namespace
-
 RecordBrowser::RecordBrowser(DbConnection& connection, QString database, UserPrompt& prompt,
                              TableViewSettings settings)
-    : connection_(connection)
-    , recordset_(connection)
+    : result_(connection, std::move(database), prompt)
     , prompt_(prompt)
-    , database_(std::move(database))
     , settings_(std::move(settings))
 {
 }
@@ -47,53 +40,45 @@ bool RecordBrowser::Open(const QString& statement)
     fieldNames_.clear();
     visible_.clear();
     selectedField_ = -1;
-    conditions_.clear();
     sort_ = {};
-    baseStatement_ = statement;
-    return Execute(statement);
+    return Execute([&] { return result_.Open(statement); });
 }
 
 bool RecordBrowser::OpenInstead(const QString& statement)
 {
-    const QString base = baseStatement_;
-    const QString current = statement_;
-    const QStringList conditions = conditions_;
-    const ColumnSort sort = sort_;
-    if (Open(statement))
-        return true;
-    if (writeFailed_ || base.isEmpty())
+    if (!WriteEdit())
         return false;
-    baseStatement_ = base;
-    if (Execute(current)) {
-        conditions_ = conditions;
-        sort_ = sort;
+    const QStringList names = std::exchange(fieldNames_, {});
+    const ColumnSort sort = std::exchange(sort_, {});
+    if (Execute([&] { return result_.OpenInstead(statement); })) {
+        presentation_ = Presentation::List;
+        RebuildColumns();
+        FillPage();
+        LoadEditor();
+        return true;
     }
+    if (fieldNames_ == names)
+        sort_ = sort;
     return false;
 }
 
 bool RecordBrowser::Rewrite(const QString& statement)
 {
-    if (!WriteEdit())
-        return false;
-    const QString previous = statement_;
-    if (Execute(statement))
-        return true;
-    Execute(previous);
-    return false;
+    return WriteEdit() && Execute([&] { return result_.Rewrite(statement); });
 }
 
 bool RecordBrowser::RunAgain()
 {
     if (!WriteEdit())
         return false;
-    const qint64 record = SelectedRecord();
-    const qint64 top = topRow_;
-    if (!Execute(statement_))
+    const qint64 top = list_.Top();
+    const qint64 row = SelectedRecord() - top;
+    if (!Execute([&] { return result_.RunAgain(); }))
         return false;
-    if (top > 0 || record > 0) {
-        const qint64 last = Count() - 1;
-        topRow_ = std::min(top, HighestTopRow());
-        ShowRecord(std::min(record, last));
+    ShowRecordAgain(result_.Position());
+    if (presentation_ == Presentation::List && result_.Position() >= 0) {
+        list_.ScrollTo(result_.Position() - row, HighestTopRow());
+        list_.Show(result_.Position());
     }
     FillPage();
     LoadEditor();
@@ -102,43 +87,42 @@ bool RecordBrowser::RunAgain()
 
 void RecordBrowser::Close()
 {
-    recordset_.Close();
+    result_.Close();
     Clear();
 }
 
-bool RecordBrowser::Execute(const QString& statement)
+// Whatever came of it: a refused statement may have left the one before, run again.
+bool RecordBrowser::Execute(const std::function<bool()>& run)
 {
-    statement_ = statement;
-    if (!recordset_.Open(statement, database_, CursorType::Static, LockType::Optimistic)) {
-        ReportFailure();
-        recordset_.Close();
+    const bool done = run();
+    if (IsOpen())
+        ShowFromStart();
+    else
         Clear();
-        return false;
-    }
+    return done;
+}
+
+void RecordBrowser::ShowFromStart()
+{
     TakeUpFields();
-    Recount();
-    topRow_ = 0;
-    selectedRow_ = IsEmpty() ? -1 : 0;
-    detailRecord_ = selectedRow_;
-    listState_ = {0, selectedRow_};
-    topFieldRow_ = 0;
+    list_.ScrollTo(0, 0);
+    detail_.ScrollTo(0, 0);
+    if (result_.Position() > 0)
+        list_.Show(result_.Position());
+    listState_ = {list_.Top(), result_.Position(), {}};
     selectedField_ = SelectedFieldOrFirstVisible();
     RebuildColumns();
     FillPage();
     LoadEditor();
-    return true;
 }
 
 void RecordBrowser::Clear()
 {
-    count_ = 0;
     fieldNames_.clear();
     visible_.clear();
-    topRow_ = 0;
-    selectedRow_ = -1;
+    list_.ScrollTo(0, 0);
+    detail_.ScrollTo(0, 0);
     selectedField_ = -1;
-    detailRecord_ = -1;
-    topFieldRow_ = 0;
     RebuildColumns();
     page_.rows.clear();
     ++pageRevision_;
@@ -150,7 +134,7 @@ void RecordBrowser::Clear()
 void RecordBrowser::TakeUpFields()
 {
     QStringList names;
-    for (const ResultField& field : recordset_.Fields())
+    for (const ResultField& field : Fields())
         names += field.name;
     if (names == fieldNames_)
         return;
@@ -184,30 +168,7 @@ bool RecordBrowser::ChangeSettings(const TableViewSettings& settings)
 
 bool RecordBrowser::CountOn(int budgetMs)
 {
-    if (!count_ && !working_ && recordset_.CountStep(budgetMs))
-        Count();
-    return count_.has_value();
-}
-
-qint64 RecordBrowser::Count()
-{
-    if (!count_) {
-        count_ = std::max<qint64>(recordset_.RecordCount(), 0);
-        generation_ = recordset_.Generation();
-    }
-    return *count_;
-}
-
-void RecordBrowser::Recount()
-{
-    count_.reset();
-    generation_ = recordset_.Generation();
-    CountOn(kFirstCountMs);
-}
-
-void RecordBrowser::ReportFailure()
-{
-    ReportProviderError(prompt_, &recordset_, recordset_.LastResult());
+    return working_ ? KnownCount().has_value() : result_.CountOn(budgetMs);
 }
 
 // --- the editor ---------------------------------------------------------------------------------------------
@@ -219,21 +180,10 @@ QString RecordBrowser::FieldLabel() const
     return selectedField_ < 0 ? QString() : StringText(Str::FieldLabel, {FieldName(selectedField_)});
 }
 
-Value RecordBrowser::SelectedValue() const
-{
-    return SelectedRecord() < 0 ? Value::Null() : recordset_.FieldValue(selectedField_);
-}
-
 void RecordBrowser::ShowInEditor(const QString& label, const QString& text)
 {
     shownLabel_ = label;
     edit_.ShowText(text);
-}
-
-bool RecordBrowser::IsWritable(int field) const
-{
-    return field >= 0 && CanUpdate() && !recordset_.Fields()[size_t(field)].column.isEmpty() &&
-           !IsBinary(TypeOfField(field));
 }
 
 bool RecordBrowser::CanEdit() const
@@ -271,7 +221,7 @@ void RecordBrowser::RepeatAbove()
         return;
     const FieldType type = TypeOfField(selectedField_);
     const ReadRange above{.first = SelectedRecord() - 1, .count = 1, .fields = {selectedField_}};
-    const bool read = recordset_.Read(above, [&](std::span<const Cell> cells) {
+    const bool read = Recordset().Read(above, [&](std::span<const Cell> cells) {
         if (type == FieldType::YesNo)
             edit_.SetChecked(cells.front().integer != 0);
         else
@@ -286,6 +236,7 @@ void RecordBrowser::RevertEdit()
 {
     edit_.Revert();
     writeFailed_ = false;
+    TakeUpChanges(); // what others did to this very record was kept from the editor
 }
 
 QString RecordBrowser::SelectedText() const

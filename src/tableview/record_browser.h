@@ -1,13 +1,13 @@
 #pragma once
 
-#include "data/db_recordset.h"
 #include "data/filter_condition.h"
 #include "platform/user_prompt.h"
+#include "result/open_result.h"
 #include "tableview/cell_block.h"
 #include "tableview/cell_edit.h"
+#include "tableview/presentation.h"
 #include "tableview/record_page.h"
 #include "tableview/table_view_settings.h"
-#include "tableview/undo_log.h"
 
 #include <QString>
 #include <QStringList>
@@ -18,15 +18,15 @@
 
 namespace mirel {
 
-// The list shows a page of records, a row each; the detail shows one record, a row for each of its fields.
-enum class Presentation { List, Detail };
-
 enum class SortDirection { Ascending, Descending };
 
 // One open result as the user walks through it: the page that the grid shows, the selected cell, the editor of
 // its value, the record counter; all that the table view does, without a window.
 //
 // Records and fields count from 0; rows count from 0 within the page. Hidden columns stay in the result.
+//
+// The selected record is the current one of the result, known by its identity: see OpenResult for what others may
+// do to it. What they did is taken up before each step that depends on a position.
 //
 // An edit is pending until it is written: by every call that moves, adds, deletes or runs a statement. When that
 // write is refused, the call does nothing and returns false, the edit stays as the user left it, and
@@ -54,21 +54,22 @@ public:
     bool Rewrite(const QString& statement);
     bool RunAgain(); // the current statement; the selection stays on its position
     void Close();
-    bool IsOpen() const { return recordset_.IsOpen(); }
-    bool CanUpdate() const { return IsOpen() && recordset_.Lock() != LockType::ReadOnly; }
-    const QString& Statement() const { return statement_; }
-    const QString& BaseStatement() const { return baseStatement_; }
-    const QString& Database() const { return database_; }
+    bool IsOpen() const { return result_.IsOpen(); }
+    bool CanUpdate() const { return result_.CanUpdate(); }
+    const QString& Statement() const { return result_.Statement(); }
+    const QString& BaseStatement() const { return result_.BaseStatement(); }
+    const QString& Database() const { return result_.Database(); }
 
     const TableViewSettings& Settings() const { return settings_; }
     bool ChangeSettings(const TableViewSettings& settings);
 
-    int FieldCount() const { return recordset_.FieldCount(); }
-    QString FieldName(int field) const { return recordset_.FieldName(field); }
-    FieldType TypeOfField(int field) const { return recordset_.TypeOfField(field); }
-    std::span<const ResultField> Fields() const { return recordset_.Fields(); }
-    // The result itself, for the commands that work on all of its records. They leave it on the selected one.
-    DbRecordset& Recordset() { return recordset_; }
+    int FieldCount() const { return result_.FieldCount(); }
+    QString FieldName(int field) const { return result_.Records().FieldName(field); }
+    FieldType TypeOfField(int field) const { return result_.Records().TypeOfField(field); }
+    std::span<const ResultField> Fields() const { return result_.Fields(); }
+    // The result itself, for the commands that work on many of its records. They leave it on the selected one.
+    OpenResult& Result() { return result_; }
+    DbRecordset& Recordset() { return result_.Records(); }
 
     // As long as one lives, a command works through the records and the window lives on beside it: whatever that
     // asks for, nothing else reads the result meanwhile. The page is filled again afterwards where it has to be.
@@ -83,9 +84,9 @@ public:
     };
 
     // The count, where it is known; CountOn counts on for a while and returns true once it is.
-    std::optional<qint64> KnownCount() const { return count_; }
+    std::optional<qint64> KnownCount() const { return result_.KnownCount(); }
     bool CountOn(int budgetMs);
-    bool IsEmpty() const { return count_ == 0; }
+    bool IsEmpty() const { return result_.KnownCount() == 0; }
 
     // --- the page ---------------------------------------------------------------------------------------
 
@@ -95,13 +96,14 @@ public:
     quint64 ColumnsRevision() const { return columnsRevision_; }
 
     void SetRowsPerPage(int wholeRows);
-    int RowsPerPage() const { return rowsPerPage_; }
+    int RowsPerPage() const { return list_.WholeRows(); }
     // What the vertical scroll bar counts: records in the list, fields in the detail.
     qint64 ScrollPosition() const;
     qint64 HighestScrollPosition() const;
     bool ScrollTo(qint64 position); // out of range positions stop at the end
     bool ScrollBy(qint64 rows) { return ScrollTo(ScrollPosition() + rows); }
-    // Reads the page again where another program has changed the records since.
+    // Shows what others changed since the last look, in this program or another. The selection stays on its
+    // record, and in its row; where the record is gone, the one behind it is selected. What is being typed stays.
     void TakeUpChanges();
 
     // --- moving -----------------------------------------------------------------------------------------
@@ -161,8 +163,8 @@ public:
     bool FilterByCell(CellFilter filter); // the selected cell
     bool AddCondition(const QString& condition);
     bool RemoveFilter(); // back to the base statement, its order included
-    bool IsFiltered() const { return !conditions_.isEmpty(); }
-    const QStringList& Conditions() const { return conditions_; }
+    bool IsFiltered() const { return !Conditions().isEmpty(); }
+    const QStringList& Conditions() const { return result_.Conditions(); }
 
     bool SortByColumn(int field, SortDirection direction);
     bool SortByTerms(const QString& terms);
@@ -175,10 +177,8 @@ public:
     };
     ColumnSort CurrentSort() const { return sort_; }
 
-    // The field as a statement names it: with its table where the result draws on more than one.
-    QString ReferenceOf(int field) const;
-    // The table that the field comes from; for an expression the result's first one.
-    QString TableOf(int field) const;
+    QString ReferenceOf(int field) const { return result_.ReferenceOf(field); }
+    QString TableOf(int field) const { return result_.TableOf(field); }
 
     // --- columns ----------------------------------------------------------------------------------------
 
@@ -194,7 +194,7 @@ public:
     QString FieldLabel() const; // "Name:"; empty without a selection
     const CellEdit& Edit() const { return edit_; }
     bool CanEdit() const;
-    bool IsWritable(int field) const;
+    bool IsWritable(int field) const { return result_.IsWritable(field); }
     bool HasPendingEdit() const { return edit_.IsPending(); }
     // Each makes a pending edit; on a cell that cannot be edited it does nothing.
     void EditText(const QString& text);
@@ -204,7 +204,6 @@ public:
     void RepeatAbove(); // the value of the same field in the record before
     void RevertEdit();
     QString SelectedText() const; // what the cell holds, or would with the pending edit; whole
-    Value SelectedValue() const;  // what the record holds; null without a selection
     // What is pending as a value of the field's type.
     Value EditedValue() const { return edit_.Stored(); }
     // Shows a text in the editor that is none of the record's: the result of a command. It is no edit.
@@ -216,41 +215,46 @@ public:
 
     // --- records ------------------------------------------------------------------------------------------
 
+    // Whether the selected record is still there, once what others did has been taken up; else the user is told,
+    // and nothing that was meant for it may be done to another. For commands that change it.
+    bool IsRecordStillThere();
     bool AddRecord();
     bool DeleteRecord(); // all records that have selected cells
 
-    // What is more than this is not kept to be taken back: whoever changes so many cells asks first.
-    static constexpr qint64 kMostUndoneCells = 200'000;
-
-    // What a change of many records came to. Where it stopped early, the records before are written.
-    struct ManyChanged {
-        qint64 records = 0;    // written
-        QString failure;       // why it stopped; empty: it did not, or the user asked for it
-        int refusedField = -1; // whose value was refused; -1: it was no single one
-    };
-    // Writes `count` records from `first` on, as one step to undo; those behind the last are added. `values` is
-    // asked for each, counting from 0. Values are refused rather than cut, whatever an editor would do.
-    ManyChanged ChangeRecords(qint64 first, qint64 count,
-                              const std::function<std::vector<FieldChange>(qint64)>& values, Progress& progress);
+    // Writes `count` records from the first of `asked` on, which SeenBlock gave before any question, as one step
+    // to undo; those behind the last are added. `values` is asked for each, counting from 0. Values are refused
+    // rather than cut, whatever an editor would do.
+    OpenResult::ManyWritten ChangeRecords(const std::vector<SeenRecord>& asked, qint64 count,
+                                          const std::function<std::vector<FieldChange>(qint64)>& values,
+                                          Progress& progress);
+    // The records of the block and those that follow it, as they are seen now.
+    std::vector<SeenRecord> SeenFrom(qint64 first, qint64 count) { return result_.SeenFrom(first, count); }
 
     // A pending edit goes first; then what was written, added and deleted, step by step.
-    bool CanUndo() const { return edit_.IsPending() || undo_.CanUndo(); }
+    bool CanUndo() const { return edit_.IsPending() || result_.CanUndo(); }
+    bool CanRedo() const { return !edit_.IsPending() && result_.CanRedo(); }
     bool Undo();
+    bool Redo();
 
 private:
     struct ListState {
         qint64 topRow = 0;
-        int row = -1;
+        qint64 record = -1;
+        RecordId id;
+    };
+    struct BlockEnds { // of a block, so that it is found again when records come and go
+        RecordId first;
+        RecordId last;
     };
 
     // The result.
-    bool Execute(const QString& statement);
+    bool Execute(const std::function<bool()>& run);
+    void ShowFromStart();
     void Clear();
     void TakeUpFields();
     void RebuildColumns();
-    qint64 Count();
-    void Recount();
-    void ReportFailure();
+    qint64 Count() { return result_.Count(); }
+    void ReportFailure() { result_.Report(); }
 
     // The page.
     void FillPage();
@@ -259,56 +263,46 @@ private:
     bool ReadRows(qint64 first, int count);
     void RefreshCell();
     qint64 HighestTopRow() const;
-    int HighestFieldRow() const;
+    qint64 HighestFieldRow() const { return detail_.HighestTop(FieldCount()); }
     void KeepSelectionInPage();
 
-    // The selection. The recordset stands on the selected record at all times.
+    // The selection.
     void LoadEditor();
-    void ShowRecord(qint64 record);
+    void SelectRecord(qint64 record);
+    void SelectRecordInRow(int row);
+    bool PrepareStep();
     bool MoveToRecord(qint64 record); // stops at either end
     int SelectedFieldOrFirstVisible() const;
     bool MovePages(int direction);
     void CollapseBlock();
+    void NoteBlockEnds();
+    void FindBlockAgain();
 
     // The records.
-    std::vector<FieldChange> NewRecordValues() const;
-    // A step of null: it is not to be undone.
-    bool ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step* step);
-    bool AddOne(std::vector<FieldChange> values, UndoLog::Step* step);
-    std::optional<RecordChange> NewChange(RecordChange::Kind kind) const; // none: it cannot be undone
-    void NoteAdded(UndoLog::Step& step) const;
-    void NoteDeleted(DbRecordset& table, UndoLog::Step& step);
+    bool WriteFailure(const QString& text);
     bool DeleteBlock();
-    bool DeleteFrom(qint64 first, qint64 last, UndoLog::Step* step);
+    bool ShowTurned(const ChangeLog::Outcome& outcome);
+    void ShowRecordAgain(qint64 record);
 
-    DbConnection& connection_;
-    DbRecordset recordset_;
+    OpenResult result_;
     UserPrompt& prompt_;
-    QString database_;
     TableViewSettings settings_;
-    QString baseStatement_;
-    QString statement_;
-    QStringList conditions_; // put onto the base statement, in their order
     ColumnSort sort_;
-    std::optional<qint64> count_;
-    quint64 generation_ = 0; // of the recordset, when count_ was taken
     QStringList fieldNames_;
     std::vector<bool> visible_; // a flag a field
 
     Presentation presentation_ = Presentation::List;
+    ListPresentation list_;
+    DetailPresentation detail_;
     RecordPage page_;
     quint64 pageRevision_ = 0;
     quint64 columnsRevision_ = 0;
     bool working_ = false;
     bool fillLater_ = false; // the page was to be filled while a command worked
-    int rowsPerPage_ = 1;
-    qint64 topRow_ = 0;
-    int selectedRow_ = -1; // in the list
     int selectedField_ = -1;
-    qint64 detailRecord_ = -1;
-    int topFieldRow_ = 0;
     ListState listState_; // while the detail is shown
     std::optional<CellBlock> block_;
+    BlockEnds blockEnds_;
     CellPlace blockStart_;
     bool extending_ = false;
 
@@ -316,7 +310,6 @@ private:
     QString shownLabel_; // of a text in the editor that is none of the record's
     bool writeFailed_ = false;
     QString writeError_;
-    UndoLog undo_;
 };
 
 } // namespace mirel

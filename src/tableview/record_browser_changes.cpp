@@ -1,8 +1,6 @@
-#include "data/catalog.h"
-#include "data/provider_error.h"
 #include "platform/ole_date.h"
-#include "provider/conversion.h"
 #include "resources/string_table.h"
+#include "result/cell_text.h"
 #include "tableview/record_browser.h"
 
 #include <QDateTime>
@@ -13,283 +11,155 @@
 
 namespace mirel {
 
-using namespace Qt::StringLiterals;
+// The edit stays as the user left it.
+bool RecordBrowser::WriteFailure(const QString& text)
+{
+    writeError_ = text;
+    writeFailed_ = true;
+    return false;
+}
 
 bool RecordBrowser::WriteEdit()
 {
     if (!edit_.IsPending())
         return true;
-    const Value before = recordset_.FieldValue(selectedField_);
-    if (!recordset_.Update(selectedField_, edit_.Stored())) {
-        writeError_ = ProviderErrorText(&recordset_, recordset_.LastResult(), recordset_.ErrorContext());
-        writeFailed_ = true;
-        return false;
+    const FieldChange change{selectedField_, edit_.Stored()};
+    switch (result_.Update({&change, 1}, settings_.words)) {
+    case OpenResult::Written::Refused:
+    case OpenResult::Written::Gone:
+        return WriteFailure(result_.LastFailure());
+    case OpenResult::Written::Done:
+    case OpenResult::Written::GaveWay:
+        break;
     }
-    generation_ = recordset_.Generation();
     writeFailed_ = false;
-    const Value after = recordset_.FieldValue(selectedField_);
-    std::optional<RecordChange> change = NewChange(RecordChange::Kind::Changed);
-    if (change && before != after) {
-        change->fields = {{recordset_.Fields()[size_t(selectedField_)].column, before, after}};
-        undo_.Add({*change});
-    }
-    edit_.Load(after, TypeOfField(selectedField_), recordset_.FieldSize(selectedField_));
+    if (SelectedRecord() >= 0 && list_.RowOf(SelectedRecord()) != SelectedRow())
+        ShowRecordAgain(SelectedRecord()); // others have moved it meanwhile
+    edit_.Load(Recordset().FieldValue(selectedField_), TypeOfField(selectedField_),
+               Recordset().FieldSize(selectedField_));
     RefreshCell();
     return true;
 }
 
 // --- records ------------------------------------------------------------------------------------------------
 
-// Only what a new record does not have by itself: the store fills in its own keys and defaults.
-std::vector<FieldChange> RecordBrowser::NewRecordValues() const
+// Scrolls to the record, which is current, and fills the page.
+void RecordBrowser::ShowRecordAgain(qint64 record)
 {
-    const std::optional<double> today = OleDate(QDate::currentDate().startOfDay());
-    std::vector<FieldChange> values;
-    for (int field = 0; field < FieldCount(); ++field) {
-        if (!IsWritable(field))
-            continue;
-        if (TypeOfField(field) == FieldType::Date && today)
-            values.push_back({field, Value::Date(*today)});
-        else if (TypeOfField(field) == FieldType::YesNo)
-            values.push_back({field, Value::Bool(false)});
+    if (presentation_ == Presentation::List && record >= 0) {
+        list_.ScrollTo(list_.Top(), HighestTopRow());
+        list_.Show(record);
     }
-    return values;
+    FillPage();
+}
+
+bool RecordBrowser::IsRecordStillThere()
+{
+    const RecordId before = Recordset().Id();
+    TakeUpChanges();
+    if (SelectedRecord() >= 0 && Recordset().Id() == before)
+        return true;
+    prompt_.Show({Str::RecordDeletedMeanwhile, {}});
+    return false;
 }
 
 bool RecordBrowser::AddRecord()
 {
     if (!IsOpen() || FieldCount() == 0 || !WriteEdit())
         return false;
-    UndoLog::Step step;
-    if (!AddOne({}, &step)) {
-        ReportFailure();
+    if (result_.Add(result_.NewRecordValues(QDateTime::currentDateTime())) != OpenResult::Written::Done) {
+        prompt_.ShowError(result_.LastFailure());
         return false;
     }
-    undo_.Add(std::move(step));
-    count_.reset();
-    const qint64 added = Count() - 1;
-    const std::vector<int> fields = VisibleFields();
-    selectedField_ = fields.front();
-    topFieldRow_ = 0;
-    topRow_ = HighestTopRow();
-    ShowRecord(added);
-    FillPage();
+    selectedField_ = VisibleFields().front();
+    detail_.ScrollTo(0, 0);
+    list_.ScrollTo(HighestTopRow(), HighestTopRow());
+    ShowRecordAgain(SelectedRecord());
     LoadEditor();
     return true;
 }
 
 bool RecordBrowser::DeleteRecord()
 {
-    const qint64 record = SelectedRecord();
-    if (record < 0 || !WriteEdit())
+    if (!IsOpen() || SelectedRecord() < 0 || !WriteEdit())
+        return false;
+    const SeenRecord asked = result_.Seen(); // what the screen shows, whatever is there by now
+    if (!IsRecordStillThere())
         return false;
     if (Block().Records() > 1)
         return DeleteBlock();
     if (settings_.confirmDelete && !prompt_.AskYesNo({Str::DeleteRecordQuestion, {}}))
         return false;
-    UndoLog::Step step;
-    DbRecordset table(connection_);
-    NoteDeleted(table, step);
-    if (!recordset_.Delete()) {
-        ReportFailure();
+    const OpenResult::Written written = result_.Delete(asked, settings_.words);
+    if (written == OpenResult::Written::Refused) {
+        prompt_.ShowError(result_.LastFailure());
         RunAgain();
         return false;
     }
-    undo_.Add(std::move(step));
-    count_.reset();
-    topRow_ = std::min(topRow_, HighestTopRow());
-    ShowRecord(std::min(record, Count() - 1));
-    FillPage();
+    if (written == OpenResult::Written::Gone) {
+        prompt_.Show({Str::RecordDeletedMeanwhile, {}});
+        TakeUpChanges();
+        return false;
+    }
+    ShowRecordAgain(SelectedRecord());
     LoadEditor();
-    return true;
+    return written == OpenResult::Written::Done;
 }
 
 // --- many records at once -----------------------------------------------------------------------------------
 
-RecordBrowser::ManyChanged
-RecordBrowser::ChangeRecords(qint64 first, qint64 count,
-                             const std::function<std::vector<FieldChange>(qint64)>& values, Progress& progress)
+OpenResult::ManyWritten RecordBrowser::ChangeRecords(const std::vector<SeenRecord>& asked, qint64 count,
+                                                     const std::function<std::vector<FieldChange>(qint64)>& values,
+                                                     Progress& progress)
 {
-    constexpr qint64 kRecordsAStep = 64;
-    ManyChanged changed;
     if (!CanUpdate() || !WriteEdit())
-        return changed;
-    ProviderConnection& provider = *connection_.Provider();
-    if (const Hr begun = provider.BeginBulk(database_); Failed(begun)) {
-        changed.failure = ProviderErrorText(nullptr, begun, {});
-        return changed;
-    }
-    Count();
-    UndoLog::Step step;
-    while (changed.records < count && changed.failure.isEmpty()) {
-        if (changed.records % kRecordsAStep == 0 && !progress.Advance(changed.records))
-            break;
-        const std::vector<FieldChange> wanted = values(changed.records);
-        const auto refused = std::ranges::find_if(wanted, [this](const FieldChange& change) {
-            Value converted;
-            return Failed(ConvertForColumn(change.value, TypeOfField(change.field),
-                                           recordset_.FieldSize(change.field), converted));
-        });
-        if (refused != wanted.end())
-            changed.refusedField = refused->field;
-        const bool isUndone = count * qint64(wanted.size()) <= kMostUndoneCells;
-        if (ChangeOne(first + changed.records, wanted, isUndone ? &step : nullptr))
-            ++changed.records;
-        else
-            changed.failure = ProviderErrorText(&recordset_, recordset_.LastResult(), recordset_.ErrorContext());
-    }
-    if (const Hr ended = provider.EndBulk(database_); Failed(ended)) {
-        changed = {0, ProviderErrorText(nullptr, ended, {}), -1};
-        step.clear();
-    }
-    undo_.Add(std::move(step));
-    count_.reset();
-    ShowRecord(std::clamp<qint64>(SelectedRecord(), 0, Count() - 1));
-    FillPage();
+        return {};
+    const std::vector<FieldChange> presets = result_.NewRecordValues(QDateTime::currentDateTime());
+    const auto withPresets = [&](qint64 record) {
+        std::vector<FieldChange> wanted = values(record);
+        for (const FieldChange& preset : presets) {
+            const bool isNew = record >= qint64(asked.size());
+            if (isNew && std::ranges::find(wanted, preset.field, &FieldChange::field) == wanted.end())
+                wanted.push_back(preset);
+        }
+        return wanted;
+    };
+    const RecordId selected = Recordset().Id();
+    const OpenResult::ManyWritten written = result_.WriteMany(asked, count, withPresets, progress);
+    if (!result_.MoveToRecord(selected))
+        (void)result_.MoveTo(std::max<qint64>(SelectedRecord(), 0));
+    ShowRecordAgain(SelectedRecord());
     LoadEditor();
-    return changed;
+    return written;
 }
 
 bool RecordBrowser::DeleteBlock()
 {
     const CellBlock block = Block();
+    const std::vector<SeenRecord> asked = SeenFrom(block.firstRecord, block.Records());
     if (settings_.confirmDelete &&
         !prompt_.AskYesNo({Str::DeleteRecordsQuestion, {QString::number(block.Records())}}))
         return false;
-    const bool isUndone = block.Records() * FieldCount() <= kMostUndoneCells;
-    if (!isUndone && !prompt_.AskYesNo({Str::BeyondUndo, {}}))
+    if (block.Records() * FieldCount() > ChangeLog::kMostCells && !prompt_.AskYesNo({Str::BeyondUndo, {}}))
         return false;
-    ProviderConnection& provider = *connection_.Provider();
-    Hr result = provider.BeginBulk(database_);
-    if (Failed(result)) {
-        ReportProviderError(prompt_, nullptr, result);
-        return false;
+    OpenResult::ManyWritten deleted;
+    {
+        const std::unique_ptr<Progress> progress =
+            prompt_.StartProgress({Str::DeletingSelected, {}}, block.Records());
+        deleted = result_.DeleteMany(asked, *progress);
     }
-    UndoLog::Step step;
-    const bool deleted = DeleteFrom(block.firstRecord, block.lastRecord, isUndone ? &step : nullptr);
-    if (!deleted)
-        ReportFailure();
-    result = provider.EndBulk(database_);
-    ReportProviderError(prompt_, nullptr, result);
-    if (!Failed(result))
-        undo_.Add(std::move(step));
-    count_.reset();
-    topRow_ = std::min(topRow_, HighestTopRow());
-    ShowRecord(std::min(block.firstRecord, Count() - 1));
-    FillPage();
+    if (!deleted.failure.isEmpty())
+        prompt_.ShowError(deleted.failure);
+    if (deleted.leftAlone > 0)
+        prompt_.Show({Str::LeftAlone, {QString::number(deleted.leftAlone)}});
+    CollapseBlock();
+    (void)result_.MoveTo(block.firstRecord);
+    ShowRecordAgain(SelectedRecord());
     LoadEditor();
-    return deleted && !Failed(result);
-}
-
-// From the last to the first, so that those still to go keep their places. A stop is no failure.
-bool RecordBrowser::DeleteFrom(qint64 first, qint64 last, UndoLog::Step* step)
-{
-    constexpr qint64 kRecordsAStep = 64;
-    const std::unique_ptr<Progress> progress =
-        prompt_.StartProgress({Str::DeletingSelected, {}}, last - first + 1);
-    DbRecordset table(connection_);
-    for (qint64 record = last; record >= first; --record) {
-        if ((last - record) % kRecordsAStep == 0 && !progress->Advance(last - record))
-            return true;
-        if (!recordset_.MoveTo(record))
-            return false;
-        if (step)
-            NoteDeleted(table, *step);
-        if (!recordset_.Delete())
-            return false;
-    }
-    return true;
-}
-
-bool RecordBrowser::ChangeOne(qint64 record, std::vector<FieldChange> values, UndoLog::Step* step)
-{
-    if (record >= *count_)
-        return AddOne(std::move(values), step);
-    if (!recordset_.MoveTo(record))
-        return false;
-    std::optional<RecordChange> change;
-    if (step)
-        change = NewChange(RecordChange::Kind::Changed);
-    const auto read = [&](Value RecordChange::Field::*into) {
-        for (size_t i = 0; change && i < values.size(); ++i)
-            change->fields[i].*into = recordset_.FieldValue(values[i].field);
-    };
-    if (change) {
-        for (const FieldChange& value : values)
-            change->fields.push_back({recordset_.Fields()[size_t(value.field)].column, {}, {}});
-    }
-    read(&RecordChange::Field::before);
-    if (!recordset_.Update(values))
-        return false;
-    read(&RecordChange::Field::after);
-    if (change)
-        step->push_back(std::move(*change));
-    return true;
-}
-
-bool RecordBrowser::AddOne(std::vector<FieldChange> values, UndoLog::Step* step)
-{
-    for (const FieldChange& preset : NewRecordValues()) {
-        if (std::ranges::find(values, preset.field, &FieldChange::field) == values.end())
-            values.push_back(preset);
-    }
-    if (!recordset_.AddNew(values))
-        return false;
-    if (step)
-        NoteAdded(*step);
-    return true;
+    return deleted.failure.isEmpty();
 }
 
 // --- the way back -------------------------------------------------------------------------------------------
-
-// Of the current record, without its fields.
-std::optional<RecordChange> RecordBrowser::NewChange(RecordChange::Kind kind) const
-{
-    const std::optional<qint64> id = recordset_.RecordId();
-    const std::span<const ResultField> fields = recordset_.Fields();
-    const auto from =
-        std::ranges::find_if(fields, [](const ResultField& field) { return !field.column.isEmpty(); });
-    if (!id || from == fields.end())
-        return {};
-    return RecordChange{.kind = kind, .table = from->table, .id = *id, .fields = {}};
-}
-
-void RecordBrowser::NoteAdded(UndoLog::Step& step) const
-{
-    std::optional<RecordChange> change = NewChange(RecordChange::Kind::Added);
-    if (!change)
-        return;
-    for (int field = 0; field < FieldCount(); ++field) {
-        const QString& column = recordset_.Fields()[size_t(field)].column;
-        if (!column.isEmpty())
-            change->fields.push_back({column, {}, recordset_.FieldValue(field)});
-    }
-    step.push_back(std::move(*change));
-}
-
-// The whole record, also what of it the result does not show: `table` is opened for that where it is not yet.
-void RecordBrowser::NoteDeleted(DbRecordset& table, UndoLog::Step& step)
-{
-    std::optional<RecordChange> change = NewChange(RecordChange::Kind::Deleted);
-    if (!change)
-        return;
-    if (!table.IsOpen() &&
-        !table.Open(StatementOfTable(change->table), database_, CursorType::Static, LockType::Optimistic))
-        return;
-    std::vector<int> shown; // where the result has each of the table's columns
-    for (const ResultField& column : table.Fields()) {
-        const auto at = std::ranges::find(recordset_.Fields(), column.column, &ResultField::column);
-        shown.push_back(at == recordset_.Fields().end() ? -1 : int(at - recordset_.Fields().begin()));
-    }
-    const bool isWhole = std::ranges::find(shown, -1) == shown.end();
-    if (!isWhole && !table.MoveToRecord(change->id))
-        return;
-    for (int column = 0; column < table.FieldCount(); ++column) {
-        const Value value = isWhole ? recordset_.FieldValue(shown[size_t(column)]) : table.FieldValue(column);
-        change->fields.push_back({table.Fields()[size_t(column)].column, value, {}});
-    }
-    step.push_back(std::move(*change));
-}
 
 bool RecordBrowser::Undo()
 {
@@ -297,22 +167,22 @@ bool RecordBrowser::Undo()
         RevertEdit();
         return true;
     }
-    if (!IsOpen() || !undo_.CanUndo())
-        return true;
-    qint64 record = std::max<qint64>(SelectedRecord(), 0);
-    const UndoLog::Outcome outcome = undo_.Undo(connection_, database_, recordset_, prompt_);
-    count_.reset();
-    record = std::min(record, Count() - 1);
-    if (outcome.record && recordset_.MoveToRecord(*outcome.record)) {
-        record = recordset_.Position();
-        const auto at = std::ranges::find(recordset_.Fields(), outcome.column, &ResultField::column);
-        const int field = int(at - recordset_.Fields().begin());
-        if (field < FieldCount() && IsVisible(field))
-            selectedField_ = field;
-    }
-    topRow_ = std::min(topRow_, HighestTopRow());
-    ShowRecord(record);
-    FillPage();
+    return !IsOpen() || !result_.CanUndo() || ShowTurned(result_.Undo());
+}
+
+bool RecordBrowser::Redo()
+{
+    return !IsOpen() || !CanRedo() || ShowTurned(result_.Redo());
+}
+
+bool RecordBrowser::ShowTurned(const ChangeLog::Outcome& outcome)
+{
+    const auto at = std::ranges::find(Fields(), outcome.column, &ResultField::column);
+    const int field = int(at - Fields().begin());
+    if (!outcome.record.IsNull() && field < FieldCount() && IsVisible(field))
+        selectedField_ = field;
+    KeepSelectionInPage();
+    ShowRecordAgain(SelectedRecord());
     LoadEditor();
     return outcome.done;
 }

@@ -1,6 +1,4 @@
-#include "data/catalog.h"
-#include "data/statement_text.h"
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 #include "tableview/record_browser.h"
 
 #include <algorithm>
@@ -11,27 +9,6 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-QString RecordBrowser::ReferenceOf(int field) const
-{
-    const ResultField& shown = recordset_.Fields()[size_t(field)];
-    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
-    const bool isJoin = KeywordPosition(statement_, u"JOIN") >= 0 ||
-                        std::ranges::any_of(recordset_.Fields(), [&](const ResultField& other) {
-                            return !other.table.isEmpty() && other.table != shown.table;
-                        });
-    return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
-}
-
-QString RecordBrowser::TableOf(int field) const
-{
-    const std::span<const ResultField> fields = recordset_.Fields();
-    if (field >= 0 && field < FieldCount() && !fields[size_t(field)].table.isEmpty())
-        return fields[size_t(field)].table;
-    const auto first =
-        std::ranges::find_if(fields, [](const ResultField& other) { return !other.table.isEmpty(); });
-    return first == fields.end() ? QString() : first->table;
-}
-
 bool RecordBrowser::FilterByCell(CellFilter filter)
 {
     if (SelectedRecord() < 0 || selectedField_ < 0)
@@ -39,7 +16,7 @@ bool RecordBrowser::FilterByCell(CellFilter filter)
     if (!WriteEdit())
         return false;
     const FieldType type = TypeOfField(selectedField_);
-    const Value value = recordset_.FieldValue(selectedField_);
+    const Value value = Recordset().FieldValue(selectedField_);
     return AddCondition(ConditionFromCell(filter, ReferenceOf(selectedField_), type, value,
                                           DisplayText(value, type, settings_.words), settings_.words));
 }
@@ -48,19 +25,15 @@ bool RecordBrowser::AddCondition(const QString& condition)
 {
     if (!IsOpen() || IsEmpty() || condition.isEmpty())
         return true;
-    if (!Rewrite(WithCondition(statement_, condition)))
-        return false;
-    conditions_ += condition;
-    return true;
+    return WriteEdit() && Execute([&] { return result_.AddCondition(condition); });
 }
 
 bool RecordBrowser::RemoveFilter()
 {
     if (!IsOpen())
         return true;
-    if (!Rewrite(baseStatement_))
+    if (!WriteEdit() || !Execute([&] { return result_.RemoveConditions(); }))
         return false;
-    conditions_.clear();
     sort_ = {};
     return true;
 }
@@ -69,7 +42,7 @@ bool RecordBrowser::SortByTerms(const QString& terms)
 {
     if (!IsOpen() || IsEmpty() || terms.isEmpty())
         return true;
-    if (!Rewrite(WithOrder(statement_, terms)))
+    if (!WriteEdit() || !Execute([&] { return result_.OrderBy(terms); }))
         return false;
     sort_ = {};
     return true;

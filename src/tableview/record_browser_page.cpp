@@ -1,4 +1,4 @@
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 #include "tableview/record_browser.h"
 
 #include <algorithm>
@@ -14,20 +14,15 @@ using namespace Qt::StringLiterals;
 
 qint64 RecordBrowser::HighestTopRow() const
 {
-    if (count_)
-        return std::max<qint64>(*count_ - rowsPerPage_, 0);
+    if (const std::optional<qint64> count = KnownCount())
+        return list_.HighestTop(*count);
     // Until the count is known the end is where the page has shown that it goes on.
-    return topRow_ + std::max(page_.RowCount() - rowsPerPage_, 0);
-}
-
-int RecordBrowser::HighestFieldRow() const
-{
-    return std::max(FieldCount() - rowsPerPage_, 0);
+    return list_.Top() + std::max(page_.RowCount() - list_.WholeRows(), 0);
 }
 
 qint64 RecordBrowser::ScrollPosition() const
 {
-    return presentation_ == Presentation::List ? topRow_ : topFieldRow_;
+    return presentation_ == Presentation::List ? list_.Top() : detail_.Top();
 }
 
 qint64 RecordBrowser::HighestScrollPosition() const
@@ -39,9 +34,10 @@ qint64 RecordBrowser::HighestScrollPosition() const
 void RecordBrowser::SetRowsPerPage(int wholeRows)
 {
     wholeRows = std::max(wholeRows, 1);
-    if (wholeRows == rowsPerPage_)
+    if (wholeRows == list_.WholeRows())
         return;
-    rowsPerPage_ = wholeRows;
+    list_.SetWholeRows(wholeRows);
+    detail_.SetWholeRows(wholeRows);
     if (!IsOpen())
         return;
     KeepSelectionInPage();
@@ -51,21 +47,18 @@ void RecordBrowser::SetRowsPerPage(int wholeRows)
 void RecordBrowser::KeepSelectionInPage()
 {
     if (presentation_ == Presentation::Detail) {
-        topFieldRow_ =
-            std::clamp(topFieldRow_, std::max(selectedField_ - rowsPerPage_ + 1, 0), std::max(selectedField_, 0));
-        topFieldRow_ = std::min(topFieldRow_, HighestFieldRow());
-        return;
+        detail_.Show(selectedField_);
+        detail_.ScrollTo(detail_.Top(), HighestFieldRow());
+    } else if (SelectedRecord() >= 0) {
+        list_.Show(SelectedRecord());
+        list_.ScrollTo(list_.Top(), HighestTopRow());
     }
-    const qint64 record = SelectedRecord();
-    if (record < 0)
-        return;
-    topRow_ = std::clamp(topRow_, std::max<qint64>(record - rowsPerPage_ + 1, 0), record);
-    topRow_ = std::min(topRow_, HighestTopRow());
-    selectedRow_ = int(record - topRow_);
 }
 
 bool RecordBrowser::ScrollTo(qint64 position)
 {
+    if (!edit_.IsPending())
+        TakeUpChanges();
     if (presentation_ == Presentation::List && position > HighestTopRow())
         Count();
     position = std::clamp<qint64>(position, 0, HighestScrollPosition());
@@ -74,13 +67,16 @@ bool RecordBrowser::ScrollTo(qint64 position)
     if (!WriteEdit())
         return false;
     if (presentation_ == Presentation::List) {
-        topRow_ = position;
+        const int row = SelectedRow();
+        list_.ScrollTo(position, HighestTopRow());
+        FillPage();
+        SelectRecordInRow(row);
     } else {
-        const int row = selectedField_ - topFieldRow_;
-        topFieldRow_ = int(position);
-        selectedField_ = std::min(topFieldRow_ + row, FieldCount() - 1);
+        const int row = detail_.RowOf(selectedField_);
+        detail_.ScrollTo(position, HighestFieldRow());
+        selectedField_ = std::min(detail_.TopField() + row, FieldCount() - 1);
+        FillPage();
     }
-    FillPage();
     LoadEditor();
     return true;
 }
@@ -101,19 +97,26 @@ RecordBrowser::Work::~Work()
 
 void RecordBrowser::TakeUpChanges()
 {
-    if (!IsOpen() || edit_.IsPending() || working_)
+    if (!IsOpen() || working_)
         return;
-    const quint64 before = generation_;
-    FillPage();
-    if (generation_ == before)
+    const qint64 row = SelectedRecord() - list_.Top();
+    const bool isTyping = edit_.IsPending();
+    const auto values = isTyping ? ProviderRecordset::Values::Keep : ProviderRecordset::Values::ReadAgain;
+    const bool isOther = result_.TakeUpChanges(values);
+    const bool leavesGone = result_.IsGone() && !isTyping;
+    if (!isOther && !leavesGone)
         return;
-    // The recordset has found its record again, wherever it stands now.
-    const qint64 record = recordset_.Position();
-    if (record >= 0 && presentation_ == Presentation::List)
-        topRow_ = std::clamp<qint64>(record - std::max(selectedRow_, 0), 0, HighestTopRow());
-    ShowRecord(record >= 0 ? record : std::min(SelectedRecord(), Count() - 1));
+    if (leavesGone || (result_.Position() < 0 && Count() > 0))
+        (void)result_.MoveTo(std::max<qint64>(result_.Position(), 0));
+    if (presentation_ == Presentation::List && result_.Position() >= 0)
+        list_.ScrollTo(result_.Position() - std::max<qint64>(row, 0), HighestTopRow());
+    FindBlockAgain();
     FillPage();
+    if (isTyping)
+        return;
+    const std::optional<CellBlock> block = block_;
     LoadEditor();
+    block_ = block;
 }
 
 void RecordBrowser::FillPage()
@@ -122,36 +125,27 @@ void RecordBrowser::FillPage()
         fillLater_ = true;
         return;
     }
-    const auto fill = [this] { presentation_ == Presentation::List ? FillList() : FillDetail(); };
-    fill();
-    if (IsOpen() && recordset_.Generation() != generation_) { // another program was here
-        Recount();
-        topRow_ = std::min(topRow_, HighestTopRow());
-        fill();
-    }
+    presentation_ == Presentation::List ? FillList() : FillDetail();
     ++pageRevision_;
 }
 
 void RecordBrowser::FillList()
 {
     page_.rows.clear();
-    if (!IsOpen() || IsEmpty()) {
-        selectedRow_ = -1;
+    if (!IsOpen() || IsEmpty())
         return;
-    }
-    if (!ReadRows(topRow_, rowsPerPage_ + 1)) {
+    if (!ReadRows(list_.Top(), list_.WholeRows() + 1)) {
         ReportFailure();
         page_.rows.clear();
     }
-    if (page_.rows.empty() && !count_)
+    if (page_.rows.empty() && !KnownCount())
         Count();
-    selectedRow_ = page_.rows.empty() ? -1 : std::clamp(selectedRow_, 0, page_.RowCount() - 1);
 }
 
 bool RecordBrowser::ReadRows(qint64 first, int count)
 {
     const std::vector<int> fields = VisibleFields();
-    return recordset_.Read({.first = first, .count = count, .fields = fields}, [&](std::span<const Cell> cells) {
+    return Recordset().Read({.first = first, .count = count, .fields = fields}, [&](std::span<const Cell> cells) {
         std::vector<PageCell> row(cells.size());
         for (size_t i = 0; i < cells.size(); ++i) {
             row[i] = {GridText(cells[i], TypeOfField(fields[i]), settings_.words, settings_.maxColumnChars),
@@ -165,14 +159,14 @@ bool RecordBrowser::ReadRows(qint64 first, int count)
 void RecordBrowser::FillDetail()
 {
     page_.rows.clear();
-    if (!IsOpen() || detailRecord_ < 0)
+    if (!IsOpen() || SelectedRecord() < 0 || result_.IsGone())
         return;
-    const int last = std::min(topFieldRow_ + rowsPerPage_ + 1, FieldCount());
+    const int last = std::min(detail_.TopField() + detail_.WholeRows() + 1, FieldCount());
     std::vector<int> fields;
-    for (int field = topFieldRow_; field < last; ++field)
+    for (int field = detail_.TopField(); field < last; ++field)
         fields.push_back(field);
-    const ReadRange range{.first = detailRecord_, .count = 1, .fields = fields};
-    const bool read = recordset_.Read(range, [&](std::span<const Cell> cells) {
+    const ReadRange range{.first = SelectedRecord(), .count = 1, .fields = fields};
+    const bool read = Recordset().Read(range, [&](std::span<const Cell> cells) {
         for (size_t i = 0; i < cells.size(); ++i) {
             const FieldType type = TypeOfField(fields[i]);
             page_.rows.push_back({{FieldName(fields[i]), false},
@@ -183,8 +177,6 @@ void RecordBrowser::FillDetail()
     });
     if (!read)
         ReportFailure();
-    if (page_.rows.empty())
-        detailRecord_ = -1;
 }
 
 // The selected cell as the store has it now.
@@ -194,7 +186,7 @@ void RecordBrowser::RefreshCell()
     const int column = SelectedColumn();
     if (row < 0 || row >= page_.RowCount() || column < 0)
         return;
-    const Value value = recordset_.FieldValue(selectedField_);
+    const Value value = Recordset().FieldValue(selectedField_);
     const QString text = DisplayText(value, TypeOfField(selectedField_), settings_.words);
     page_.rows[size_t(row)][size_t(column)] = {CutForGrid(text, settings_.maxColumnChars), value.IsNull()};
     ++pageRevision_;
@@ -214,9 +206,8 @@ std::vector<int> RecordBrowser::VisibleFields() const
 
 int RecordBrowser::SelectedRow() const
 {
-    if (presentation_ == Presentation::List)
-        return selectedRow_;
-    const int row = selectedField_ - topFieldRow_;
+    const bool list = presentation_ == Presentation::List;
+    const int row = list ? list_.RowOf(SelectedRecord()) : detail_.RowOf(selectedField_);
     return row >= 0 && row < page_.RowCount() ? row : -1;
 }
 
@@ -229,39 +220,35 @@ int RecordBrowser::SelectedColumn() const
 
 qint64 RecordBrowser::SelectedRecord() const
 {
-    if (presentation_ == Presentation::Detail)
-        return detailRecord_;
-    return selectedRow_ < 0 ? -1 : topRow_ + selectedRow_;
+    return result_.Position();
 }
 
 void RecordBrowser::LoadEditor()
 {
-    const qint64 record = SelectedRecord();
     CollapseBlock();
     writeFailed_ = false;
     shownLabel_.clear();
-    const bool stands = IsOpen() && record >= 0 && selectedField_ >= 0 && recordset_.MoveTo(record) &&
-                        recordset_.Position() == record;
-    if (!stands) {
+    if (!IsOpen() || SelectedRecord() < 0 || selectedField_ < 0 || result_.IsGone()) {
         edit_.Unload();
         return;
     }
-    edit_.Load(recordset_.FieldValue(selectedField_), TypeOfField(selectedField_),
-               recordset_.FieldSize(selectedField_));
+    edit_.Load(Recordset().FieldValue(selectedField_), TypeOfField(selectedField_),
+               Recordset().FieldSize(selectedField_));
 }
 
-// Selects the record and scrolls no further than it takes to show it; the page is then to be filled.
-void RecordBrowser::ShowRecord(qint64 record)
+// Makes the record current, and scrolls no further than it takes to show it; the page is then to be filled.
+void RecordBrowser::SelectRecord(qint64 record)
 {
-    detailRecord_ = record;
-    if (presentation_ == Presentation::Detail)
+    if (record < 0 || !result_.MoveTo(record))
         return;
-    if (record < 0) {
-        selectedRow_ = -1;
-        return;
-    }
-    topRow_ = std::clamp(topRow_, std::max<qint64>(record - rowsPerPage_ + 1, 0), record);
-    selectedRow_ = int(record - topRow_);
+    if (presentation_ == Presentation::List)
+        list_.Show(result_.Position());
+}
+
+void RecordBrowser::SelectRecordInRow(int row)
+{
+    if (!page_.rows.empty())
+        SelectRecord(list_.Top() + std::clamp(row, 0, page_.RowCount() - 1));
 }
 
 bool RecordBrowser::SelectCell(int row, int column)
@@ -269,15 +256,23 @@ bool RecordBrowser::SelectCell(int row, int column)
     if (row < 0 || row >= page_.RowCount() || column < 0 || column >= page_.ColumnCount())
         return true;
     const bool list = presentation_ == Presentation::List;
-    const int field = list ? page_.columns[size_t(column)].field : topFieldRow_ + row;
+    const int field = list ? page_.columns[size_t(column)].field : detail_.TopField() + row;
     CollapseBlock();
     if (row == SelectedRow() && field == selectedField_)
         return true;
+    // The row is the one that the page shows: it is found before anything else moves.
+    std::vector<RecordId> pointed;
+    if (list && row != SelectedRow())
+        pointed = result_.IdsFrom(list_.Top() + row, 1);
     if (!WriteEdit())
         return false;
     selectedField_ = field;
-    if (list)
-        selectedRow_ = row;
+    if (list && row != SelectedRow()) {
+        SelectRecordInRow(row);
+        const bool isOther = !pointed.empty() && Recordset().Id() != pointed.front();
+        if (isOther && result_.MoveToRecord(pointed.front()))
+            ShowRecordAgain(result_.Position());
+    }
     LoadEditor();
     return true;
 }
@@ -286,19 +281,29 @@ bool RecordBrowser::MoveToRecord(qint64 record)
 {
     if (!IsOpen() || IsEmpty() || !WriteEdit())
         return !HasPendingEdit();
-    const qint64 lastOnPage = topRow_ + page_.RowCount() - 1;
+    const qint64 lastOnPage = list_.Top() + page_.RowCount() - 1;
     if (presentation_ == Presentation::Detail || record > lastOnPage)
         record = std::min(record, Count() - 1);
     record = std::max<qint64>(record, 0);
     CollapseBlock();
     if (record == SelectedRecord())
         return true;
-    const qint64 top = topRow_;
-    ShowRecord(record);
-    if (presentation_ == Presentation::Detail || topRow_ != top)
+    const qint64 top = list_.Top();
+    SelectRecord(record);
+    if (presentation_ == Presentation::Detail || list_.Top() != top)
         FillPage();
     LoadEditor();
     return true;
+}
+
+// Writes what is typed and takes up what others did, so that the step goes from where the record is now. False:
+// the step must not be taken.
+bool RecordBrowser::PrepareStep()
+{
+    if (!WriteEdit())
+        return false;
+    TakeUpChanges();
+    return IsOpen();
 }
 
 bool RecordBrowser::GoToFirst()
@@ -308,17 +313,17 @@ bool RecordBrowser::GoToFirst()
 
 bool RecordBrowser::GoToLast()
 {
-    return !IsOpen() || MoveToRecord(Count() - 1);
+    return !IsOpen() || (PrepareStep() && MoveToRecord(Count() - 1));
 }
 
 bool RecordBrowser::GoToNext()
 {
-    return MoveToRecord(SelectedRecord() + 1);
+    return !IsOpen() || (PrepareStep() && MoveToRecord(SelectedRecord() + 1));
 }
 
 bool RecordBrowser::GoToPrevious()
 {
-    return MoveToRecord(SelectedRecord() - 1);
+    return !IsOpen() || (PrepareStep() && MoveToRecord(SelectedRecord() - 1));
 }
 
 bool RecordBrowser::GoToRecord(qint64 number)
@@ -328,8 +333,8 @@ bool RecordBrowser::GoToRecord(qint64 number)
         return true;
     if (!WriteEdit())
         return false;
-    topRow_ = std::min(record, HighestTopRow()); // it becomes the top row, not just a row of the page
-    ShowRecord(record);
+    list_.ScrollTo(record, HighestTopRow()); // it becomes the top row, not just a row of the page
+    SelectRecord(record);
     FillPage();
     LoadEditor();
     return true;
@@ -343,20 +348,20 @@ bool RecordBrowser::GoToCell(qint64 record, int field)
     if (!MoveToRecord(record))
         return false;
     if (list)
-        return SelectCell(selectedRow_, page_.ColumnOfField(field));
+        return SelectCell(SelectedRow(), page_.ColumnOfField(field));
     return MoveRows(field - selectedField_);
 }
 
 bool RecordBrowser::MoveRows(qint64 rows)
 {
     if (presentation_ == Presentation::List)
-        return MoveToRecord(SelectedRecord() + rows);
+        return !IsOpen() || (PrepareStep() && MoveToRecord(SelectedRecord() + rows));
     if (page_.rows.empty() || !WriteEdit())
         return !HasPendingEdit();
     selectedField_ = int(std::clamp<qint64>(selectedField_ + rows, 0, FieldCount() - 1));
-    const int top = topFieldRow_;
+    const qint64 top = detail_.Top();
     KeepSelectionInPage();
-    if (topFieldRow_ != top)
+    if (detail_.Top() != top)
         FillPage();
     LoadEditor();
     return true;
@@ -366,28 +371,28 @@ bool RecordBrowser::MoveRows(qint64 rows)
 bool RecordBrowser::MovePages(int direction)
 {
     const qint64 before = ScrollPosition();
-    if (!ScrollBy(qint64(direction) * rowsPerPage_))
+    if (!ScrollBy(qint64(direction) * list_.WholeRows()))
         return false;
-    return ScrollPosition() != before || MoveRows(qint64(direction) * rowsPerPage_);
+    return ScrollPosition() != before || MoveRows(qint64(direction) * list_.WholeRows());
 }
 
 bool RecordBrowser::MoveColumns(int columns)
 {
     if (presentation_ == Presentation::Detail)
-        return MoveToRecord(SelectedRecord() + columns);
+        return !IsOpen() || (PrepareStep() && MoveToRecord(SelectedRecord() + columns));
     const int column = SelectedColumn();
-    return SelectCell(selectedRow_, std::clamp(column + columns, 0, std::max(page_.ColumnCount() - 1, 0)));
+    return SelectCell(SelectedRow(), std::clamp(column + columns, 0, std::max(page_.ColumnCount() - 1, 0)));
 }
 
 bool RecordBrowser::MoveToFirstColumn()
 {
-    return presentation_ == Presentation::Detail ? MoveRows(-FieldCount()) : SelectCell(selectedRow_, 0);
+    return presentation_ == Presentation::Detail ? MoveRows(-FieldCount()) : SelectCell(SelectedRow(), 0);
 }
 
 bool RecordBrowser::MoveToLastColumn()
 {
     return presentation_ == Presentation::Detail ? MoveRows(FieldCount())
-                                                 : SelectCell(selectedRow_, page_.ColumnCount() - 1);
+                                                 : SelectCell(SelectedRow(), page_.ColumnCount() - 1);
 }
 
 bool RecordBrowser::MoveToNextCell()
@@ -416,20 +421,21 @@ bool RecordBrowser::MoveToPreviousCell()
 
 bool RecordBrowser::TogglePresentation()
 {
-    if (!IsOpen() || !WriteEdit())
+    if (!IsOpen() || !PrepareStep())
         return false;
     if (presentation_ == Presentation::List) {
-        listState_ = {topRow_, selectedRow_};
-        detailRecord_ = SelectedRecord();
+        listState_ = {list_.Top(), SelectedRecord(), Recordset().Id()};
         presentation_ = Presentation::Detail;
-        topFieldRow_ = 0;
+        detail_.ScrollTo(0, 0);
     } else {
         presentation_ = Presentation::List;
         selectedField_ = SelectedFieldOrFirstVisible();
-        const qint64 saved = listState_.row < 0 ? -1 : listState_.topRow + listState_.row;
-        const bool inRange = saved >= 0 && saved < Count();
-        topRow_ = inRange ? std::min(listState_.topRow, HighestTopRow()) : 0;
-        ShowRecord(inRange ? saved : std::min<qint64>(Count(), 1) - 1);
+        const bool inRange = listState_.record >= 0 && listState_.record < Count();
+        if (!listState_.id.IsNull() && result_.MoveToRecord(listState_.id))
+            list_.ScrollTo(listState_.topRow + result_.Position() - listState_.record, HighestTopRow());
+        else if (result_.MoveTo(inRange ? listState_.record : 0))
+            list_.ScrollTo(inRange ? listState_.topRow : 0, HighestTopRow());
+        list_.Show(std::max<qint64>(result_.Position(), 0));
     }
     RebuildColumns();
     KeepSelectionInPage();
@@ -455,7 +461,7 @@ QString RecordBrowser::CounterText() const
 
 QString RecordBrowser::CounterTextAt(qint64 position) const
 {
-    const QString count = count_ ? QString::number(*count_) : u"…"_s;
+    const QString count = KnownCount() ? QString::number(*KnownCount()) : u"…"_s;
     return QString::number(position + 1) + u'/' + count;
 }
 

@@ -1,4 +1,5 @@
 // What a running form shows and what the user does to its controls; buttons are in form_buttons_test.cpp.
+#include "data/db_transaction.h"
 #include "form_fixture.h"
 #include "support/sqlite_file.h"
 
@@ -286,10 +287,11 @@ TEST_F(RunningFormTest, ComputesAggregatesOverTheWholeResult)
 TEST_F(RunningFormTest, StopsAnAggregatePassWhenTheUserDoes)
 {
     Run(u"CREATE TABLE Many (N Integer)"_s);
-    ASSERT_EQ(connection_.Provider()->BeginBulk(path_), Hr::Ok);
+    DbTransaction whole(connection_, path_);
+    EXPECT_TRUE(whole.Begin());
     for (int i = 0; i < 2048; ++i)
         Run(u"INSERT INTO Many (N) VALUES(1)"_s);
-    ASSERT_EQ(connection_.Provider()->EndBulk(path_), Hr::Ok);
+    EXPECT_TRUE(whole.Commit());
     FormBuilder form(u"Many");
     form.Whole(u"sum", u"SUM([N])");
     Start(form);

@@ -178,7 +178,7 @@ TEST_F(DatabaseFiles, OfOtherProgramsShowWhatTheyHold)
     EXPECT_EQ(FieldOf(*cursor), Value::Integer(77));
     EXPECT_EQ(cursor->Position(), 1);
     const FieldChange between{0, Value::Integer(5)};
-    ASSERT_EQ(cursor->AddNew({&between, 1}), Hr::Ok);
+    ASSERT_EQ(cursor->AddNew({&between, 1}, {}), Hr::Ok);
     EXPECT_EQ(FieldOf(*cursor), Value::Integer(5));
     EXPECT_EQ(cursor->RecordCount(), 3);
     EXPECT_EQ(Read(*cursor, {.fields = {0}}), (QStringList{u"2"_s, u"5"_s, u"77"_s}));

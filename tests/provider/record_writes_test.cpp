@@ -19,7 +19,7 @@ protected:
 
     void Add(ProviderRecordset& cursor, std::initializer_list<FieldChange> values)
     {
-        EXPECT_EQ(cursor.AddNew(values), Hr::Ok) << cursor.ErrorContext().toStdString();
+        EXPECT_EQ(cursor.AddNew(values, {}), Hr::Ok) << cursor.ErrorContext().toStdString();
     }
 };
 
@@ -37,7 +37,7 @@ TEST_F(RecordWrites, ComeBackAsTheyWereWritten)
     std::vector<FieldChange> values;
     for (int field = Name; field <= Memo; ++field)
         values.push_back({field, written[field]});
-    ASSERT_EQ(cursor->AddNew(values), Hr::Ok);
+    ASSERT_EQ(cursor->AddNew(values, {}), Hr::Ok);
     for (int field = Name; field <= Memo; ++field)
         EXPECT_EQ(FieldOf(*cursor, field), written[field]) << field;
     EXPECT_EQ(Rows(u"SELECT Day,Flag FROM T"_s), QStringList{u"2001-07-04 06:00:00|1"_s})
@@ -67,7 +67,7 @@ TEST_F(RecordWrites, AreRefusedWholeWhenAValueDoesNotFit)
     for (const auto& row : rows) {
         const FieldChange changes[] = {{Name, Value::Text(u"new"_s)}, row.change};
         EXPECT_EQ(cursor->Update(changes), row.expected) << row.what;
-        EXPECT_EQ(cursor->AddNew(changes), row.expected) << row.what;
+        EXPECT_EQ(cursor->AddNew(changes, {}), row.expected) << row.what;
     }
     EXPECT_EQ(Rows(u"SELECT Name,Whole FROM T"_s), QStringList{u"old|1"_s});
 }
@@ -129,15 +129,15 @@ TEST_F(BulkWrites, ChangeExactlyTheRecordsOfTheResult)
         Run(u"UPDATE T SET Small=0"_s);
         const auto cursor = Open(row.source);
         qint64 told = 0;
-        EXPECT_EQ(
-            cursor->UpdateAll(row.field, Value::Text(u"7"_s), [&told](qint64 done) { return (told = done) >= 0; }),
-            Hr::Ok);
+        EXPECT_EQ(cursor->UpdateAll(row.field, Value::Text(u"7"_s), -1,
+                                    [&told](qint64 done) { return (told = done) >= 0; }),
+                  Hr::Ok);
         EXPECT_EQ(told, row.records) << row.source.toStdString();
         EXPECT_EQ(Count(u"Small=7"_s).toInt(), row.records) << row.source.toStdString();
         EXPECT_EQ(cursor->RecordCount(), row.records) << "the result keeps its records";
     }
     const auto cursor = Open(u"SELECT * FROM T WHERE Name='x3'"_s);
-    EXPECT_EQ(cursor->DeleteAll({}), Hr::Ok);
+    EXPECT_EQ(cursor->DeleteAll(-1, {}), Hr::Ok);
     EXPECT_TRUE(cursor->AtEnd());
     EXPECT_EQ(cursor->RecordCount(), 0);
     EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount - 300);
@@ -146,9 +146,9 @@ TEST_F(BulkWrites, ChangeExactlyTheRecordsOfTheResult)
 TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
 {
     const auto cursor = Open(u"T"_s);
-    EXPECT_EQ(cursor->UpdateAll(Small, Value::SmallInt(1), [](qint64 done) { return done < 2000; }), Hr::Ok);
+    EXPECT_EQ(cursor->UpdateAll(Small, Value::SmallInt(1), -1, [](qint64 done) { return done < 2000; }), Hr::Ok);
     EXPECT_EQ(Count(u"Small=1"_s), u"2048"_s);
-    EXPECT_EQ(cursor->UpdateAll(Small, Value::Text(u"x"_s), {}), Hr::BadLiteral);
+    EXPECT_EQ(cursor->UpdateAll(Small, Value::Text(u"x"_s), -1, {}), Hr::BadLiteral);
 
     const QString foreign = PathOf(u"foreign.db"_s);
     Outside(foreign, "CREATE TABLE F (n INTEGER, v INTEGER CHECK (n<1500 OR v<5));"
@@ -156,7 +156,7 @@ TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
                      "INSERT INTO F SELECT n,0 FROM s");
     auto checked = provider->CreateRecordset();
     ASSERT_EQ(checked->Open(u"F"_s, foreign, CursorType::Static, LockType::Optimistic), Hr::Ok);
-    EXPECT_EQ(checked->UpdateAll(1, Value::Integer(9), {}), Hr::IntegrityViolation);
+    EXPECT_EQ(checked->UpdateAll(1, Value::Integer(9), -1, {}), Hr::IntegrityViolation);
     EXPECT_FALSE(checked->ErrorContext().isEmpty());
     ASSERT_EQ(
         checked->Open(u"SELECT COUNT(*) FROM F WHERE v=9"_s, foreign, CursorType::Static, LockType::ReadOnly),
@@ -164,12 +164,12 @@ TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
     EXPECT_EQ(FieldOf(*checked), Value::Integer(1499));
 
     const auto filtered = Open(u"SELECT * FROM T WHERE Whole>0"_s);
-    EXPECT_EQ(filtered->DeleteAll([](qint64 done) { return done < 1000; }), Hr::Ok);
+    EXPECT_EQ(filtered->DeleteAll(-1, [](qint64 done) { return done < 1000; }), Hr::Ok);
     EXPECT_EQ(filtered->RecordCount(), kCount - 1024);
     EXPECT_EQ(filtered->Position(), 0);
-    EXPECT_EQ(cursor->DeleteAll([](qint64) { return false; }), Hr::Ok);
+    EXPECT_EQ(cursor->DeleteAll(-1, [](qint64) { return false; }), Hr::Ok);
     EXPECT_EQ(cursor->RecordCount(), kCount - 1024) << "a whole table goes at once or not at all";
-    EXPECT_EQ(cursor->DeleteAll({}), Hr::Ok);
+    EXPECT_EQ(cursor->DeleteAll(-1, {}), Hr::Ok);
     EXPECT_EQ(cursor->RecordCount(), 0);
     EXPECT_TRUE(cursor->AtEnd());
 }
@@ -188,15 +188,27 @@ TEST_F(BulkWrites, AreOneTransactionBetweenBeginAndEnd)
         sqlite3_close(handle);
         return count;
     };
-    ASSERT_EQ(provider->BeginBulk(path), Hr::Ok);
-    ASSERT_EQ(provider->BeginBulk(path), Hr::Ok);
+    Hr result = Hr::Ok;
+    auto outer = provider->BeginTransaction(path, result, context);
+    auto inner = provider->BeginTransaction(path, result, context);
+    ASSERT_TRUE(outer && inner);
     Add(*cursor, {});
-    ASSERT_EQ(provider->EndBulk(path), Hr::Ok);
+    ASSERT_EQ(inner->Commit(), Hr::Ok);
     Run(u"INSERT INTO T (Name) VALUES ('b')"_s);
     EXPECT_EQ(outsideCount(), kCount);
-    ASSERT_EQ(provider->EndBulk(path), Hr::Ok);
+    ASSERT_EQ(outer->Commit(), Hr::Ok);
     EXPECT_EQ(outsideCount(), kCount + 2);
-    EXPECT_TRUE(Failed(provider->EndBulk(path))) << "there is none to end";
+    EXPECT_TRUE(Failed(outer->Commit())) << "it has ended";
+
+    // What is not committed is taken back, and so is the whole around it.
+    outer = provider->BeginTransaction(path, result, context);
+    inner = provider->BeginTransaction(path, result, context);
+    Add(*cursor, {});
+    EXPECT_EQ(cursor->RecordCount(), kCount + 3);
+    inner.reset();
+    EXPECT_TRUE(Failed(outer->Commit()));
+    EXPECT_EQ(outsideCount(), kCount + 2);
+    EXPECT_EQ(cursor->RecordCount(), kCount + 2) << "the cursor knows";
 }
 
 // In files from elsewhere a column can be the row id itself.
@@ -205,9 +217,11 @@ TEST_F(BulkWrites, OfAKeyLeaveTheCursorOnRecordsThatAreThere)
     Outside("CREATE TABLE K (Id INTEGER PRIMARY KEY, Name TEXT); INSERT INTO K VALUES (1,'a'),(2,'b')");
     const auto cursor = Open(u"K"_s);
     ASSERT_EQ(cursor->RecordCount(), 2);
-    EXPECT_EQ(cursor->UpdateAll(0, Value::Integer(7), {}), Hr::IntegrityViolation) << "only one can be 7";
+    EXPECT_EQ(cursor->UpdateAll(0, Value::Integer(7), -1, {}), Hr::IntegrityViolation) << "only one can be 7";
     EXPECT_EQ(Read(*cursor), (QStringList{u"2|b"_s, u"7|a"_s}));
     EXPECT_EQ(Read(*cursor, {.first = 1, .count = 1}), QStringList{u"7|a"_s});
+    EXPECT_TRUE(cursor->IsGone()) << "its key is another, and no neighbor stands in for it";
+    ASSERT_EQ(cursor->MoveNext(), Hr::Ok);
     EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"b"_s)) << "at the position of the record that went";
     ASSERT_EQ(cursor->MoveNext(), Hr::Ok);
     EXPECT_EQ(FieldOf(*cursor, 0), Value::Integer(7));

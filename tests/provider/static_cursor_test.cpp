@@ -122,7 +122,7 @@ TEST_F(StaticCursor, OwnAdditionsGoToTheEndAndOwnDeletionsLeave)
                 EXPECT_EQ(QString::number(FieldOf(*cursor).ToInt()), expected[position]);
             }
             const FieldChange value{0, Value::Integer(-1)};
-            ASSERT_EQ(cursor->AddNew({&value, 1}), Hr::Ok);
+            ASSERT_EQ(cursor->AddNew({&value, 1}, {}), Hr::Ok);
             expected += u"-1"_s;
             EXPECT_EQ(cursor->Position(), expected.size() - 1);
             EXPECT_EQ(FieldOf(*cursor), Value::Integer(-1));
@@ -168,6 +168,8 @@ TEST_F(StaticCursor, SeesChangedValuesAndVanishedRecords)
     EXPECT_EQ(FieldOf(*cursor), Value::Integer(0));
     const FieldChange change{0, Value::Integer(50)};
     ASSERT_EQ(other->Update({&change, 1}), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor), Value::Integer(0)) << "as it was shown";
+    ASSERT_EQ(cursor->TakeUpChanges(ProviderRecordset::Values::ReadAgain), Hr::Ok);
     EXPECT_EQ(FieldOf(*cursor), Value::Integer(50));
     EXPECT_EQ(Read(*cursor).first().section(u'|', 0, 0), u"50"_s) << "it keeps its place in the order";
     Outside("DELETE FROM T WHERE N=50");
@@ -240,26 +242,29 @@ TEST_F(StaticCursor, FindsARecordByItsNumberInEveryOrder)
     Fill(kMany);
     const auto table = Open(u"SELECT * FROM T"_s);
     ASSERT_EQ(table->MoveTo(1234), Hr::Ok);
-    const std::optional<qint64> id = table->RecordId();
-    ASSERT_TRUE(id);
+    const RecordId id = table->IdInTable();
+    ASSERT_FALSE(id.IsNull());
+    ASSERT_EQ(table->MoveNext(), Hr::Ok);
+    const RecordId next = table->IdInTable();
+    ASSERT_EQ(table->MoveTo(kMany - 1), Hr::Ok);
     const auto sorted = Open(u"SELECT N FROM T WHERE Grp=1 ORDER BY N DESC"_s);
-    ASSERT_EQ(sorted->MoveToRecord(*id), Hr::Ok);
+    ASSERT_EQ(sorted->MoveToRecord(id), Hr::Ok);
     EXPECT_EQ(FieldOf(*sorted).ToInt(), 1234);
-    EXPECT_EQ(sorted->RecordId(), id);
+    EXPECT_EQ(sorted->IdInTable(), id);
 
     const auto others = Open(u"SELECT N FROM T WHERE Grp=2"_s);
     ASSERT_EQ(others->MoveTo(7), Hr::Ok);
-    EXPECT_EQ(others->MoveToRecord(*id), Hr::NoCurrentRecord);
+    EXPECT_EQ(others->MoveToRecord(id), Hr::NoCurrentRecord);
     EXPECT_EQ(others->Position(), 7) << "nothing moved";
     Outside("DELETE FROM T WHERE N=1234");
-    for (const qint64 gone : {*id, 0LL, -1LL, kMany + 1})
-        EXPECT_EQ(table->MoveToRecord(gone), Hr::NoCurrentRecord) << gone;
-    EXPECT_EQ(table->MoveToRecord(*id + 1), Hr::Ok);
+    for (const RecordId& gone : {id, RecordId(), RecordId("no key of ours"), RecordId(QByteArray(8, '\x7f'))})
+        EXPECT_EQ(table->MoveToRecord(gone), Hr::NoCurrentRecord) << gone.Key().toStdString();
+    EXPECT_EQ(table->MoveToRecord(next), Hr::Ok);
     EXPECT_EQ(table->Position(), 1234);
 
     const auto fixed = Open(u"SELECT DISTINCT Grp FROM T"_s);
-    EXPECT_FALSE(fixed->RecordId());
-    EXPECT_EQ(fixed->MoveToRecord(1), Hr::NoCurrentRecord);
+    EXPECT_TRUE(fixed->Id().IsNull());
+    EXPECT_EQ(fixed->MoveToRecord(id), Hr::NoCurrentRecord);
 }
 
 } // namespace

@@ -40,16 +40,43 @@ protected:
     OtherProgram other{path};
 };
 
-TEST_F(TwoPrograms, AValueIsThatOfNowWithoutAMove)
+// What is compared is what was shown; a field that the other left alone is no reason to refuse.
+TEST_F(TwoPrograms, AWriteIsHeldAgainstTheValuesThatWereShown)
 {
-    const auto cursor = Open(u"T"_s);
-    EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"name 1"_s));
-    other.Run("UPDATE T SET Name='another' WHERE N=1");
-    QElapsedTimer waiting;
-    waiting.start();
-    while (FieldOf(*cursor, 1) != Value::Text(u"another"_s) && !waiting.hasExpired(5000)) {
+    using Values = ProviderRecordset::Values;
+    const FieldChange name{1, Value::Text(u"mine"_s)};
+    const struct {
+        const char* what;
+        const char* sql;
+        Hr update;
+        Hr remove;
+    } rows[] = {
+        {"the field itself", "UPDATE T SET Name='theirs' WHERE N=1", Hr::RecordChanged, Hr::RecordChanged},
+        {"another field", "UPDATE T SET N=-1 WHERE rowid=1", Hr::Ok, Hr::RecordChanged},
+        {"another record", "UPDATE T SET Name='theirs' WHERE N=2", Hr::Ok, Hr::Ok},
+        {"the file's structure, and another field: it may be another record by now",
+         "UPDATE T SET N=-1 WHERE rowid=1; CREATE TABLE U(a)", Hr::NoCurrentRecord, Hr::NoCurrentRecord},
+        {"the file's structure alone", "CREATE TABLE U(a)", Hr::Ok, Hr::Ok},
+        {"its key has gone to another record",
+         "DELETE FROM T WHERE N=1; INSERT INTO T(rowid,N,Name) VALUES(1,7,'n')", Hr::RecordChanged,
+         Hr::RecordChanged},
+    };
+    for (const auto& row : rows) {
+        for (const bool removes : {false, true}) {
+            SCOPED_TRACE(row.what);
+            other.Run("DELETE FROM T WHERE rowid<3; DROP TABLE IF EXISTS U;"
+                      "INSERT INTO T(rowid,N,Name) VALUES(1,1,'name 1'),(2,2,'name 2')");
+            const auto cursor = Open(u"T"_s);
+            ASSERT_EQ(FieldOf(*cursor, 1), Value::Text(u"name 1"_s));
+            other.Run(row.sql);
+            EXPECT_EQ(removes ? cursor->Delete() : cursor->Update({&name, 1}), removes ? row.remove : row.update);
+            if ((removes ? row.remove : row.update) != Hr::RecordChanged)
+                continue;
+            ASSERT_EQ(cursor->TakeUpChanges(Values::ReadAgain), Hr::Ok);
+            EXPECT_EQ(removes ? cursor->Delete() : cursor->Update({&name, 1}), Hr::Ok)
+                << "now they have been seen";
+        }
     }
-    EXPECT_EQ(FieldOf(*cursor, 1), Value::Text(u"another"_s));
 }
 
 TEST_F(TwoPrograms, AResultTakesUpWhatTheOtherCommitted)
@@ -65,7 +92,7 @@ TEST_F(TwoPrograms, AResultTakesUpWhatTheOtherCommitted)
         {"in front of it", "DELETE FROM T WHERE N<=1500", 1500, 500, 2001},
         {"between", "DELETE FROM T WHERE N>100 AND N<200", 2901, 1901, 2001},
         {"an insertion in front", "INSERT INTO T(rowid,N,Name) VALUES (-5,0,'first')", 3001, 2001, 2001},
-        {"the record itself", "DELETE FROM T WHERE N=2001", 2999, 2000, 2002},
+        {"the record itself: no neighbor takes its place", "DELETE FROM T WHERE N=2001", 2999, -1, 2002},
         {"its value", "UPDATE T SET N=N+1 WHERE N=2001", 3000, 2000, 2002},
         {"everything", "DELETE FROM T", 0, -1, 0},
     };
@@ -84,7 +111,12 @@ TEST_F(TwoPrograms, AResultTakesUpWhatTheOtherCommitted)
             EXPECT_GT(cursor->Generation(), generation);
             EXPECT_EQ(cursor->RecordCount(), row.count);
             EXPECT_EQ(cursor->Position(), row.position);
-            if (row.position >= 0) {
+            EXPECT_EQ(cursor->IsGone(), row.position < 0);
+            if (row.position < 0) {
+                EXPECT_EQ(cursor->Delete(), Hr::NoCurrentRecord);
+                EXPECT_EQ(cursor->MoveNext(), Hr::Ok) << "to the one that was behind it";
+            }
+            if (row.value > 0) {
                 EXPECT_EQ(FieldOf(*cursor), Value::Integer(row.value));
             }
             other.Run("DELETE FROM T; WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<3000) "

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "data/db_recordset.h"
+#include "data/db_transaction.h"
 #include "support/printing.h"
 #include "support/scripted_prompt.h"
 
@@ -21,14 +22,15 @@ protected:
         using namespace Qt::StringLiterals;
         Run(u"CREATE DATABASE '%1'"_s.arg(path), QString());
         Run(u"CREATE TABLE [People] ([Name] Varchar(10),[Age] Integer,[Born] DateTime,[Member] Bit,[Note] Text)"_s);
-        EXPECT_EQ(connection.Provider()->BeginBulk(path), Hr::Ok);
+        DbTransaction whole(connection, path);
+        EXPECT_TRUE(whole.Begin());
         for (int i = 1; i <= kPeople; ++i) {
             const QString age = i % 5 == 0 ? u"NULL"_s : QString::number(20 + i);
             const QString note = i == 1 ? longNote : u"note %1"_s.arg(i);
             Run(u"INSERT INTO People (Name,Age,Born,Member,Note) VALUES('P%1',%2,'2001-07-04',%3,'%4')"_s.arg(
                 QString::number(i), age, i % 2 == 0 ? u"TRUE"_s : u"FALSE"_s, note));
         }
-        EXPECT_EQ(connection.Provider()->EndBulk(path), Hr::Ok);
+        EXPECT_TRUE(whole.Commit());
     }
 
     void Run(const QString& statement, const QString& database)

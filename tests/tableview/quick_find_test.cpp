@@ -1,3 +1,4 @@
+#include "data/db_transaction.h"
 #include "tableview/quick_find.h"
 
 #include "tableview/people_fixture.h"
@@ -74,10 +75,11 @@ TEST_F(Find, WalksFromTheSelectedCellAndAroundTheEnd)
 TEST_F(Find, FindsTheSameInSlices)
 {
     constexpr int kMore = 1500;
-    ASSERT_EQ(connection.Provider()->BeginBulk(path), Hr::Ok);
+    DbTransaction whole(connection, path);
+    EXPECT_TRUE(whole.Begin());
     for (int i = 0; i < kMore; ++i)
         Run(u"INSERT INTO People (Name) VALUES ('M%1')"_s.arg(i));
-    ASSERT_EQ(connection.Provider()->EndBulk(path), Hr::Ok);
+    EXPECT_TRUE(whole.Commit());
     ASSERT_TRUE(browser.RunAgain());
     for (const int budgetMs : {kNoTime, kAtOnce}) {
         ASSERT_TRUE(browser.GoToCell(700, 0));

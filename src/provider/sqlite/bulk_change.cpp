@@ -52,6 +52,7 @@ Outcome BulkChange::Update(const BulkRanges& ranges, const FieldChange& change, 
     Value value;
     if (Outcome outcome = writer_.Convert(change, value); !outcome.Ok())
         return outcome;
+    file_.NoteValues();
     // FAIL keeps the records of a piece that were changed before the refused one.
     return Run("UPDATE OR FAIL " + Target() + " SET " + writer_.ColumnOf(change.field) + "=?3" +
                    Within(ranges.condition),

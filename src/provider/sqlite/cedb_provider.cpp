@@ -5,6 +5,39 @@
 #include "provider/sqlite/table_appender.h"
 
 namespace mirel::sqlite {
+namespace {
+
+class FileTransaction : public ProviderTransaction {
+public:
+    explicit FileTransaction(std::shared_ptr<DatabaseFile> file)
+        : file_(std::move(file))
+    {
+    }
+    ~FileTransaction() override
+    {
+        if (!isEnded_ && file_->IsOpen())
+            file_->RollBackTransaction();
+    }
+    Q_DISABLE_COPY_MOVE(FileTransaction)
+
+    Hr Commit() override
+    {
+        if (isEnded_ || !file_->IsOpen())
+            return Hr::NotOpen;
+        isEnded_ = true;
+        Outcome outcome = file_->CommitTransaction();
+        context_ = std::move(outcome.context);
+        return outcome.code;
+    }
+    QString ErrorContext() const override { return context_; }
+
+private:
+    std::shared_ptr<DatabaseFile> file_;
+    QString context_;
+    bool isEnded_ = false;
+};
+
+} // namespace
 
 CedbProvider::~CedbProvider()
 {
@@ -42,18 +75,16 @@ std::unique_ptr<RecordAppender> CedbProvider::CreateAppender(const QString& data
     return appender;
 }
 
-Hr CedbProvider::BeginBulk(const QString& database)
+std::unique_ptr<ProviderTransaction> CedbProvider::BeginTransaction(const QString& database, Hr& result,
+                                                                    QString& context)
 {
     Outcome outcome;
     const std::shared_ptr<DatabaseFile> file = FileOf(database, outcome);
-    return file ? file->BeginBulk().code : outcome.code;
-}
-
-Hr CedbProvider::EndBulk(const QString& database)
-{
-    Outcome outcome;
-    const std::shared_ptr<DatabaseFile> file = FileOf(database, outcome);
-    return file ? file->EndBulk().code : outcome.code;
+    if (file)
+        outcome = file->BeginTransaction();
+    result = outcome.code;
+    context = outcome.context;
+    return outcome.Ok() ? std::make_unique<FileTransaction>(file) : nullptr;
 }
 
 void CedbProvider::CloseDatabase(const QString& database)

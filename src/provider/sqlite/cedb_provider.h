@@ -22,8 +22,8 @@ public:
     std::unique_ptr<RecordAppender> CreateAppender(const QString& database, const QString& table,
                                                    const QStringList& columns, Hr& result,
                                                    QString& context) override;
-    Hr BeginBulk(const QString& database) override;
-    Hr EndBulk(const QString& database) override;
+    std::unique_ptr<ProviderTransaction> BeginTransaction(const QString& database, Hr& result,
+                                                          QString& context) override;
     void CloseDatabase(const QString& database) override;
 
     // The file of that path, opened when it is not yet; null, and why, when it cannot be.

@@ -157,6 +157,16 @@ bool CedbRecordset::AtEnd() const
     return !HasCursor() || cursor_->AtEnd();
 }
 
+bool CedbRecordset::IsGone() const
+{
+    return HasCursor() && cursor_->IsGone();
+}
+
+Hr CedbRecordset::TakeUpChanges(Values values)
+{
+    return OnCursor([values](ResultCursor& cursor) { return cursor.TakeUpChanges(values); });
+}
+
 qint64 CedbRecordset::Position() const
 {
     return HasCursor() ? cursor_->Position() : -1;
@@ -187,14 +197,29 @@ Hr CedbRecordset::MoveTo(qint64 position)
     return OnCursor([position](ResultCursor& cursor) { return cursor.MoveTo(position); });
 }
 
-std::optional<qint64> CedbRecordset::RecordId() const
+RecordId CedbRecordset::Id() const
 {
-    return HasCursor() ? cursor_->RecordId() : std::nullopt;
+    return HasCursor() ? cursor_->Id() : RecordId();
 }
 
-Hr CedbRecordset::MoveToRecord(qint64 id)
+RecordId CedbRecordset::IdInTable() const
 {
-    return OnCursor([id](ResultCursor& cursor) { return cursor.MoveToRecord(id); });
+    return HasCursor() ? cursor_->IdInTable() : RecordId();
+}
+
+Hr CedbRecordset::Ids(qint64 first, qint64 count, std::vector<RecordId>& ids)
+{
+    return OnCursor([&](ResultCursor& cursor) { return cursor.Ids(first, count, ids); });
+}
+
+Hr CedbRecordset::ReadRecords(std::span<const RecordId> ids, const RecordSink& sink)
+{
+    return OnCursor([&](ResultCursor& cursor) { return cursor.ReadRecords(ids, sink); });
+}
+
+Hr CedbRecordset::MoveToRecord(const RecordId& id)
+{
+    return OnCursor([&id](ResultCursor& cursor) { return cursor.MoveToRecord(id); });
 }
 
 Hr CedbRecordset::GetValue(int field, Value& value)
@@ -211,11 +236,11 @@ Hr CedbRecordset::Read(const ReadRange& range, const CellSink& sink)
     return OnCursor([&](ResultCursor& cursor) { return cursor.Read(range, sink); });
 }
 
-Hr CedbRecordset::AddNew(std::span<const FieldChange> values)
+Hr CedbRecordset::AddNew(std::span<const FieldChange> values, const RecordId& preferred)
 {
     if (HasCursor() && !AreFields(values))
         return Keep({Hr::NoSuchColumn, {}});
-    return Change([&](ResultCursor& cursor) { return cursor.AddNew(values); });
+    return Change([&](ResultCursor& cursor) { return cursor.AddNew(values, preferred); });
 }
 
 Hr CedbRecordset::Update(std::span<const FieldChange> values)
@@ -230,16 +255,16 @@ Hr CedbRecordset::Delete()
     return Change([](ResultCursor& cursor) { return cursor.Delete(); });
 }
 
-Hr CedbRecordset::UpdateAll(int field, const Value& value, const BulkProgress& progress)
+Hr CedbRecordset::UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress)
 {
     if (HasCursor() && !IsField(field))
         return Keep({Hr::NoSuchColumn, {}});
-    return Change([&](ResultCursor& cursor) { return cursor.UpdateAll(field, value, progress); });
+    return Change([&](ResultCursor& cursor) { return cursor.UpdateAll(field, value, confirmed, progress); });
 }
 
-Hr CedbRecordset::DeleteAll(const BulkProgress& progress)
+Hr CedbRecordset::DeleteAll(qint64 confirmed, const BulkProgress& progress)
 {
-    return Change([&](ResultCursor& cursor) { return cursor.DeleteAll(progress); });
+    return Change([&](ResultCursor& cursor) { return cursor.DeleteAll(confirmed, progress); });
 }
 
 } // namespace mirel::sqlite

@@ -35,23 +35,28 @@ public:
     bool AtEnd() const override;
     qint64 Position() const override;
 
+    bool IsGone() const override;
+    Hr TakeUpChanges(Values values) override;
     Hr MoveFirst() override;
     Hr MoveLast() override;
     Hr MoveNext() override;
     Hr MovePrevious() override;
     Hr MoveTo(qint64 position) override;
 
-    std::optional<qint64> RecordId() const override;
-    Hr MoveToRecord(qint64 id) override;
+    RecordId Id() const override;
+    RecordId IdInTable() const override;
+    Hr Ids(qint64 first, qint64 count, std::vector<RecordId>& ids) override;
+    Hr ReadRecords(std::span<const RecordId> ids, const RecordSink& sink) override;
+    Hr MoveToRecord(const RecordId& id) override;
 
     Hr GetValue(int field, Value& value) override;
     Hr Read(const ReadRange& range, const CellSink& sink) override;
 
-    Hr AddNew(std::span<const FieldChange> values) override;
+    Hr AddNew(std::span<const FieldChange> values, const RecordId& preferred) override;
     Hr Update(std::span<const FieldChange> values) override;
     Hr Delete() override;
-    Hr UpdateAll(int field, const Value& value, const BulkProgress& progress) override;
-    Hr DeleteAll(const BulkProgress& progress) override;
+    Hr UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress) override;
+    Hr DeleteAll(qint64 confirmed, const BulkProgress& progress) override;
 
 private:
     Outcome Run(const QString& source, const QString& database, CursorType cursor, LockType lock);

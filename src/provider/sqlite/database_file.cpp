@@ -216,7 +216,7 @@ void DatabaseFile::Close()
     cache_->Clear();
     cache_ = std::make_shared<StatementCache>(); // loans that are still out find theirs gone
     handle_.reset();
-    bulkDepth_ = 0;
+    depth_ = 0;
 }
 
 bool DatabaseFile::IsReadOnly() const
@@ -280,28 +280,51 @@ Outcome DatabaseFile::RefreshSchema()
     return outcome;
 }
 
-Outcome DatabaseFile::BeginBulk()
+Outcome DatabaseFile::BeginTransaction()
 {
-    if (bulkDepth_ == 0 && !InTransaction()) {
-        if (const Outcome outcome = Execute("BEGIN IMMEDIATE"); !outcome.Ok())
+    if (depth_ == 0) {
+        isDoomed_ = false;
+        isJoined_ = InTransaction(); // a walk of ours writes on its way
+        if (const Outcome outcome = Execute(isJoined_ ? "SAVEPOINT changes" : "BEGIN IMMEDIATE"); !outcome.Ok())
             return outcome;
     }
-    ++bulkDepth_;
+    ++depth_;
     return {};
 }
 
-Outcome DatabaseFile::EndBulk()
+Outcome DatabaseFile::CommitTransaction()
 {
-    if (bulkDepth_ == 0)
+    if (depth_ == 0)
         return {Hr::Unexpected, {}};
-    if (--bulkDepth_ > 0)
+    if (depth_ > 1) {
+        --depth_;
         return {};
-    if (!InTransaction()) // a full disk or a failing device took the whole run back
-        return {Hr::Unexpected, StringText(Str::BulkRunUndone, {path_})};
-    Outcome outcome = Execute("COMMIT");
-    if (!outcome.Ok())
-        (void)Execute("ROLLBACK");
+    }
+    Outcome outcome;
+    if (isDoomed_ || !InTransaction()) // taken back within, or by a full disk or a failing device
+        outcome = {Hr::Unexpected, StringText(Str::BulkRunUndone, {path_})};
+    else
+        outcome = Execute(isJoined_ ? "RELEASE changes" : "COMMIT");
+    if (outcome.Ok())
+        --depth_;
+    else
+        RollBackTransaction();
     return outcome;
+}
+
+void DatabaseFile::RollBackTransaction()
+{
+    if (depth_ == 0)
+        return;
+    isDoomed_ = true;
+    if (--depth_ > 0)
+        return;
+    ++rollbacks_;
+    if (!InTransaction())
+        return;
+    (void)Execute(isJoined_ ? "ROLLBACK TO changes" : "ROLLBACK");
+    if (isJoined_)
+        (void)Execute("RELEASE changes");
 }
 
 } // namespace mirel::sqlite

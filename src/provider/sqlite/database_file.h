@@ -56,12 +56,21 @@ public:
 
     // Grows whenever records may have come to or gone from a table by this process. (What other programs do
     // shows in PRAGMA data_version, what this process does never.)
-    quint64 TableVersion(const QString& table) const { return tableVersions_.value(table.toLower()); }
+    quint64 TableVersion(const QString& table) const { return tableVersions_.value(table.toLower()) + rollbacks_; }
     void NoteChange(const QString& table) { ++tableVersions_[table.toLower()]; }
+    // The same for values of records that stay where they are, of any table.
+    quint64 ValuesVersion() const { return valuesVersion_; }
+    void NoteValues() { ++valuesVersion_; }
 
-    // Changes between the two are one transaction; they nest.
-    Outcome BeginBulk();
-    Outcome EndBulk();
+    // What ProviderTransaction promises; each Begin that succeeds is ended once, by either of the others.
+    Outcome BeginTransaction();
+    Outcome CommitTransaction();
+    void RollBackTransaction();
+    bool IsOutermostTransaction() const { return depth_ == 1; }
+    // A full disk or a failing device has taken it back already: what is written now would be on its own.
+    bool IsTransactionLost() const { return depth_ > 0 && !InTransaction(); }
+    // Grows with every change of the file's structure, by anybody.
+    qint64 SchemaVersion() { return Number("PRAGMA schema_version"); }
     bool InTransaction() const { return handle_ && sqlite3_get_autocommit(handle_.get()) == 0; }
 
 private:
@@ -78,7 +87,11 @@ private:
     SchemaIds ids_;
     qint64 schemaVersion_ = -1;
     QHash<QString, quint64> tableVersions_;
-    int bulkDepth_ = 0;
+    quint64 valuesVersion_ = 0;
+    quint64 rollbacks_ = 0; // each may have changed any table back
+    int depth_ = 0;         // of transactions
+    bool isJoined_ = false; // the outermost one is within a transaction that was there
+    bool isDoomed_ = false; // an inner one was taken back: so is the whole
 };
 
 // The path under which a file is known whatever name it was reached by.

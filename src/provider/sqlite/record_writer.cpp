@@ -4,6 +4,7 @@
 #include "provider/sqlite/sql_writer.h"
 #include "resources/string_table.h"
 
+#include <algorithm>
 #include <optional>
 
 namespace mirel::sqlite {
@@ -22,10 +23,23 @@ QByteArray RecordWriter::ColumnOf(int field) const
     return QuoteName(fields_[size_t(field)].column);
 }
 
+// One of them alone may be the row id under another name.
+const QStringList& RecordWriter::KeyColumns() const
+{
+    if (keyColumns_)
+        return *keyColumns_;
+    keyColumns_.emplace();
+    Outcome outcome;
+    Statement columns =
+        file_.Prepare("SELECT name FROM pragma_table_info(" + QuoteText(name_) + ") WHERE pk>0", outcome);
+    while (columns && columns.Step() == SQLITE_ROW)
+        *keyColumns_ += columns.Text(0);
+    return *keyColumns_;
+}
+
 bool RecordWriter::MovesRecords(int field) const
 {
-    return file_.Number("SELECT count(*) FROM pragma_table_info(" + QuoteText(name_) +
-                        ") WHERE pk>0 AND name=" + QuoteText(fields_[size_t(field)].column)) > 0;
+    return KeyColumns().contains(fields_[size_t(field)].column);
 }
 
 Outcome RecordWriter::Convert(const FieldChange& change, Value& converted) const
@@ -69,13 +83,27 @@ Outcome RecordWriter::Run(const QByteArray& sql, std::span<const Value> values, 
     return {};
 }
 
-Outcome RecordWriter::Add(std::span<const FieldChange> values, qint64& rowId)
+bool RecordWriter::IsFree(qint64 rowId) const
+{
+    Outcome outcome;
+    Statement record = file_.Prepare("SELECT 1 FROM " + table_ + " WHERE " + rowId_ + "=?", outcome);
+    if (record)
+        record.Bind(1, rowId);
+    return record && record.Step() == SQLITE_DONE;
+}
+
+Outcome RecordWriter::Add(std::span<const FieldChange> values, std::optional<qint64> preferred, qint64& rowId)
 {
     std::vector<Value> converted;
     if (Outcome outcome = ConvertAll(values, converted); !outcome.Ok())
         return outcome;
     QByteArray names;
     QByteArray places;
+    const auto setsRowId = [this](const FieldChange& change) { return MovesRecords(change.field); };
+    if (preferred && std::ranges::none_of(values, setsRowId) && IsFree(*preferred)) {
+        names = rowId_;
+        places = QByteArray::number(*preferred);
+    }
     for (const FieldChange& change : values) {
         names += (names.isEmpty() ? "" : ",") + ColumnOf(change.field);
         places += places.isEmpty() ? "?" : ",?";
@@ -101,6 +129,8 @@ Outcome RecordWriter::Update(std::span<const FieldChange> values, qint64& rowId)
     Outcome outcome =
         Run("UPDATE " + table_ + " SET " + assignments + " WHERE " + rowId_ + "=? RETURNING " + rowId_, converted,
             rowId);
+    if (outcome.Ok())
+        file_.NoteValues();
     if (outcome.Ok() && rowId != old)
         file_.NoteChange(name_);
     return outcome;

@@ -3,6 +3,7 @@
 #include "provider/provider.h"
 #include "provider/sqlite/database_file.h"
 
+#include <optional>
 #include <span>
 
 namespace mirel::sqlite {
@@ -14,7 +15,8 @@ public:
     // `fields` are a result's; all that are written must be columns of `table`. The file must outlive it.
     RecordWriter(DatabaseFile& file, const dialect::Table& table, std::span<const ResultField> fields);
 
-    Outcome Add(std::span<const FieldChange> values, qint64& rowId);
+    // The record gets the row id `preferred` where no other has it.
+    Outcome Add(std::span<const FieldChange> values, std::optional<qint64> preferred, qint64& rowId);
     // `rowId` becomes another where a column that is the row id was changed.
     Outcome Update(std::span<const FieldChange> values, qint64& rowId);
     Outcome Delete(qint64 rowId);
@@ -29,6 +31,8 @@ public:
     const QByteArray& RowId() const { return rowId_; } // its alias
 
 private:
+    bool IsFree(qint64 rowId) const;
+    const QStringList& KeyColumns() const;
     Outcome ConvertAll(std::span<const FieldChange> values, std::vector<Value>& converted) const;
     Outcome Run(const QByteArray& sql, std::span<const Value> values, qint64& rowId);
 
@@ -37,6 +41,7 @@ private:
     QByteArray table_;
     QByteArray rowId_;
     std::vector<ResultField> fields_;
+    mutable std::optional<QStringList> keyColumns_; // once asked for
 };
 
 } // namespace mirel::sqlite

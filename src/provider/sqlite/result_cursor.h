@@ -3,8 +3,8 @@
 #include "provider/provider.h"
 #include "provider/sqlite/outcome.h"
 
-#include <optional>
 #include <span>
+#include <vector>
 
 namespace mirel::sqlite {
 
@@ -25,24 +25,29 @@ public:
 
     virtual bool AtBegin() const = 0;
     virtual bool AtEnd() const = 0;
+    virtual bool IsGone() const { return false; }
     virtual qint64 Position() const = 0;
+    virtual Outcome TakeUpChanges(ProviderRecordset::Values) { return {}; }
     virtual Outcome MoveFirst() = 0;
     virtual Outcome MoveLast() = 0;
     virtual Outcome MoveNext() = 0;
     virtual Outcome MovePrevious() = 0;
     virtual Outcome MoveTo(qint64 position) = 0;
 
-    virtual std::optional<qint64> RecordId() const { return {}; }
-    virtual Outcome MoveToRecord(qint64) { return {Hr::NoCurrentRecord, {}}; }
+    virtual RecordId Id() const { return {}; }
+    virtual RecordId IdInTable() const { return {}; }
+    virtual Outcome Ids(qint64, qint64, std::vector<RecordId>&) { return {Hr::NotImplemented, {}}; }
+    virtual Outcome ReadRecords(std::span<const RecordId>, const RecordSink&) { return {Hr::NotImplemented, {}}; }
+    virtual Outcome MoveToRecord(const RecordId&) { return {Hr::NoCurrentRecord, {}}; }
 
     virtual Outcome GetValue(int field, Value& value) = 0;
     virtual Outcome Read(const ReadRange& range, const CellSink& sink) = 0;
 
-    virtual Outcome AddNew(std::span<const FieldChange>) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome AddNew(std::span<const FieldChange>, const RecordId&) { return {Hr::ReadOnly, {}}; }
     virtual Outcome Update(std::span<const FieldChange>) { return {Hr::ReadOnly, {}}; }
     virtual Outcome Delete() { return {Hr::ReadOnly, {}}; }
-    virtual Outcome UpdateAll(int, const Value&, const BulkProgress&) { return {Hr::ReadOnly, {}}; }
-    virtual Outcome DeleteAll(const BulkProgress&) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome UpdateAll(int, const Value&, qint64, const BulkProgress&) { return {Hr::ReadOnly, {}}; }
+    virtual Outcome DeleteAll(qint64, const BulkProgress&) { return {Hr::ReadOnly, {}}; }
 };
 
 } // namespace mirel::sqlite

@@ -36,6 +36,14 @@ public:
     virtual bool IsComplete() const = 0;
 
     virtual Outcome KeyAt(qint64 position, RecordKey& key) = 0;
+    // The keys of the records from `first` to `end`, which is not among them.
+    virtual Outcome KeysBetween(qint64 first, qint64 end, std::vector<RecordKey>& keys)
+    {
+        Outcome outcome;
+        for (qint64 position = first; position < end && outcome.Ok(); ++position)
+            outcome = KeyAt(position, keys.emplace_back());
+        return outcome;
+    }
     // -1: the record is not there any more. Positions must be complete.
     virtual Outcome PositionOf(const RecordKey& key, qint64& position) = 0;
 

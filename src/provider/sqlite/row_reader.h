@@ -4,6 +4,7 @@
 #include "platform/field_type.h"
 #include "platform/ole_date.h"
 #include "platform/value.h"
+#include "provider/cell_value.h"
 #include "provider/provider.h"
 
 #include <sqlite3.h>
@@ -38,8 +39,6 @@ private:
     std::vector<Slot> slots_;
     std::vector<Cell> cells_;
 };
-
-Value ValueOfCell(const Cell& cell, FieldType type);
 
 // 0, 1, 2, …: all fields of a result.
 std::vector<int> AllFields(std::span<const ResultField> result);

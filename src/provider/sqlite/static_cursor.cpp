@@ -8,14 +8,35 @@
 #include "resources/string_table.h"
 
 #include <algorithm>
+#include <cstring>
 
 namespace mirel::sqlite {
 namespace {
 
 const QDeadlineTimer kNoHurry(QDeadlineTimer::Forever);
-// How old a value may be: asking what others have written costs as much as reading a record, and a form reads
-// fifty values of one.
-constexpr qint64 kFreshMs = 50;
+
+RecordId IdOf(const RecordKey& key)
+{
+    return RecordId(
+        QByteArray(reinterpret_cast<const char*>(key.constData()), key.size() * qsizetype(sizeof(qint64))));
+}
+
+// None: it is not the key of a record of so many tables.
+std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables)
+{
+    const QByteArray& bytes = id.Key();
+    if (bytes.isEmpty() || size_t(bytes.size()) != tables * sizeof(qint64))
+        return {};
+    RecordKey key(qsizetype(tables), kNoRow);
+    memcpy(key.data(), bytes.constData(), size_t(bytes.size()));
+    return key;
+}
+
+const Outcome& Gone()
+{
+    static const Outcome kGone{Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
+    return kGone;
+}
 
 } // namespace
 
@@ -39,6 +60,25 @@ Outcome StaticCursor::InRead(Work work)
         outcome = work();
     const Outcome ended = transaction.End();
     return outcome.Ok() ? ended : outcome;
+}
+
+// What is compared within cannot change before it is written. Inside a transaction of the caller's, that one
+// serves.
+template <typename Work>
+Outcome StaticCursor::InWrite(Work work)
+{
+    if (file_->IsTransactionLost())
+        return {Hr::Unexpected, StringText(Str::BulkRunUndone, {file_->Path()})};
+    Outcome outcome = file_->BeginTransaction();
+    if (!outcome.Ok())
+        return outcome;
+    outcome = work();
+    if (!outcome.Ok() && file_->IsOutermostTransaction()) {
+        file_->RollBackTransaction();
+        return outcome;
+    }
+    const Outcome committed = file_->CommitTransaction();
+    return outcome.Ok() ? committed : outcome;
 }
 
 Outcome StaticCursor::Open()
@@ -70,13 +110,21 @@ bool StaticCursor::HasTables() const
     });
 }
 
+quint64 StaticCursor::OwnVersion() const
+{
+    quint64 version = 0;
+    for (const PlannedSource& source : plan_.sources)
+        version += file_->TableVersion(source.table);
+    return version;
+}
+
 Outcome StaticCursor::ReadVersion(Version& version)
 {
     version = {};
     if (kept_) // rows of their own, which nobody changes
         return {};
-    for (const PlannedSource& source : plan_.sources)
-        version.own += file_->TableVersion(source.table);
+    version.own = OwnVersion();
+    version.values = file_->ValuesVersion();
     Outcome outcome;
     Statement statement = file_->Prepare("PRAGMA data_version", outcome);
     if (!statement)
@@ -91,29 +139,62 @@ Outcome StaticCursor::TakeUpChanges()
 {
     Version now;
     Outcome outcome = ReadVersion(now);
-    return !outcome.Ok() || now == version_ ? outcome : Restart();
+    if (!outcome.Ok() || now == version_)
+        return outcome;
+    valuesAged_ = !values_.empty();
+    const bool haveRecordsMoved = now.data != version_.data || now.own != version_.own;
+    if (haveRecordsMoved)
+        return Restart();
+    version_ = now;
+    ++generation_;
+    return {};
 }
 
-// Positions are made anew, and the current record is looked for among them.
+Outcome StaticCursor::TakeUpChanges(ProviderRecordset::Values values)
+{
+    const Outcome outcome = InRead([this] { return TakeUpChanges(); });
+    if (values == ProviderRecordset::Values::ReadAgain && valuesAged_) {
+        values_.clear();
+        valuesAged_ = false;
+        ++generation_;
+    }
+    return outcome;
+}
+
+// Positions are made anew, and the current record is looked for among them. Its values stay what they were when
+// they were asked for: a write compares them.
 Outcome StaticCursor::Restart()
 {
     rows_->Restart();
     ++generation_;
-    values_.clear();
     Outcome outcome = ReadVersion(version_);
-    return outcome.Ok() && place_ == Place::On ? FindCurrent(key_) : outcome;
+    return outcome.Ok() && (place_ == Place::On || place_ == Place::Gone) ? FindCurrent() : outcome;
 }
 
-// Where a record is gone, the one that took its position becomes current.
-Outcome StaticCursor::FindCurrent(const RecordKey& key)
+// Row ids are given anew when a file is compacted: where the structure is another, a record with the same one but
+// other values is not the record that was current.
+bool StaticCursor::IsAnotherRecord()
+{
+    if (values_.empty() || structureOfValues_ == file_->SchemaVersion())
+        return false;
+    std::vector<Value> now;
+    return !ReadCurrent(AllFields(plan_.fields), now).Ok() || now != values_;
+}
+
+// A record that is gone keeps the place where it was, and may come back there: by an undo elsewhere.
+Outcome StaticCursor::FindCurrent()
 {
     qint64 position = -1;
     Outcome outcome = CountAll();
     if (outcome.Ok())
-        outcome = rows_->PositionOf(key, position);
+        outcome = rows_->PositionOf(key_, position);
     if (!outcome.Ok())
         return outcome;
-    return Settle(position >= 0 ? position : position_);
+    if (position >= 0 && IsAnotherRecord())
+        position = -1;
+    place_ = position >= 0 ? Place::On : Place::Gone;
+    position_ = position >= 0 ? position : std::min(position_, rows_->Known());
+    return {};
 }
 
 Outcome StaticCursor::CountAll()
@@ -194,6 +275,8 @@ Outcome StaticCursor::MoveNext()
         Outcome outcome = TakeUpChanges();
         if (!outcome.Ok() || place_ == Place::Behind)
             return outcome;
+        if (place_ == Place::Gone) // the record behind it has its place now
+            return Settle(position_);
         return Settle(place_ == Place::Before ? 0 : position_ + 1);
     });
 }
@@ -210,69 +293,116 @@ Outcome StaticCursor::MovePrevious()
     });
 }
 
-std::optional<qint64> StaticCursor::RecordId() const
+RecordId StaticCursor::Id() const
+{
+    const bool stands = place_ == Place::On || place_ == Place::Gone;
+    return stands && !kept_ ? IdOf(key_) : RecordId();
+}
+
+RecordId StaticCursor::IdInTable() const
 {
     if (place_ != Place::On || !writer_ || key_[plan_.updatableSource] == kNoRow)
         return {};
-    return key_[plan_.updatableSource];
+    return IdOf({key_[plan_.updatableSource]});
 }
 
-Outcome StaticCursor::MoveToRecord(qint64 id)
+Outcome StaticCursor::Ids(qint64 first, qint64 count, std::vector<RecordId>& ids)
 {
-    if (!writer_ || plan_.sources.size() != 1)
-        return {Hr::NoCurrentRecord, {}};
-    return InRead([this, id] {
+    if (kept_)
+        return {Hr::NotImplemented, {}};
+    return InRead([&] {
+        Outcome outcome = rows_->Extend(first + count, kNoHurry);
+        std::vector<RecordKey> keys;
+        if (outcome.Ok() && first < rows_->Known())
+            outcome = rows_->KeysBetween(first, std::min(first + count, rows_->Known()), keys);
+        std::ranges::transform(keys, std::back_inserter(ids), IdOf);
+        return outcome;
+    });
+}
+
+Outcome StaticCursor::ReadRecords(std::span<const RecordId> ids, const RecordSink& sink)
+{
+    const std::vector<int> fields = AllFields(plan_.fields);
+    return InRead([&] {
+        Outcome outcome;
+        for (size_t i = 0; i < ids.size() && outcome.Ok(); ++i) {
+            const std::optional<RecordKey> key = kept_ ? std::nullopt : KeyOf(ids[i], plan_.sources.size());
+            if (!key)
+                return Gone();
+            outcome = rows_->ReadRecord(*key, fields, [&](std::span<const Cell> cells) {
+                sink(i, cells);
+                return false;
+            });
+        }
+        return outcome;
+    });
+}
+
+Outcome StaticCursor::MoveToRecord(const RecordId& id)
+{
+    const std::optional<RecordKey> key = KeyOf(id, plan_.sources.size());
+    if (kept_ || !key)
+        return Gone();
+    return InRead([this, &key] {
         qint64 position = -1;
         Outcome outcome = TakeUpChanges();
         if (outcome.Ok())
             outcome = CountAll();
         if (outcome.Ok())
-            outcome = rows_->PositionOf(RecordKey(1, id), position);
+            outcome = rows_->PositionOf(*key, position);
         if (!outcome.Ok() || position < 0)
-            return outcome.Ok() ? Outcome{Hr::NoCurrentRecord, StringText(Str::RecordIsGone)} : outcome;
+            return outcome.Ok() ? Gone() : outcome;
         return Settle(position);
     });
 }
 
-Outcome StaticCursor::LoadRecord()
+Outcome StaticCursor::ReadCurrent(std::span<const int> fields, std::vector<Value>& values)
 {
-    const std::vector<int> fields = AllFields(plan_.fields);
-    values_.clear();
-    Outcome outcome = InRead([&] {
-        Outcome read = ReadVersion(valuesVersion_);
-        if (!read.Ok())
-            return read;
-        return rows_->ReadRecord(key_, fields, [this](std::span<const Cell> cells) {
-            for (size_t i = 0; i < cells.size(); ++i)
-                values_.push_back(ValueOfCell(cells[i], plan_.fields[i].type));
-            return false;
-        });
+    Outcome outcome = rows_->ReadRecord(key_, fields, [&](std::span<const Cell> cells) {
+        for (size_t i = 0; i < cells.size(); ++i)
+            values.push_back(ValueOfCell(cells[i], plan_.fields[size_t(fields[i])].type));
+        return false;
     });
-    sinceLook_.start();
-    valuesAsOf_ = sqlite3_total_changes64(file_->Handle());
-    if (outcome.Ok() && values_.empty())
-        return {Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
-    return outcome;
+    return outcome.Ok() && values.empty() ? Gone() : outcome;
 }
 
-// Whether others may have changed the record since its values were read.
-bool StaticCursor::HaveValuesAged()
+Outcome StaticCursor::LoadRecord()
 {
-    if (valuesAsOf_ != sqlite3_total_changes64(file_->Handle()))
-        return true;
-    if (!sinceLook_.hasExpired(kFreshMs))
-        return false;
-    sinceLook_.start();
-    Version now;
-    return ReadVersion(now).Ok() && now != valuesVersion_;
+    values_.clear();
+    valuesAged_ = false;
+    return InRead([this] {
+        structureOfValues_ = writer_ ? file_->SchemaVersion() : -1;
+        return ReadCurrent(AllFields(plan_.fields), values_);
+    });
+}
+
+// Inside a write transaction: the current record is there, and `fields` of it hold what GetValue gave. Once the
+// file's structure is another, row ids may be others too: then all fields are compared.
+Outcome StaticCursor::CheckCurrent(std::span<const int> fields)
+{
+    if (place_ != Place::On)
+        return Gone();
+    if (values_.empty())
+        return {};
+    const std::vector<int> all = AllFields(plan_.fields);
+    if (structureOfValues_ != file_->SchemaVersion())
+        fields = all;
+    std::vector<Value> now;
+    if (Outcome outcome = ReadCurrent(fields, now); !outcome.Ok())
+        return outcome;
+    for (size_t i = 0; i < fields.size(); ++i) {
+        if (now[i] != values_[size_t(fields[i])])
+            return {Hr::RecordChanged, StringText(Str::RecordIsChanged)};
+    }
+    return {};
 }
 
 Outcome StaticCursor::GetValue(int field, Value& value)
 {
-    if (place_ != Place::On)
+    if (place_ != Place::On && place_ != Place::Gone)
         return {Hr::NoCurrentRecord, {}};
-    if (values_.empty() || HaveValuesAged()) {
-        if (Outcome outcome = LoadRecord(); !outcome.Ok())
+    if (values_.empty()) {
+        if (Outcome outcome = place_ == Place::On ? LoadRecord() : Gone(); !outcome.Ok())
             return outcome;
     }
     value = values_[size_t(field)];
@@ -289,24 +419,34 @@ Outcome StaticCursor::Read(const ReadRange& range, const CellSink& sink)
     });
 }
 
-// After a change of ours that the rows already know of.
+// After a change of ours that the rows already know of. What another program has committed since is still to come.
 void StaticCursor::AdoptOwnChange()
 {
-    (void)ReadVersion(version_);
+    version_.own = OwnVersion();
+    version_.values = file_->ValuesVersion();
     ++generation_;
     values_.clear();
 }
 
-Outcome StaticCursor::AddNew(std::span<const FieldChange> values)
+Outcome StaticCursor::AddNew(std::span<const FieldChange> values, const RecordId& preferred)
 {
-    Outcome outcome = CountAnew();
+    const std::optional<RecordKey> wanted = KeyOf(preferred, 1);
     RecordKey key(plan_.sources.size(), kNoRow);
-    if (outcome.Ok())
-        outcome = writer_->Add(values, key[plan_.updatableSource]);
+    Outcome outcome = CountAnew(); // before the lock is taken: it can take its time
+    if (outcome.Ok()) {
+        outcome = InWrite([&] {
+            Outcome taken = TakeUpChanges();
+            if (taken.Ok())
+                taken = CountAll();
+            const std::optional<qint64> rowId = wanted ? std::optional((*wanted)[0]) : std::nullopt;
+            return taken.Ok() ? writer_->Add(values, rowId, key[plan_.updatableSource]) : taken;
+        });
+    }
     if (!outcome.Ok())
         return outcome;
     place_ = Place::On;
     key_ = key;
+    values_.clear();
     if (!rows_->Append(key))
         return InRead([this] { return Restart(); });
     position_ = rows_->Known() - 1;
@@ -316,25 +456,44 @@ Outcome StaticCursor::AddNew(std::span<const FieldChange> values)
 
 Outcome StaticCursor::Update(std::span<const FieldChange> values)
 {
-    if (place_ != Place::On)
+    if (place_ != Place::On && place_ != Place::Gone)
         return {Hr::NoCurrentRecord, {}};
-    const qint64 old = RowIdOfCurrent();
-    const Outcome outcome = writer_->Update(values, RowIdOfCurrent());
+    qint64 rowId = RowIdOfCurrent();
+    std::vector<int> fields;
+    for (const FieldChange& change : values)
+        fields.push_back(change.field);
+    const Outcome outcome = InWrite([&] {
+        Outcome checked = TakeUpChanges();
+        if (checked.Ok())
+            checked = CheckCurrent(fields);
+        return checked.Ok() ? writer_->Update(values, rowId) : checked;
+    });
     if (!outcome.Ok())
         return outcome;
     values_.clear();
     ++generation_;
-    return RowIdOfCurrent() == old ? Outcome() : InRead([this] { return Restart(); });
+    version_.values = file_->ValuesVersion();
+    if (rowId == RowIdOfCurrent())
+        return {};
+    RowIdOfCurrent() = rowId;
+    return InRead([this] { return Restart(); });
 }
 
 Outcome StaticCursor::Delete()
 {
-    if (place_ != Place::On)
+    if (place_ != Place::On && place_ != Place::Gone)
         return {Hr::NoCurrentRecord, {}};
     Outcome outcome = CountAnew();
     if (!outcome.Ok())
         return outcome;
-    outcome = writer_->Delete(RowIdOfCurrent());
+    outcome = InWrite([&] {
+        Outcome checked = TakeUpChanges();
+        if (checked.Ok())
+            checked = CountAll();
+        if (checked.Ok())
+            checked = CheckCurrent(AllFields(plan_.fields));
+        return checked.Ok() ? writer_->Delete(RowIdOfCurrent()) : checked;
+    });
     if (!outcome.Ok())
         return outcome;
     rows_->Remove(position_, key_);
@@ -342,37 +501,64 @@ Outcome StaticCursor::Delete()
     return InRead([this] { return Settle(position_); });
 }
 
-Outcome StaticCursor::UpdateAll(int field, const Value& value, const BulkProgress& progress)
+// Inside the transaction that is to change them: no more records than were asked about.
+Outcome StaticCursor::CheckCount(qint64 confirmed)
 {
-    Outcome outcome = CountAnew();
-    if (!outcome.Ok())
-        return outcome;
-    const BulkRanges ranges = rows_->RangesFor(plan_.updatableSource);
-    BulkChange change(*file_, *writer_, plan_.sources[size_t(plan_.updatableSource)].alias);
-    const bool movesRecords = writer_->MovesRecords(field);
-    outcome = change.Update(ranges, {field, value}, progress);
-    AdoptOwnChange();
-    if (!movesRecords)
-        return outcome;
-    file_->NoteChange(writer_->TableName());
-    const Outcome restarted = InRead([this] { return Restart(); });
-    return outcome.Ok() ? restarted : outcome;
+    Outcome outcome = TakeUpChanges();
+    if (outcome.Ok())
+        outcome = CountAll();
+    if (outcome.Ok() && confirmed >= 0 && rows_->Known() > confirmed)
+        return {Hr::RecordChanged, StringText(Str::ResultHasGrown)};
+    return outcome;
 }
 
-Outcome StaticCursor::DeleteAll(const BulkProgress& progress)
+// A refused record leaves those before it written: the change keeps them itself, and says so by its outcome.
+Outcome StaticCursor::UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress)
 {
-    Outcome outcome = CountAnew();
+    Outcome changed;
+    const Outcome outcome = InWrite([&] {
+        Outcome checked = CheckCount(confirmed);
+        if (!checked.Ok())
+            return checked;
+        const BulkRanges ranges = rows_->RangesFor(plan_.updatableSource);
+        BulkChange change(*file_, *writer_, plan_.sources[size_t(plan_.updatableSource)].alias);
+        changed = change.Update(ranges, {field, value}, progress);
+        return Outcome();
+    });
     if (!outcome.Ok())
-        return outcome;
+        return changed.Ok() ? outcome : changed;
+    AdoptOwnChange();
+    if (writer_->MovesRecords(field)) {
+        file_->NoteChange(writer_->TableName());
+        const Outcome restarted = InRead([this] { return Restart(); });
+        if (changed.Ok())
+            return restarted;
+    }
+    return changed;
+}
+
+Outcome StaticCursor::DeleteAll(qint64 confirmed, const BulkProgress& progress)
+{
+    Outcome changed;
     const PlannedSource& source = plan_.sources[size_t(plan_.updatableSource)];
-    outcome = BulkChange(*file_, *writer_, source.alias).Delete(rows_->RangesFor(plan_.updatableSource), progress);
+    const Outcome outcome = InWrite([&] {
+        Outcome checked = CheckCount(confirmed);
+        if (!checked.Ok())
+            return checked;
+        BulkChange change(*file_, *writer_, source.alias);
+        changed = change.Delete(rows_->RangesFor(plan_.updatableSource), progress);
+        return Outcome();
+    });
+    if (!outcome.Ok())
+        return changed.Ok() ? outcome : changed;
     file_->NoteChange(source.table);
     place_ = Place::Before;
+    values_.clear();
     const Outcome restarted = InRead([this] {
         Outcome begun = Restart();
         return begun.Ok() ? Settle(0) : begun;
     });
-    return outcome.Ok() ? restarted : outcome;
+    return changed.Ok() ? restarted : changed;
 }
 
 } // namespace mirel::sqlite

@@ -7,15 +7,13 @@
 #include "provider/sqlite/result_cursor.h"
 #include "provider/sqlite/result_rows.h"
 
-#include <QElapsedTimer>
-
 #include <memory>
 #include <optional>
 
 namespace mirel::sqlite {
 
-// A result that knows its records by their keys, so that every position can be reached and every value is the
-// one of now. Notices what others changed, in this program or another, before it reads on.
+// A result that knows its records by their keys, so that every position can be reached. Notices what others
+// changed, in this program or another, before it uses positions again or writes.
 class StaticCursor : public ResultCursor {
 public:
     StaticCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan);
@@ -30,47 +28,59 @@ public:
 
     bool AtBegin() const override { return place_ == Place::Before; }
     bool AtEnd() const override { return place_ == Place::Behind; }
+    bool IsGone() const override { return place_ == Place::Gone; }
     qint64 Position() const override { return place_ == Place::On ? position_ : -1; }
+    Outcome TakeUpChanges(ProviderRecordset::Values values) override;
     Outcome MoveFirst() override { return MoveTo(0); }
     Outcome MoveLast() override;
     Outcome MoveNext() override;
     Outcome MovePrevious() override;
     Outcome MoveTo(qint64 position) override;
 
-    std::optional<qint64> RecordId() const override;
-    Outcome MoveToRecord(qint64 id) override;
+    RecordId Id() const override;
+    RecordId IdInTable() const override;
+    Outcome Ids(qint64 first, qint64 count, std::vector<RecordId>& ids) override;
+    Outcome ReadRecords(std::span<const RecordId> ids, const RecordSink& sink) override;
+    Outcome MoveToRecord(const RecordId& id) override;
 
     Outcome GetValue(int field, Value& value) override;
     Outcome Read(const ReadRange& range, const CellSink& sink) override;
 
-    Outcome AddNew(std::span<const FieldChange> values) override;
+    Outcome AddNew(std::span<const FieldChange> values, const RecordId& preferred) override;
     Outcome Update(std::span<const FieldChange> values) override;
     Outcome Delete() override;
-    Outcome UpdateAll(int field, const Value& value, const BulkProgress& progress) override;
-    Outcome DeleteAll(const BulkProgress& progress) override;
+    Outcome UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress) override;
+    Outcome DeleteAll(qint64 confirmed, const BulkProgress& progress) override;
 
 private:
-    enum class Place { Before, On, Behind };
+    enum class Place { Before, On, Gone, Behind };
 
     // What the records looked like when positions were last made.
     struct Version {
-        qint64 data = 0; // other programs
-        quint64 own = 0; // this one, through anybody
+        qint64 data = 0;    // other programs
+        quint64 own = 0;    // this one, through anybody: records that came or went
+        quint64 values = 0; // and values
         friend bool operator==(const Version&, const Version&) = default;
     };
 
     template <typename Work>
     Outcome InRead(Work work);
+    template <typename Work>
+    Outcome InWrite(Work work);
     bool HasTables() const;
+    quint64 OwnVersion() const;
     Outcome ReadVersion(Version& version);
     Outcome TakeUpChanges();
     Outcome Restart();
-    Outcome FindCurrent(const RecordKey& key);
+    bool IsAnotherRecord();
+    Outcome FindCurrent();
     Outcome Settle(qint64 position);
     Outcome CountAll();
     Outcome CountAnew(); // all, as they are now
+    Outcome ReadCurrent(std::span<const int> fields, std::vector<Value>& values);
     Outcome LoadRecord();
-    bool HaveValuesAged();
+    Outcome CheckCurrent(std::span<const int> fields);
+    Outcome CheckCount(qint64 confirmed);
     qint64& RowIdOfCurrent() { return key_[plan_.updatableSource]; }
     void AdoptOwnChange();
 
@@ -84,11 +94,10 @@ private:
 
     Place place_ = Place::Before;
     qint64 position_ = -1;
-    RecordKey key_;             // of the current record
-    std::vector<Value> values_; // of the current record, once one was asked for
-    qint64 valuesAsOf_ = -1;    // the handle's count of changes when they were read
-    Version valuesVersion_;     // and what others had written by then
-    QElapsedTimer sinceLook_;   // when that was last compared
+    RecordKey key_;                 // of the current record
+    std::vector<Value> values_;     // of the current record, once one was asked for
+    bool valuesAged_ = false;       // others may have changed it since
+    qint64 structureOfValues_ = -1; // the version of the file's structure when they were read
 };
 
 } // namespace mirel::sqlite

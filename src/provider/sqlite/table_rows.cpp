@@ -97,6 +97,22 @@ Outcome TableRows::KeyAt(qint64 position, RecordKey& key)
     return result == SQLITE_DONE ? Outcome{Hr::NoCurrentRecord, {}} : file_.OutcomeOf(result);
 }
 
+Outcome TableRows::KeysBetween(qint64 first, qint64 end, std::vector<RecordKey>& keys)
+{
+    const RowIdIndex::Place place = index_.PlaceOf(first);
+    Outcome outcome;
+    Statement walk = file_.Prepare(Select(rowId_, " WHERE @>=?1 ORDER BY @ LIMIT ?2 OFFSET ?3"), outcome);
+    if (!walk)
+        return outcome;
+    walk.Bind(1, place.rowId);
+    walk.Bind(2, end - first);
+    walk.Bind(3, place.skip);
+    int result = walk.Step();
+    for (; result == SQLITE_ROW; result = walk.Step())
+        keys.push_back({walk.Integer(0)});
+    return file_.OutcomeOf(result);
+}
+
 Outcome TableRows::PositionOf(const RecordKey& key, qint64& position)
 {
     if (const std::optional<qint64> known = index_.PositionOf(key[0])) {

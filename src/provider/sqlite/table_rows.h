@@ -19,6 +19,7 @@ public:
     bool IsComplete() const override { return index_.IsComplete(); }
 
     Outcome KeyAt(qint64 position, RecordKey& key) override;
+    Outcome KeysBetween(qint64 first, qint64 end, std::vector<RecordKey>& keys) override;
     Outcome PositionOf(const RecordKey& key, qint64& position) override;
     Outcome Read(const ReadRange& range, const CellSink& sink) override;
     Outcome ReadRecord(const RecordKey& key, std::span<const int> fields, const CellSink& sink) override;

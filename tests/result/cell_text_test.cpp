@@ -1,4 +1,4 @@
-#include "tableview/cell_text.h"
+#include "result/cell_text.h"
 
 #include "platform/ole_date.h"
 #include "support/printing.h"

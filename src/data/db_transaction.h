@@ -1,0 +1,38 @@
+#pragma once
+
+#include "data/db_connection.h"
+
+#include <QString>
+
+#include <memory>
+
+namespace mirel {
+
+// Changes to one database that are one transaction: all that is written to it from Begin on, through any
+// recordset, is on disk when Commit returns true, and taken back when this goes without it. They nest.
+//
+// No question is asked while one lives: others wait for it. The connection must outlive it.
+class DbTransaction {
+public:
+    DbTransaction(DbConnection& connection, QString database)
+        : connection_(connection)
+        , database_(std::move(database))
+    {
+    }
+
+    // Takes the lock for writing at once. False when another program holds it, or the database cannot be written.
+    [[nodiscard]] bool Begin();
+    [[nodiscard]] bool Commit();
+
+    Hr LastResult() const { return lastResult_; }
+    const QString& ErrorContext() const { return context_; }
+
+private:
+    DbConnection& connection_;
+    QString database_;
+    std::unique_ptr<ProviderTransaction> transaction_;
+    Hr lastResult_ = Hr::Ok;
+    QString context_;
+};
+
+} // namespace mirel

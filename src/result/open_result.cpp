@@ -1,0 +1,288 @@
+#include "result/open_result.h"
+
+#include "data/catalog.h"
+#include "data/provider_error.h"
+#include "data/statement_text.h"
+#include "platform/ole_date.h"
+#include "provider/cell_value.h"
+
+#include <algorithm>
+
+// The statement and the records; what is written is in open_result_writes.cpp.
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+// How long a small result may take to be counted before anybody sees it.
+constexpr int kFirstCountMs = 3;
+
+} // namespace
+
+OpenResult::OpenResult(DbConnection& connection, QString database, UserPrompt& prompt)
+    : connection_(connection)
+    , records_(connection)
+    , prompt_(prompt)
+    , database_(std::move(database))
+{
+}
+
+void OpenResult::Report()
+{
+    ReportProviderError(prompt_, &records_, records_.LastResult());
+}
+
+// --- the statement
+// ------------------------------------------------------------------------------------------------
+
+bool OpenResult::Open(const QString& statement)
+{
+    conditions_.clear();
+    baseStatement_ = statement;
+    return Execute(statement);
+}
+
+bool OpenResult::OpenInstead(const QString& statement)
+{
+    const QString base = baseStatement_;
+    const QString current = statement_;
+    const QStringList conditions = conditions_;
+    if (Open(statement))
+        return true;
+    if (base.isEmpty())
+        return false;
+    baseStatement_ = base;
+    if (Execute(current))
+        conditions_ = conditions;
+    return false;
+}
+
+bool OpenResult::Execute(const QString& statement)
+{
+    statement_ = statement;
+    ++runs_;
+    lookFailure_.clear();
+    if (!records_.Open(statement, database_, CursorType::Static, LockType::Optimistic)) {
+        Report();
+        Close();
+        return false;
+    }
+    Recount();
+    position_ = records_.Position();
+    return true;
+}
+
+void OpenResult::Close()
+{
+    records_.Close();
+    ++runs_;
+    count_ = 0;
+    position_ = -1;
+}
+
+bool OpenResult::Rewrite(const QString& statement)
+{
+    const QString before = statement_;
+    const RecordId id = records_.Id();
+    const qint64 position = position_;
+    if (Execute(statement))
+        return true;
+    if (Execute(before))
+        ReturnTo(id, position);
+    return false;
+}
+
+bool OpenResult::RunAgain()
+{
+    const RecordId id = records_.Id();
+    const qint64 position = position_;
+    if (!Execute(statement_))
+        return false;
+    ReturnTo(id, position);
+    return true;
+}
+
+// To the record, or to what is at its position now.
+void OpenResult::ReturnTo(const RecordId& id, qint64 position)
+{
+    if (position < 0 || position_ < 0 || (!id.IsNull() && records_.Id() == id))
+        return;
+    if (!id.IsNull() && records_.MoveToRecord(id))
+        position_ = records_.Position();
+    else
+        (void)MoveTo(position);
+}
+
+bool OpenResult::AddCondition(const QString& condition)
+{
+    if (!Rewrite(WithCondition(statement_, condition)))
+        return false;
+    conditions_ += condition;
+    return true;
+}
+
+bool OpenResult::OrderBy(const QString& terms)
+{
+    return Rewrite(WithOrder(statement_, terms));
+}
+
+bool OpenResult::RemoveConditions()
+{
+    if (!Rewrite(baseStatement_))
+        return false;
+    conditions_.clear();
+    return true;
+}
+
+// --- fields
+// -------------------------------------------------------------------------------------------------------
+
+bool OpenResult::IsWritable(int field) const
+{
+    return field >= 0 && field < FieldCount() && CanUpdate() && !Fields()[size_t(field)].column.isEmpty() &&
+           !IsBinary(records_.TypeOfField(field));
+}
+
+QString OpenResult::ReferenceOf(int field) const
+{
+    const ResultField& shown = Fields()[size_t(field)];
+    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
+    const bool isJoin =
+        KeywordPosition(statement_, u"JOIN") >= 0 || std::ranges::any_of(Fields(), [&](const ResultField& other) {
+            return !other.table.isEmpty() && other.table != shown.table;
+        });
+    return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+}
+
+QString OpenResult::TableOf(int field) const
+{
+    const std::span<const ResultField> fields = Fields();
+    if (field >= 0 && field < FieldCount() && !fields[size_t(field)].table.isEmpty())
+        return fields[size_t(field)].table;
+    const auto first =
+        std::ranges::find_if(fields, [](const ResultField& other) { return !other.table.isEmpty(); });
+    return first == fields.end() ? QString() : first->table;
+}
+
+std::vector<FieldChange> OpenResult::NewRecordValues(const QDateTime& now) const
+{
+    const std::optional<double> today = OleDate(now.date().startOfDay());
+    std::vector<FieldChange> values;
+    for (int field = 0; field < FieldCount(); ++field) {
+        if (!IsWritable(field))
+            continue;
+        if (records_.TypeOfField(field) == FieldType::Date && today)
+            values.push_back({field, Value::Date(*today)});
+        else if (records_.TypeOfField(field) == FieldType::YesNo)
+            values.push_back({field, Value::Bool(false)});
+    }
+    return values;
+}
+
+// --- records
+// ------------------------------------------------------------------------------------------------------
+
+qint64 OpenResult::Count()
+{
+    if (!count_) {
+        count_ = std::max<qint64>(records_.RecordCount(), 0);
+        generation_ = records_.Generation();
+    }
+    return *count_;
+}
+
+bool OpenResult::CountOn(int budgetMs)
+{
+    if (!count_ && records_.CountStep(budgetMs))
+        (void)Count();
+    return count_.has_value();
+}
+
+void OpenResult::Recount()
+{
+    count_.reset();
+    generation_ = records_.Generation();
+    (void)CountOn(kFirstCountMs);
+}
+
+bool OpenResult::MoveTo(qint64 position)
+{
+    if (!records_.MoveTo(std::max<qint64>(position, 0)) || (records_.IsEof() && !records_.MoveLast())) {
+        Report();
+        return false;
+    }
+    position_ = records_.Position();
+    return true;
+}
+
+bool OpenResult::MoveToRecord(const RecordId& id)
+{
+    if (!records_.MoveToRecord(id))
+        return false;
+    StandWhereRecordsAre();
+    return true;
+}
+
+// After the records have moved under the current one, or it among them.
+void OpenResult::StandWhereRecordsAre()
+{
+    Recount();
+    if (!records_.IsGone())
+        position_ = records_.Position();
+}
+
+bool OpenResult::TakeUpChanges(ProviderRecordset::Values values)
+{
+    if (!IsOpen() || isAsking_)
+        return false;
+    if (!records_.TakeUpChanges(values)) {
+        // Others dropped the table, or hold the file: told once, not at every look.
+        const QString failure = ProviderErrorText(&records_, records_.LastResult(), records_.ErrorContext());
+        if (failure != lookFailure_) {
+            lookFailure_ = failure;
+            Report();
+        }
+        return false;
+    }
+    lookFailure_.clear();
+    if (records_.Generation() == generation_)
+        return false;
+    StandWhereRecordsAre();
+    return true;
+}
+
+SeenRecord OpenResult::Seen()
+{
+    SeenRecord seen{records_.Id(), {}};
+    for (int field = 0; field < FieldCount(); ++field)
+        seen.values.push_back(records_.FieldValue(field));
+    return seen;
+}
+
+std::vector<RecordId> OpenResult::IdsFrom(qint64 first, qint64 count)
+{
+    std::vector<RecordId> ids;
+    if (!IsOpen() || first < 0 || count <= 0 || !records_.Ids(first, count, ids))
+        ids.clear();
+    return ids;
+}
+
+std::vector<SeenRecord> OpenResult::SeenFrom(qint64 first, qint64 count)
+{
+    const std::vector<RecordId> ids = IdsFrom(first, count);
+    std::vector<SeenRecord> seen;
+    for (const RecordId& id : ids)
+        seen.push_back({id, {}});
+    if (qint64(seen.size()) * FieldCount() > ChangeLog::kMostCells)
+        return seen;
+    const bool read = records_.ReadRecords(ids, [&](size_t index, std::span<const Cell> cells) {
+        for (size_t field = 0; field < cells.size(); ++field)
+            seen[index].values.push_back(ValueOfCell(cells[field], Fields()[field].type));
+    });
+    if (!read)
+        Report();
+    return seen;
+}
+
+} // namespace mirel
