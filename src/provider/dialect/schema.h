@@ -42,6 +42,7 @@ struct Table {
     QByteArray rowId;      // the alias under which rows are addressed (rowid, _rowid_, oid); empty: there is none
     bool writable = true;  // false for views, the catalog's tables and tables without an addressable row id
     bool isSystem = false; // the catalog's own tables
+    bool isView = false;
 
     const Column* FindColumn(QStringView columnName) const; // null: none
     const Index* FindIndex(QStringView indexName) const;    // null: none

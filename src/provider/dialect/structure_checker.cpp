@@ -152,11 +152,22 @@ std::optional<Failure> CheckStructure(StructureChange& change, const Schema& sch
 
 std::optional<Failure> RefuseChange(const Table& table)
 {
-    if (table.isSystem)
-        return Failure{Hr::AccessDenied, StringText(Str::CatalogTableIsReadOnly, {table.name})};
-    if (!table.writable)
-        return Failure{Hr::ReadOnly, {}};
-    return {};
+    if (table.writable)
+        return {};
+    const bool isGuarded = table.isSystem || !StampOfTable(table.name).isEmpty();
+    return Failure{isGuarded ? Hr::AccessDenied : Hr::ReadOnly, ReadOnlyReason(table)};
+}
+
+QString ReadOnlyReason(const Table& table)
+{
+    if (table.writable)
+        return {};
+    const bool isStamp = !StampOfTable(table.name).isEmpty();
+    const Str reason = table.isSystem ? Str::CatalogTableIsReadOnly
+                       : isStamp      ? Str::StampTableIsGuarded
+                       : table.isView ? Str::ViewIsReadOnly
+                                      : Str::TableHasNoRowIds;
+    return StringText(reason, {table.name});
 }
 
 } // namespace mirel::dialect

@@ -71,6 +71,7 @@ private:
     void PlanGroup(const Select& select, SelectPlan& plan);
     void PlanOrder(const Select& select, SelectPlan& plan);
     void PlanUse(const Select& select, SelectPlan& plan) const;
+    QString WhyReadOnly(const SelectPlan& plan, const std::vector<bool>& used) const;
     ResultField FieldOf(const SelectColumn& column) const;
 
     const Schema& schema_;
@@ -213,19 +214,34 @@ void Planner::PlanUse(const Select& select, SelectPlan& plan) const
     const auto isColumn = [](const ResultField& field) { return !field.column.isEmpty(); };
     const auto hasRowId = [](const PlannedSource& source) { return !source.rowId.isEmpty(); };
     plan.distinct = select.distinct;
+    plan.isAggregated = checker_.IsAggregated();
     plan.keyed = !select.distinct && !checker_.IsAggregated() && std::ranges::any_of(plan.fields, isColumn) &&
                  std::ranges::all_of(plan.sources, hasRowId);
-    if (!plan.keyed)
-        return;
     std::vector<bool> used(plan.sources.size());
     for (const SelectColumn& column : select.columns)
         CollectSources(column.expression, used);
+    plan.readOnlyReason = WhyReadOnly(plan, used);
+    if (plan.readOnlyReason.isEmpty())
+        plan.updatableSource = int(std::ranges::find(used, true) - used.begin());
+}
+
+// `used`: the sources that the columns read from.
+QString Planner::WhyReadOnly(const SelectPlan& plan, const std::vector<bool>& used) const
+{
+    if (plan.distinct)
+        return StringText(Str::DistinctIsReadOnly);
+    if (checker_.IsAggregated())
+        return StringText(Str::GroupsAreReadOnly);
+    for (const Source& source : checker_.Sources()) {
+        if (source.table->rowId.isEmpty() && !source.table->writable)
+            return ReadOnlyReason(*source.table);
+    }
+    if (!plan.keyed)
+        return StringText(Str::ComputedIsReadOnly);
     if (std::ranges::count(used, true) != 1)
-        return;
-    const auto only = std::ranges::find(used, true) - used.begin();
-    const Source& source = checker_.Sources()[size_t(only)];
-    if (source.table->writable && !source.optional)
-        plan.updatableSource = int(only);
+        return StringText(Str::JoinIsReadOnly);
+    const Source& source = checker_.Sources()[size_t(std::ranges::find(used, true) - used.begin())];
+    return source.optional ? StringText(Str::JoinIsReadOnly) : ReadOnlyReason(*source.table);
 }
 
 // A value that is only known as the statement runs is held against its column then: refused, never cut.
