@@ -33,7 +33,7 @@ Value ValueOf(const Cell& cell, FieldType type)
 {
     switch (cell.kind) {
     case Cell::Kind::Integer:
-        return type == FieldType::YesNo ? Value::Bool(cell.integer != 0) : Value::Double(double(cell.integer));
+        return type == FieldType::YesNo ? Value::Bool(cell.integer != 0) : Value::Whole(cell.integer);
     case Cell::Kind::Real:
         return Value::Double(cell.real);
     case Cell::Kind::Text: {

@@ -29,9 +29,13 @@ enum class LockType : int { ReadOnly = 1, Optimistic = 3 };
 struct ResultField {
     QString name; // as the result shows it
     FieldType type = FieldType::None;
-    int size = 0;   // characters of a Text, bytes of every other type; -1 where there is no limit
-    QString table;  // the table that the column comes from; empty for an expression
-    QString column; // its name in that table; empty for an expression
+    int size = 0;     // characters of a Text, bytes of every other type; -1 where there is no limit. An Integer of
+                      // another program's file has kWideIntegerSize and takes 64 bits
+    QString table;    // the table that the column comes from; empty for an expression
+    QString column;   // its name in that table; empty for an expression
+    QString source{}; // the table's alias in the statement, or its name; empty for an expression
+    bool isJoined = false; // the statement reads from several tables
+    QString expression{};  // as the statement writes it, ready to be compared; empty for a column
 };
 
 // A value for a column of an open result, by its index there.

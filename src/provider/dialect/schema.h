@@ -16,7 +16,7 @@ namespace mirel::dialect {
 struct Column {
     QString name;
     FieldType type = FieldType::None;
-    int size = 0;              // characters of a Text, bytes of a VarBinary; -1: no limit
+    int size = 0;              // characters of a Text, bytes of a VarBinary and of a wide Integer; -1: no limit
     int id = 0;                // FieldID: stable within a session
     bool foreignDates = false; // a date column whose values may be in forms other than ours: compared and
                                // sorted through a normalising function

@@ -23,7 +23,7 @@ int FieldSize(FieldType type, int declared)
     case FieldType::YesNo:
         return 2;
     case FieldType::Integer:
-        return 4;
+        return declared == kWideIntegerSize ? declared : 4;
     case FieldType::Double:
     case FieldType::Date:
         return 8;

@@ -98,8 +98,9 @@ Outcome SchemaReader::ReadColumns(dialect::Table& table)
         const QString name = row.Text(Name);
         const DeclaredType declared = ReadDeclaredType(row.Text(Type));
         const bool foreignDates = declared.type == FieldType::Date && !(isOurs_ && declared.own);
-        table.columns.push_back(
-            {name, declared.type, declared.size, file_.Ids().OfField(table.name, name), foreignDates});
+        const bool isWide = declared.type == FieldType::Integer && !(isOurs_ && declared.own);
+        const int size = isWide ? kWideIntegerSize : declared.size;
+        table.columns.push_back({name, declared.type, size, file_.Ids().OfField(table.name, name), foreignDates});
     });
 }
 

@@ -52,11 +52,13 @@ void Statement::Bind(int parameter, const Value& value)
     case ValueTag::Empty:
     case ValueTag::Null:
         return BindNull(parameter);
+    case ValueTag::Bool:
+        return Bind(parameter, qint64(value.ToBool()));
     case ValueTag::SmallInt:
     case ValueTag::Integer:
-    case ValueTag::Bool:
-        return Bind(parameter, qint64(value.ToInt()));
     case ValueTag::Double:
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            return Bind(parameter, *whole);
         return Bind(parameter, value.Number());
     case ValueTag::Date:
         if (const std::optional<StoredDate> date = StoredDateOf(value.Number())) {
