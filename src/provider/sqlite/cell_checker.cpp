@@ -62,6 +62,8 @@ Hr CellChecker::Check(const Cell& cell, Cell& stored)
 
 Hr CellChecker::CheckText(std::string_view utf8, Cell& stored) const
 {
+    if (!QByteArrayView(utf8.data(), qsizetype(utf8.size())).isValidUtf8())
+        return Hr::BadLiteral;
     const bool limited = type_ == FieldType::Text && size_ > 0;
     if (limited && utf8.size() > size_t(size_) && UnitsOf(utf8) > size_)
         return Hr::Overflow;
