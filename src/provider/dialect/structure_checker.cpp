@@ -36,6 +36,7 @@ private:
     bool FindTable(QString& name);
     bool FindColumn(QString& name);
     bool CheckNewTable(const QString& name);
+    bool HasStampTable() const;
     bool Fail(Hr code, QString context = {})
     {
         failure_ = {code, std::move(context)};
@@ -75,10 +76,19 @@ bool StructureChecker::CheckNewTable(const QString& name)
     return true;
 }
 
+bool StructureChecker::HasStampTable() const
+{
+    return std::ranges::any_of(schema_.tables,
+                               [](const Table& table) { return !StampOfTable(table.name).isEmpty(); });
+}
+
 bool StructureChecker::Check(CreateTable& create)
 {
     if (!CheckNewTable(create.table))
         return false;
+    // A database gets its stamp once: a second one would cut it off from its forms and queries.
+    if (!StampOfTable(create.table).isEmpty() && HasStampTable())
+        return Fail(Hr::AccessDenied, StringText(Str::StampTableIsGuarded, {create.table}));
     if (create.columns.size() > kMaxColumns)
         return Fail(Hr::TooManyColumns);
     for (auto column = create.columns.begin(); column != create.columns.end(); ++column) {
@@ -93,7 +103,10 @@ bool StructureChecker::Check(CreateTable& create)
 
 bool StructureChecker::Check(RenameTable& rename)
 {
-    return FindTable(rename.table) && CheckNewTable(rename.newName);
+    if (!FindTable(rename.table) || !CheckNewTable(rename.newName))
+        return false;
+    return StampOfTable(rename.newName).isEmpty() ||
+           Fail(Hr::AccessDenied, StringText(Str::StampTableIsGuarded, {rename.newName}));
 }
 
 bool StructureChecker::Check(AddColumn& add)
