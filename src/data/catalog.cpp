@@ -36,6 +36,15 @@ bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& sour
     return false;
 }
 
+// "[Ship To]": brackets around one name. "[x" and "[a]b" are names that begin so.
+bool IsBracketed(QStringView name)
+{
+    if (name.size() < 2 || name.front() != u'[' || name.back() != u']')
+        return false;
+    QString inner = name.sliced(1, name.size() - 2).toString();
+    return !inner.remove("]]"_L1).contains(u']');
+}
+
 // The first column of every row, as text.
 bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& database, QStringList& texts)
 {
@@ -125,7 +134,7 @@ bool Catalog::ListFields(const QString& table, const QString& database, QStringL
 {
     fields.clear();
     DbRecordset rows(connection_);
-    if (!RunOrReport(prompt_, rows, table.startsWith(u'[') ? table : u'[' + table + u']', database))
+    if (!RunOrReport(prompt_, rows, IsBracketed(table) ? table : BracketedName(table), database))
         return false;
     for (const ResultField& field : rows.Fields())
         fields += field.name;
@@ -175,16 +184,21 @@ QString SideFilePath(const QString& folder, const QString& stamp)
     return u"%1/Mirel_%2.RAF"_s.arg(folder, stamp);
 }
 
+QString BracketedName(QStringView name)
+{
+    return u'[' + name.toString().replace(u']', "]]"_L1) + u']';
+}
+
 QString FieldReference(QStringView name)
 {
-    const bool asItStands = name.isEmpty() || name.startsWith(u'[') || name == u"*";
+    const bool asItStands = name.isEmpty() || IsBracketed(name) || name == u"*";
     const auto isLatinLetter = [](QChar each) { return each.unicode() < 0x80 && each.isLetter(); };
     const bool plain = !name.isEmpty() && isLatinLetter(name.front()) && std::ranges::all_of(name, [](QChar each) {
-        return each.isLetter() || each.isDigit() || each == u'_';
+        return each.unicode() < 0x80 && (each.isLetterOrNumber() || each == u'_');
     });
     if (asItStands || (plain && !dialect::IsReservedWord(name)))
         return name.toString();
-    return u'[' + name.toString() + u']';
+    return BracketedName(name);
 }
 
 QString QuoteText(QStringView text)

@@ -55,8 +55,16 @@ bool TokenCursor::ExpectName(QString& name)
 {
     if (!AtName())
         return Fail();
-    name = current_.text.toString();
+    name = current_.Text();
     return Step();
+}
+
+bool TokenCursor::ExpectNewName(QString& name)
+{
+    if (!AtName())
+        return Fail();
+    name = current_.Text();
+    return name.startsWith(u'[') || name.contains(u']') ? Fail() : Step();
 }
 
 bool TokenCursor::ExpectText(QString& text)
