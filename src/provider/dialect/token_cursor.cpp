@@ -6,7 +6,7 @@ namespace mirel::dialect {
 namespace {
 
 // Room for filters that have added up to thousands of conditions, and for long texts in an INSERT.
-constexpr qsizetype kMaxUnits = 1 << 20;
+constexpr qsizetype kMaxUnits = 48 << 20;
 constexpr int kMaxTokens = 200000;
 
 } // namespace

@@ -79,15 +79,17 @@ private:
     SqlWriter writer_;
 };
 
-PlanFailure TooLong()
-{
-    return {Hr::SyntaxError, StringText(Str::StatementTooLong)};
-}
-
 PlanResult Planner::Finish(sqlite::Plan plan) const
 {
-    if (!writer_.Fits())
-        return TooLong();
+    switch (writer_.HowItFits()) {
+    case SqlWriter::Fit::Fits:
+        break;
+    case SqlWriter::Fit::TooDeep:
+        return PlanFailure{Hr::SyntaxError,
+                           StringText(Str::SyntaxTooDeep, {QString::number(writer_.TooDeepAt() + 1)})};
+    case SqlWriter::Fit::TooLong:
+        return PlanFailure{Hr::SyntaxError, StringText(Str::StatementTooLong)};
+    }
     return plan;
 }
 
