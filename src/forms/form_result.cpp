@@ -1,10 +1,8 @@
 #include "forms/form_result.h"
 
-#include "data/catalog.h"
 #include "data/provider_error.h"
 #include "data/statement_text.h"
 
-#include <algorithm>
 #include <utility>
 
 namespace mirel {
@@ -137,13 +135,7 @@ bool FormResult::RemoveFilter()
 
 QString FormResult::ReferenceOf(int field) const
 {
-    const std::span<const ResultField> fields = records_.Fields();
-    const ResultField& shown = fields[size_t(field)];
-    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
-    const bool isJoin = std::ranges::any_of(
-        fields, [&](const ResultField& other) { return !other.table.isEmpty() && other.table != shown.table; });
-    const bool needsTable = isJoin || KeywordPosition(query_, u"JOIN") >= 0;
-    return needsTable && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+    return FieldReferenceIn(records_.Fields(), field);
 }
 
 } // namespace mirel

@@ -13,13 +13,7 @@ using namespace Qt::StringLiterals;
 
 QString RecordBrowser::ReferenceOf(int field) const
 {
-    const ResultField& shown = recordset_.Fields()[size_t(field)];
-    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
-    const bool isJoin = KeywordPosition(statement_, u"JOIN") >= 0 ||
-                        std::ranges::any_of(recordset_.Fields(), [&](const ResultField& other) {
-                            return !other.table.isEmpty() && other.table != shown.table;
-                        });
-    return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+    return FieldReferenceIn(recordset_.Fields(), field);
 }
 
 QString RecordBrowser::TableOf(int field) const

@@ -159,10 +159,15 @@ ResultField Planner::FieldOf(const SelectColumn& column) const
     const Expr& expression = column.expression;
     if (expression.operation != Operation::Column) {
         const QString& name = column.alias.isEmpty() ? column.name.text : column.alias;
-        return {name, expression.type, FieldSize(expression.type, -1), {}, {}};
+        ResultField field{name, expression.type, FieldSize(expression.type, -1), {}, {}};
+        const bool isOperand = BindingOf(expression.operation) >= Binding::Text;
+        field.expression = isOperand ? column.name.text : u'(' + column.name.text + u')';
+        return field;
     }
-    const Table& table = *checker_.Sources()[size_t(expression.source)].table;
-    ResultField field = ResultFieldOf(table, table.columns[size_t(expression.column)]);
+    const Source& source = checker_.Sources()[size_t(expression.source)];
+    ResultField field = ResultFieldOf(*source.table, source.table->columns[size_t(expression.column)]);
+    field.source = source.name;
+    field.isJoined = checker_.Sources().size() > 1;
     if (!column.alias.isEmpty())
         field.name = column.alias;
     return field;
