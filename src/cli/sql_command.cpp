@@ -21,7 +21,7 @@ bool WriteRecords(Run& run, DbRecordset& records)
     range.count = run.Args().Count(Opt::Limit, -1);
     writer->Begin(records.Fields());
     Timing& timing = run.Times();
-    const bool measureJump = run.Args().Has(Opt::Offset);
+    const bool measureJump = run.Args().Has(Opt::Offset) && run.Args().Has(Opt::Timing);
     if (measureJump)
         records.RecordCount(); // finding the positions is no part of the jump
     QElapsedTimer sinceJump;

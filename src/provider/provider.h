@@ -87,7 +87,8 @@ public:
     // Finishes counting. -1 for a forward-only cursor.
     virtual qint64 RecordCount() = 0;
     // Counts on for about `budgetMs`; true once the count is known. Calls that need positions count by
-    // themselves: this is for a window that shows its first page before it knows how many there are.
+    // themselves: this is for a window that shows its first page before it knows how many there are. A budget
+    // below 0 counts nothing and only asks.
     virtual bool CountStep(int budgetMs) = 0;
     // Grows whenever the records may be others, or stand elsewhere, than before: own changes, and changes of
     // other programs once the cursor has taken them up.
