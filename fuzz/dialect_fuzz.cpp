@@ -1,7 +1,7 @@
 // Statements of the dialect: whatever the text, refusing it is fine. What was accepted must survive being
 // written and read again, and the SQL made of it must hold no text that was not meant to be there.
 #include "provider/dialect/parser.h"
-#include "provider/dialect/tree_text.h"
+#include "support/tree_text.h"
 #include "provider/sqlite/plan.h"
 
 #include <QString>

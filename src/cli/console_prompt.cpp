@@ -23,14 +23,14 @@ public:
     ConsoleProgress(const QString& what, qint64 total)
         : what_(what.toUtf8())
         , total_(total)
-        , isShown_(total > 0 && isatty(STDERR_FILENO) != 0)
+        , isShown_(total != 0 && isatty(STDERR_FILENO) != 0)
     {
         sinceShown_.start();
     }
     ~ConsoleProgress() override
     {
         constexpr char kEraseLine[] = "\r\033[K";
-        if (percent_ >= 0)
+        if (wasShown_)
             std::fputs(kEraseLine, stderr);
     }
     Q_DISABLE_COPY_MOVE(ConsoleProgress)
@@ -39,8 +39,11 @@ public:
     {
         constexpr int kShowEveryMs = 100;
         if (isShown_ && sinceShown_.elapsed() >= kShowEveryMs) {
-            percent_ = int(double(done) / double(total_) * 100);
-            std::fprintf(stderr, "\r%s %d %%", what_.constData(), percent_);
+            if (total_ > 0)
+                std::fprintf(stderr, "\r%s %d %%", what_.constData(), int(double(done) / double(total_) * 100));
+            else
+                std::fprintf(stderr, "\r%s %lld", what_.constData(), static_cast<long long>(done));
+            wasShown_ = true;
             sinceShown_.restart();
         }
         return !WasInterrupted();
@@ -50,7 +53,7 @@ private:
     QByteArray what_;
     qint64 total_;
     bool isShown_;
-    int percent_ = -1; // nothing was shown yet
+    bool wasShown_ = false;
     QElapsedTimer sinceShown_;
 };
 

@@ -5,11 +5,13 @@
 #include "data/provider_error.h"
 #include "expr/explain.h"
 #include "expr/expr_parser.h"
-#include "forms/record_context.h"
+#include "expr/function_library.h"
+#include "forms/form_context.h"
 #include "resources/string_table.h"
 
 #include <QHash>
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 
@@ -75,23 +77,47 @@ public:
     {
         if (run_.Args().Has(Opt::Database) && !OpenSource())
             return false;
-        RecordContext context(records_, Settings(Profile(run_.Folder().ProfileFile())).Words(),
-                              [this](QStringView name) { return controls_.value(name.toString()); });
+        FormContext context(
+            records_, Settings(Profile(run_.Folder().ProfileFile())).Words(),
+            [this](QStringView name) { return controls_.value(name.toString()); }, &QDateTime::currentDateTime);
         if (!run_.Args().Has(Opt::All))
             WriteValue(context);
-        for (bool more = run_.Args().Has(Opt::All) && !records_.IsEof(); more; more = !records_.IsEof()) {
-            WriteValue(context);
-            if (run_.Out().HasFailed() || WasInterrupted())
-                return false;
-            if (!records_.MoveNext())
-                return Report();
-        }
+        else if (!records_.IsEof() && !WriteAll(context))
+            return false;
         if (run_.Args().Has(Opt::Timing) && evaluations_ > 0)
             run_.Times().nsPerEval = double(evaluationNs_) / double(evaluations_);
         return true;
     }
 
 private:
+    bool WriteAll(FormContext& whole)
+    {
+        RowContext context(whole, tree_ && AsksForCount(*tree_) ? records_.RecordCount() : -1);
+        if (tree_)
+            context.Collect(*tree_);
+        ReadRange range{.fields = context.Columns()};
+        if (range.fields.empty())
+            range.fields = {0}; // none would be all of them
+        qint64 position = 0;
+        const bool read = records_.Read(range, [&](std::span<const Cell> cells) {
+            context.Lend(position++, cells);
+            WriteValue(context);
+            return !run_.Out().HasFailed() && !WasInterrupted();
+        });
+        return read ? !run_.Out().HasFailed() && !WasInterrupted() : Report();
+    }
+
+    // Counting takes a walk of its own.
+    static bool AsksForCount(const ExprNode& node)
+    {
+        constexpr std::array<QStringView, 3> kCounts = {u"RECCOUNT", u"COUNT", u"SEEKTOTAL"};
+        const bool isCount = std::ranges::any_of(
+            kCounts, [&node](QStringView name) { return int(node.code) == FindFunction(name)->code; });
+        return isCount || std::ranges::any_of(node.args, [](const ExprTree& argument) {
+                   return argument && AsksForCount(*argument);
+               });
+    }
+
     bool Report()
     {
         ReportProviderError(run_.Prompt(), &records_, records_.LastResult());

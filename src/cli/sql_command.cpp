@@ -3,6 +3,7 @@
 #include "cli/run.h"
 #include "cli/statement_splitter.h"
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 
 #include <QFile>
 
@@ -20,7 +21,7 @@ bool WriteRecords(Run& run, DbRecordset& records)
     range.count = run.Args().Count(Opt::Limit, -1);
     writer->Begin(records.Fields());
     Timing& timing = run.Times();
-    const bool measureJump = run.Args().Has(Opt::Offset);
+    const bool measureJump = run.Args().Has(Opt::Offset) && run.Args().Has(Opt::Timing);
     if (measureJump)
         records.RecordCount(); // finding the positions is no part of the jump
     QElapsedTimer sinceJump;
@@ -39,12 +40,16 @@ bool WriteRecords(Run& run, DbRecordset& records)
 bool RunScript(Run& run, QIODevice& script)
 {
     StatementSplitter splitter;
-    while (!script.atEnd()) {
+    for (qint64 number = 1; !script.atEnd(); ++number) {
         QByteArray line = script.readLine();
         while (line.endsWith('\n') || line.endsWith('\r'))
             line.chop(1);
         if (WasInterrupted())
             return false;
+        if (!QByteArrayView(line).isValidUtf8()) {
+            run.Prompt().ShowError(StringText(Str::LineIsNoUtf8, {QString::number(number)}));
+            return false;
+        }
         const std::optional<QString> statement = splitter.AddLine(QString::fromUtf8(line));
         if (statement && !statement->isEmpty() && !RunStatement(run, *statement))
             return false;

@@ -3,6 +3,7 @@
 #include "data/db_recordset.h"
 #include "data/provider_error.h"
 #include "provider/dialect/keywords.h"
+#include "provider/dialect/schema.h"
 
 #include <QDateTime>
 #include <QFileInfo>
@@ -15,19 +16,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QStringView kSystemTablePrefix = u"MirelSys";
-constexpr qsizetype kStampDigits = 14;
-
-// The digits behind the prefix; empty for every other table, also for one that merely begins so.
-QString StampOfTable(const QString& table)
-{
-    if (!table.startsWith(kSystemTablePrefix) || table.size() != kSystemTablePrefix.size() + kStampDigits)
-        return {};
-    const QStringView stamp = QStringView(table).sliced(kSystemTablePrefix.size());
-    const bool digits = std::ranges::all_of(stamp, [](QChar each) { return each >= u'0' && each <= u'9'; });
-    return digits ? stamp.toString() : QString();
-}
 
 bool IsCatalogTable(const QString& table)
 {
@@ -48,6 +36,15 @@ bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& sour
     return false;
 }
 
+// "[Ship To]": brackets around one name. "[x" and "[a]b" are names that begin so.
+bool IsBracketed(QStringView name)
+{
+    if (name.size() < 2 || name.front() != u'[' || name.back() != u']')
+        return false;
+    QString inner = name.sliced(1, name.size() - 2).toString();
+    return !inner.remove("]]"_L1).contains(u']');
+}
+
 // The first column of every row, as text.
 bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& database, QStringList& texts)
 {
@@ -64,12 +61,12 @@ bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& da
 bool ReadStamp(DbRecordset& rows, const QString& database, QString& stamp)
 {
     QStringList names;
-    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSYSTABLES WHERE TableName LIKE 'MirelSys%'"_s, database,
+    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSysTables WHERE TableName LIKE 'MirelSys%'"_s, database,
                          names))
         return false;
     names.sort(); // the oldest stamp, should there be several
     for (const QString& name : std::as_const(names)) {
-        stamp = StampOfTable(name);
+        stamp = dialect::StampOfTable(name).toString();
         if (!stamp.isEmpty())
             break;
     }
@@ -90,12 +87,12 @@ bool Catalog::ListTables(const QString& database, QStringList& tables)
     tables.clear();
     DbRecordset rows(connection_);
     QStringList names;
-    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSYSTABLES ORDER BY TableName"_s, database, names)) {
+    if (!ListFirstColumn(rows, u"SELECT TableName FROM MSysTables ORDER BY TableName"_s, database, names)) {
         ReportProviderError(prompt_, &rows, rows.LastResult());
         return false;
     }
     std::ranges::copy_if(names, std::back_inserter(tables), [](const QString& name) {
-        return !IsCatalogTable(name) && StampOfTable(name).isEmpty();
+        return !IsCatalogTable(name) && dialect::StampOfTable(name).isEmpty();
     });
     return true;
 }
@@ -128,7 +125,7 @@ bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOf
     } while (QFileInfo::exists(SideFilePath(folderOfSideFiles, wanted)));
     DbRecordset statement(connection_);
     if (!Run(statement, u"CREATE TABLE MirelSys%1 (SysParam Varchar(255))"_s.arg(wanted), database))
-        return false;
+        return ReadStamp(statement, database, stamp) && !stamp.isEmpty(); // another program was faster
     stamp = wanted;
     return true;
 }
@@ -137,7 +134,7 @@ bool Catalog::ListFields(const QString& table, const QString& database, QStringL
 {
     fields.clear();
     DbRecordset rows(connection_);
-    if (!RunOrReport(prompt_, rows, table.startsWith(u'[') ? table : u'[' + table + u']', database))
+    if (!RunOrReport(prompt_, rows, IsBracketed(table) ? table : BracketedName(table), database))
         return false;
     for (const ResultField& field : rows.Fields())
         fields += field.name;
@@ -187,16 +184,21 @@ QString SideFilePath(const QString& folder, const QString& stamp)
     return u"%1/Mirel_%2.RAF"_s.arg(folder, stamp);
 }
 
+QString BracketedName(QStringView name)
+{
+    return u'[' + name.toString().replace(u']', "]]"_L1) + u']';
+}
+
 QString FieldReference(QStringView name)
 {
-    const bool asItStands = name.isEmpty() || name.startsWith(u'[') || name == u"*";
+    const bool asItStands = name.isEmpty() || IsBracketed(name) || name == u"*";
     const auto isLatinLetter = [](QChar each) { return each.unicode() < 0x80 && each.isLetter(); };
     const bool plain = !name.isEmpty() && isLatinLetter(name.front()) && std::ranges::all_of(name, [](QChar each) {
-        return each.isLetter() || each.isDigit() || each == u'_';
+        return each.unicode() < 0x80 && (each.isLetterOrNumber() || each == u'_');
     });
     if (asItStands || (plain && !dialect::IsReservedWord(name)))
         return name.toString();
-    return u'[' + name.toString() + u']';
+    return BracketedName(name);
 }
 
 QString QuoteText(QStringView text)

@@ -47,8 +47,10 @@ private:
 // The side file of a database: where its forms and saved queries lie, "<folder>/Mirel_<stamp>.RAF".
 QString SideFilePath(const QString& folder, const QString& stamp);
 
-// A name as it stands in a statement: bare when it is empty, begins with "[", is "*", or is a letter A to Z with
-// letters, digits and "_" behind it, and no reserved word of the dialect; in brackets otherwise.
+// A name in brackets, whatever it holds: "]" is written doubled.
+QString BracketedName(QStringView name);
+// A name as it stands in a statement: as it is when it is empty, "*" or in brackets already; bare when it is made
+// of A to Z, digits and "_", begins with a letter and is no reserved word of the dialect; in brackets otherwise.
 QString FieldReference(QStringView name);
 // A text as a literal: in single quotes, inner ones doubled.
 QString QuoteText(QStringView text);

@@ -1,8 +1,12 @@
 #include "data/filter_condition.h"
 
 #include "data/catalog.h"
+#include "platform/ole_date.h"
+
+#include <QLocale>
 
 #include <array>
+#include <optional>
 
 namespace mirel {
 namespace {
@@ -45,6 +49,23 @@ QStringView WithoutPair(QStringView text, QChar quote)
     return paired ? text.sliced(1, text.size() - 2) : text;
 }
 
+// A value of an integer column; others' files hold fractions and texts there, too.
+QString WholeText(const Value& value)
+{
+    if (const std::optional<qint64> whole = value.WholeNumber())
+        return QString::number(*whole);
+    return value.Tag() == ValueTag::Double ? QString::number(value.Number(), 'g', QLocale::FloatingPointShortest)
+                                           : QString::number(value.ToInt());
+}
+
+// A date shows no fractions of a second: one that has some is written as it is stored.
+QString DateLiteral(const Value& value, const QString& displayText)
+{
+    const std::optional<StoredDate> stored = StoredDateOf(value.Number());
+    const bool hasFraction = stored && stored->Text().find('.') != std::string_view::npos;
+    return hasFraction ? QString::fromLatin1(stored->characters.data(), stored->length) : displayText;
+}
+
 // A typed value as it goes between single quotes.
 QString PreparedText(const QString& typed)
 {
@@ -77,13 +98,14 @@ QString ConditionFromCell(CellFilter filter, const QString& reference, FieldType
         if (value.IsNull())
             return u"%1 IS NULL"_s.arg(reference);
         if (IsInteger(type))
-            return u"%1 = %2"_s.arg(reference, QString::number(value.ToInt()));
+            return u"%1 = %2"_s.arg(reference, WholeText(value));
         if (type == FieldType::Double) {
-            const QString bound = QString::number(value.Number(), 'f', 6);
+            const std::optional<qint64> whole = value.WholeNumber();
+            const QString bound = whole ? QString::number(*whole) : QString::number(value.Number(), 'f', 6);
             return u"%1 >= %2 AND %1 <= %2"_s.arg(reference, bound);
         }
-        if (type == FieldType::Date)
-            return u"%1 = '%2'"_s.arg(reference, displayText);
+        if (type == FieldType::Date && value.Tag() == ValueTag::Date)
+            return u"%1 = '%2'"_s.arg(reference, DateLiteral(value, displayText));
         if (type == FieldType::YesNo)
             return u"%1 IS %2"_s.arg(reference, displayText == words.yes ? u"TRUE"_s : u"FALSE"_s);
         return u"%1 = %2"_s.arg(reference, QuoteText(displayText));

@@ -28,10 +28,11 @@ constexpr std::array kErrors = {
     ErrorRow{0x80040E42, Str::ErrorTooManyColumns}, ErrorRow{0x800A0F0A, Str::ErrorTooManyColumns},
 };
 
-bool NamesAJoin(QString statement)
+// A faulty statement opens nothing, so its lock says nothing about it.
+bool IsReadOnlyJoin(const DbRecordset& recordset)
 {
-    statement.replace(u'\r', u' ').replace(u'\n', u' '); // people write statements in lines
-    return KeywordPosition(statement, u"JOIN") >= 0;
+    return recordset.IsOpen() && recordset.Lock() == LockType::ReadOnly &&
+           KeywordPosition(recordset.Source(), u"JOIN") >= 0;
 }
 
 Str MessageOf(const DbRecordset* recordset, Hr hr)
@@ -39,16 +40,7 @@ Str MessageOf(const DbRecordset* recordset, Hr hr)
     const auto row = std::ranges::find(kErrors, quint32(hr), &ErrorRow::code);
     if (row != kErrors.end())
         return row->message;
-    const bool readOnlyJoin =
-        recordset && recordset->Lock() == LockType::ReadOnly && NamesAJoin(recordset->Source());
-    return readOnlyJoin ? Str::ErrorReadOnlyJoin : Str::ErrorInCommand;
-}
-
-// Which messages leave open what went wrong: those say it in their context.
-bool ShowsContext(Str message)
-{
-    return message == Str::ErrorAccessDenied || message == Str::ErrorReadOnlyJoin ||
-           message == Str::ErrorInCommand;
+    return recordset && IsReadOnlyJoin(*recordset) ? Str::ErrorReadOnlyJoin : Str::ErrorInCommand;
 }
 
 } // namespace
@@ -56,7 +48,8 @@ bool ShowsContext(Str message)
 QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& context)
 {
     const QString code = QString::number(quint32(hr), 16).toUpper();
-    return StringText(Str::ErrorPrefix) + u'(' + code + u')' + context + u"\r\n"_s +
+    const QString place = context.isEmpty() ? QString() : u' ' + context;
+    return StringText(Str::ErrorPrefix) + u'(' + code + u')' + place + u"\r\n"_s +
            StringText(MessageOf(recordset, hr));
 }
 
@@ -64,9 +57,7 @@ void ReportProviderError(UserPrompt& prompt, const DbRecordset* recordset, Hr hr
 {
     if (!Failed(hr) || hr == kStopped)
         return;
-    const bool withContext = recordset && ShowsContext(MessageOf(recordset, hr));
-    const QString context = withContext ? recordset->ErrorContext() : QString();
-    prompt.ShowError(ProviderErrorText(recordset, hr, context.isEmpty() ? context : u' ' + context));
+    prompt.ShowError(ProviderErrorText(recordset, hr, recordset ? recordset->ErrorContext() : QString()));
 }
 
 } // namespace mirel

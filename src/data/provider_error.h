@@ -5,8 +5,9 @@
 
 namespace mirel {
 
-// The words of a failed provider call: "Error: (80040E37)", the context, a line end, the message for that
-// result. `recordset` (may be null) tells a read-only join from a faulty command.
+// The words of a failed provider call: "Error: (80040E07) the field "Qty"", a line end, the message for that
+// result. `context`, what only the caller or the provider knows, follows the code after a blank. `recordset` (may
+// be null) tells a read-only join from a faulty command.
 QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& context);
 
 // The single place where a failure of the provider becomes a message to the user. Nothing happens when `hr` is

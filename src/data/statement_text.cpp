@@ -1,6 +1,10 @@
 #include "data/statement_text.h"
 
 #include "data/catalog.h"
+#include "provider/dialect/functions.h"
+#include "provider/dialect/schema.h"
+
+#include <algorithm>
 
 namespace mirel {
 namespace {
@@ -9,7 +13,7 @@ using namespace Qt::StringLiterals;
 
 bool IsBlank(QChar c)
 {
-    return c == u' ' || c == u'\t';
+    return c == u' ' || c == u'\t' || c == u'\n' || c == u'\r';
 }
 
 // The character that ends a run beginning with `opening`; null when nothing begins there.
@@ -20,11 +24,54 @@ QChar ClosingOf(QChar opening)
     return opening == u'[' ? QChar(u']') : QChar();
 }
 
-// Where the part begins that must stay behind a WHERE clause; -1: there is none.
-qsizetype TailPosition(QStringView statement)
+// Where the quoted text or bracketed name ends that begins at `at`: its last character. The size of the statement
+// when it is never closed.
+qsizetype EndOfRun(QStringView statement, qsizetype at, QChar closing)
 {
-    const qsizetype group = KeywordPosition(statement, u"GROUP");
-    return group >= 0 ? group : KeywordPosition(statement, u"ORDER");
+    const QChar doubled[] = {closing, closing};
+    for (qsizetype end = at + 1;; end += 2) {
+        end = statement.indexOf(closing, end);
+        if (end < 0)
+            return statement.size();
+        if (!statement.sliced(end).startsWith(QStringView(doubled)))
+            return end;
+    }
+}
+
+qsizetype FirstKeyword(QStringView statement, std::initializer_list<QStringView> keywords)
+{
+    for (const QStringView keyword : keywords) {
+        if (const qsizetype at = KeywordPosition(statement, keyword); at >= 0)
+            return at;
+    }
+    return -1;
+}
+
+bool IsAggregate(QStringView word)
+{
+    const dialect::FunctionDef* function = dialect::FindFunction(word);
+    return function && function->isAggregate;
+}
+
+// Whether the condition holds a call of COUNT, SUM and the like.
+bool HasAggregate(QStringView condition)
+{
+    for (qsizetype at = 0; at < condition.size(); ++at) {
+        if (const QChar closing = ClosingOf(condition[at]); !closing.isNull()) {
+            at = EndOfRun(condition, at, closing);
+            continue;
+        }
+        if (!condition[at].isLetter())
+            continue;
+        const qsizetype begin = at;
+        while (at < condition.size() && (condition[at].isLetterOrNumber() || condition[at] == u'_'))
+            ++at;
+        const QStringView word = condition.sliced(begin, at - begin);
+        if (condition.sliced(at).trimmed().startsWith(u'(') && IsAggregate(word))
+            return true;
+        --at; // the character behind the word may open a text
+    }
+    return false;
 }
 
 struct ListPlace {
@@ -54,9 +101,7 @@ qsizetype KeywordPosition(QStringView statement, QStringView keyword)
 {
     for (qsizetype at = 0; at < statement.size(); ++at) {
         if (const QChar closing = ClosingOf(statement[at]); !closing.isNull()) {
-            at = statement.indexOf(closing, at + 1);
-            if (at < 0)
-                return -1;
+            at = EndOfRun(statement, at, closing);
             continue;
         }
         if (at > 0 && !IsBlank(statement[at - 1]))
@@ -72,15 +117,18 @@ qsizetype KeywordPosition(QStringView statement, QStringView keyword)
 
 QString WithCondition(const QString& statement, const QString& condition)
 {
-    constexpr qsizetype kWhereSize = 5;
-    const qsizetype where = KeywordPosition(statement, u"WHERE");
-    const qsizetype tail = TailPosition(statement);
-    if (where < 0) {
+    const bool isOfGroups = HasAggregate(condition);
+    const QStringView keyword = isOfGroups ? u"HAVING" : u"WHERE";
+    const qsizetype clause = KeywordPosition(statement, keyword);
+    const qsizetype tail = isOfGroups ? KeywordPosition(statement, u"ORDER")
+                                      : FirstKeyword(statement, {u"GROUP", u"HAVING", u"ORDER"});
+    if (clause < 0) {
         if (tail < 0)
-            return u"%1 WHERE %2"_s.arg(statement, condition);
-        return u"%1 WHERE %2 %3"_s.arg(statement.first(tail), condition, statement.sliced(tail));
+            return u"%1 %2 %3"_s.arg(statement, keyword, condition);
+        return u"%1 %2 %3 %4"_s.arg(QStringView(statement).first(tail), keyword, condition,
+                                    QStringView(statement).sliced(tail));
     }
-    const qsizetype conditions = where + kWhereSize;
+    const qsizetype conditions = clause + keyword.size();
     if (tail < 0)
         return u"%1 (%2) AND (%3)"_s.arg(statement.first(conditions), statement.sliced(conditions), condition);
     if (tail < conditions) // clauses out of their order
@@ -88,6 +136,22 @@ QString WithCondition(const QString& statement, const QString& condition)
     return u"%1 (%2) AND (%3) %4"_s.arg(statement.first(conditions),
                                         statement.sliced(conditions, tail - conditions), condition,
                                         statement.sliced(tail));
+}
+
+QString FieldReferenceIn(std::span<const ResultField> result, int field)
+{
+    const ResultField& shown = result[size_t(field)];
+    if (shown.column.isEmpty())
+        return shown.expression.isEmpty() ? FieldReference(shown.name) : shown.expression;
+    const auto name = [](const QString& exact) {
+        return exact.startsWith(u'[') ? BracketedName(exact) : FieldReference(exact);
+    };
+    // A bare name in ORDER BY is first of all what the result calls its columns.
+    const bool isTaken = std::ranges::any_of(result, [&](const ResultField& other) {
+        return dialect::SameName(other.name, shown.column) &&
+               (other.column != shown.column || other.source != shown.source);
+    });
+    return shown.isJoined || isTaken ? name(shown.source) + u'.' + name(shown.column) : name(shown.column);
 }
 
 QString WithOrder(const QString& statement, const QString& terms)
@@ -112,9 +176,7 @@ QStringList SelectList(QStringView statement)
     int depth = 0;
     for (qsizetype at = 0; at < list.size(); ++at) {
         if (const QChar closing = ClosingOf(list[at]); !closing.isNull()) {
-            at = list.indexOf(closing, at + 1);
-            if (at < 0)
-                break;
+            at = EndOfRun(list, at, closing);
         } else if (list[at] == u',' && depth == 0) {
             columns += list.sliced(begin, at - begin).trimmed().toString();
             begin = at + 1;
@@ -140,10 +202,16 @@ bool IsBalanced(QStringView statement)
     int parentheses = 0;
     int brackets = 0;
     QChar quote;
-    for (const QChar c : statement) {
+    for (qsizetype at = 0; at < statement.size(); ++at) {
+        const QChar c = statement[at];
         if (!quote.isNull()) {
             if (c == quote)
                 quote = QChar();
+            continue;
+        }
+        const bool isDoubled = brackets > 0 && statement.sliced(at).startsWith(u"]]");
+        if (isDoubled && brackets == 1) { // part of a name
+            ++at;
             continue;
         }
         if ((c == u')' && parentheses < 1) || (c == u']' && brackets < 1))

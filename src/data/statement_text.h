@@ -1,7 +1,11 @@
 #pragma once
 
+#include "provider/provider.h"
+
 #include <QString>
 #include <QStringList>
+
+#include <span>
 
 namespace mirel {
 
@@ -9,13 +13,19 @@ namespace mirel {
 // they make of a statement that has clauses in another order, or none that they know, is for the provider to
 // judge.
 
-// Where `keyword` first stands as a whole word, case ignored: at the start or after a blank or tab, and followed
-// by the end, "(", a blank or a tab. Quoted text and names in brackets are skipped. -1: nowhere.
+// Where `keyword` first stands as a whole word, case ignored: at the start or after a blank, and followed by the
+// end, "(" or a blank; tabs and line ends are blanks. Quoted text and names in brackets are skipped. -1: nowhere.
 qsizetype KeywordPosition(QStringView statement, QStringView keyword);
 
 // The statement with one more condition: ANDed with the WHERE clause that is there, in front of GROUP BY and
-// ORDER BY. The text around the pieces stays as it is, blanks included.
+// ORDER BY; one that speaks of COUNT, SUM and the like goes to HAVING instead. The text around the pieces stays as
+// it is, blanks included.
 QString WithCondition(const QString& statement, const QString& condition);
+
+// How a column of a result is referred to in a condition or an order of the statement that made it: by its name,
+// with the source's alias where there are several or the name alone would mean another column; a computed one by
+// its expression.
+QString FieldReferenceIn(std::span<const ResultField> result, int field);
 
 // The statement ordered by `terms` ("[Name] ASC"), whatever its order was before.
 QString WithOrder(const QString& statement, const QString& terms);

@@ -55,6 +55,15 @@ inline void SetNumber(ExprNode& node, double number)
     node.valueNumber = number + 0.0; // -0 becomes 0
 }
 
+// From here on a double has no number of its own for each whole one: a field's stands in its node's buffer, to the
+// last digit.
+inline constexpr double kBeyondDoubles = 9007199254740992.0;
+
+inline bool HasDigitsInBuffer(const ExprNode& node)
+{
+    return node.code == OpCode::Field && std::abs(node.valueNumber) >= kBeyondDoubles && !node.buffer.View().isEmpty();
+}
+
 // `text` must outlive the evaluation.
 inline void SetText(ExprNode& node, QStringView text)
 {

@@ -50,6 +50,8 @@ void ReadField(ExprNode& node, const Value& value, EvalContext& context)
     case FieldType::Integer:
     case FieldType::Double:
         SetNumber(node, value.Number());
+        if (std::abs(node.valueNumber) >= kBeyondDoubles)
+            node.buffer.Assign(value.WholeNumber() ? VariantText(value) : QString());
         return;
     case FieldType::Date:
         SetDate(node, value.Number());
@@ -153,7 +155,9 @@ QString ShownText(ExprNode& node)
 {
     if (node.null || node.suppressed)
         return {};
-    return node.isText ? TextOf(node).toString() : ExprNumberText(node.valueNumber);
+    if (node.isText)
+        return TextOf(node).toString();
+    return HasDigitsInBuffer(node) ? node.buffer.View().toString() : ExprNumberText(node.valueNumber);
 }
 
 void SetDate(ExprNode& node, std::optional<double> oleDays)

@@ -210,7 +210,10 @@ void FnToChar(ExprNode& node, Evaluation&)
         return;
     }
     node.buffer.Resize(0);
-    node.buffer.Append(ExprNumberChars(argument.valueNumber).Text());
+    if (HasDigitsInBuffer(argument))
+        node.buffer.Append(argument.buffer.View());
+    else
+        node.buffer.Append(ExprNumberChars(argument.valueNumber).Text());
     KeepBuffer(node);
 }
 

@@ -74,6 +74,8 @@ void AppendValue(TextBuffer& buffer, ExprNode& node)
 {
     if (node.isText)
         buffer.Append(TextOf(node));
+    else if (HasDigitsInBuffer(node))
+        buffer.Append(node.buffer.View());
     else
         buffer.Append(ExprNumberChars(node.valueNumber).Text());
 }

@@ -34,6 +34,7 @@ constexpr bool IsBinary(FieldType type)
     return type == FieldType::VarBinary || type == FieldType::LongBinary;
 }
 
-constexpr int kMaxTextSize = 255; // characters of a Text field, bytes of a VarBinary field
+constexpr int kWideIntegerSize = 8; // bytes of an Integer field that takes 64 bits: only other programs make it
+constexpr int kMaxTextSize = 255;   // characters of a Text field, bytes of a VarBinary field
 
 } // namespace mirel

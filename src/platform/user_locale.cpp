@@ -155,8 +155,9 @@ QString VariantText(const Value& value)
         return {};
     case ValueTag::SmallInt:
     case ValueTag::Integer:
-        return QString::number(value.ToInt());
     case ValueTag::Double:
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            return QString::number(*whole);
         return NumberText(value.Number());
     case ValueTag::Date:
         return UserLocale::Current().DateTimeText(value.Number());

@@ -30,6 +30,8 @@ public:
     [[nodiscard]] virtual bool Advance(qint64 done) = 0;
 };
 
+inline constexpr qint64 kUnknownTotal = -1;
+
 // How core asks and tells: the window shows message boxes, the command line answers from its options, a test
 // answers from a script. Core never waits for the user in any other way.
 class UserPrompt {
@@ -50,6 +52,7 @@ public:
     // Empty optional: the user cancelled.
     virtual std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,
                                            const QString& preset) = 0;
+    // With kUnknownTotal the display counts what is done.
     virtual std::unique_ptr<Progress> StartProgress(const UserMessage& what, qint64 total) = 0;
 };
 

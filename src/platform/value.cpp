@@ -7,9 +7,9 @@ namespace mirel {
 ValueTag Value::Tag() const
 {
     // In the order of Content's alternatives.
-    static constexpr std::array kTags = {ValueTag::Empty,   ValueTag::Null,   ValueTag::SmallInt,
-                                         ValueTag::Integer, ValueTag::Double, ValueTag::Date,
-                                         ValueTag::Text,    ValueTag::Bool,   ValueTag::Binary};
+    static constexpr std::array kTags = {ValueTag::Empty,  ValueTag::Null,  ValueTag::SmallInt, ValueTag::Integer,
+                                         ValueTag::Double, ValueTag::Date,  ValueTag::Text,     ValueTag::Bool,
+                                         ValueTag::Binary, ValueTag::Double};
     static_assert(kTags.size() == std::variant_size_v<Content>);
     return kTags[content_.index()];
 }
@@ -20,7 +20,17 @@ double Value::Number() const
         return *number;
     if (const auto* date = std::get_if<DateContent>(&content_))
         return date->oleDays;
+    if (const auto* number = std::get_if<qint64>(&content_))
+        return double(*number);
     return ToInt();
+}
+
+std::optional<qint64> Value::WholeNumber() const
+{
+    if (const auto* number = std::get_if<qint64>(&content_))
+        return *number;
+    const bool isWhole = std::holds_alternative<qint32>(content_) || std::holds_alternative<qint16>(content_);
+    return isWhole ? std::optional<qint64>(ToInt()) : std::nullopt;
 }
 
 qint32 Value::ToInt() const

@@ -3,6 +3,7 @@
 #include <QByteArray>
 #include <QString>
 
+#include <optional>
 #include <variant>
 
 namespace mirel {
@@ -31,6 +32,11 @@ public:
     static Value SmallInt(qint16 number) { return Value(number); }
     static Value Integer(qint32 number) { return Value(number); }
     static Value Double(double number) { return Value(number); }
+    // An Integer; beyond 32 bits, which only other programs' files hold, a Double that keeps every digit.
+    static Value Whole(qint64 number)
+    {
+        return number == qint32(number) ? Integer(qint32(number)) : Value(Content(number));
+    }
     static Value Date(double oleDays) { return Value(DateContent{oleDays}); }
     static Value Text(QString text) { return Value(std::move(text)); }
     static Value Bool(bool truth) { return Value(truth); }
@@ -46,6 +52,8 @@ public:
     // integer tags, Double, Date (the day number) and Bool (1 or 0).
     double Number() const;
     qint32 ToInt() const; // SmallInt, Integer and Bool
+    // To the last digit: what was made by SmallInt, Integer or Whole. Empty for every other number.
+    std::optional<qint64> WholeNumber() const;
     bool ToBool() const;
     QString ToText() const;
     // The text without taking a share in it; good as long as the value stays what it is.
@@ -66,8 +74,8 @@ private:
         double oleDays;
         friend bool operator==(const DateContent&, const DateContent&) = default;
     };
-    using Content =
-        std::variant<std::monostate, NullContent, qint16, qint32, double, DateContent, QString, bool, QByteArray>;
+    using Content = std::variant<std::monostate, NullContent, qint16, qint32, double, DateContent, QString, bool,
+                                 QByteArray, qint64>;
 
     explicit Value(Content content)
         : content_(std::move(content))

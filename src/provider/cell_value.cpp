@@ -14,9 +14,10 @@ Value ValueOfInteger(qint64 number, FieldType type)
         return Value::Bool(number != 0);
     if (type == FieldType::SmallInt && number == qint16(number))
         return Value::SmallInt(qint16(number));
-    if (type != FieldType::Double && number == qint32(number))
-        return Value::Integer(qint32(number));
-    return Value::Double(double(number));
+    constexpr qint64 kExact = qint64(1) << 53; // up to here a double has a number of its own for each
+    if (type == FieldType::Double && number >= -kExact && number <= kExact)
+        return Value::Double(double(number));
+    return Value::Whole(number);
 }
 
 } // namespace

@@ -30,9 +30,13 @@ enum class LockType : int { ReadOnly = 1, Optimistic = 3 };
 struct ResultField {
     QString name; // as the result shows it
     FieldType type = FieldType::None;
-    int size = 0;   // characters of a Text, bytes of every other type; -1 where there is no limit
-    QString table;  // the table that the column comes from; empty for an expression
-    QString column; // its name in that table; empty for an expression
+    int size = 0;     // characters of a Text, bytes of every other type; -1 where there is no limit. An Integer of
+                      // another program's file has kWideIntegerSize and takes 64 bits
+    QString table;    // the table that the column comes from; empty for an expression
+    QString column;   // its name in that table; empty for an expression
+    QString source{}; // the table's alias in the statement, or its name; empty for an expression
+    bool isJoined = false; // the statement reads from several tables
+    QString expression{};  // as the statement writes it, ready to be compared; empty for a column
 };
 
 // A value for a column of an open result, by its index there.
@@ -92,7 +96,8 @@ public:
     // Finishes counting. -1 for a forward-only cursor.
     virtual qint64 RecordCount() = 0;
     // Counts on for about `budgetMs`; true once the count is known. Calls that need positions count by
-    // themselves: this is for a window that shows its first page before it knows how many there are.
+    // themselves: this is for a window that shows its first page before it knows how many there are. A budget
+    // below 0 counts nothing and only asks.
     virtual bool CountStep(int budgetMs) = 0;
     // Grows whenever the records may be others, or stand elsewhere, than before: own changes, and changes of
     // other programs once the cursor has taken them up.

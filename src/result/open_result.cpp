@@ -146,13 +146,7 @@ bool OpenResult::IsWritable(int field) const
 
 QString OpenResult::ReferenceOf(int field) const
 {
-    const ResultField& shown = Fields()[size_t(field)];
-    const QString name = FieldReference(shown.column.isEmpty() ? shown.name : shown.column);
-    const bool isJoin =
-        KeywordPosition(statement_, u"JOIN") >= 0 || std::ranges::any_of(Fields(), [&](const ResultField& other) {
-            return !other.table.isEmpty() && other.table != shown.table;
-        });
-    return isJoin && !shown.table.isEmpty() ? u"%1.%2"_s.arg(FieldReference(shown.table), name) : name;
+    return FieldReferenceIn(Fields(), field);
 }
 
 QString OpenResult::TableOf(int field) const

@@ -16,8 +16,27 @@ bool IsTaken(const Cell& cell)
     return cell.kind == Cell::Kind::Integer || cell.kind == Cell::Kind::Real;
 }
 
-void Take(AggregateResult& taken, double number, Aggregate kind)
+void TakeWhole(AggregateResult& taken, const Cell& cell, Aggregate kind)
 {
+    if (cell.kind != Cell::Kind::Integer || !taken.whole) {
+        taken.whole.reset();
+        return;
+    }
+    qint64& whole = *taken.whole;
+    if (kind == Aggregate::Sum || kind == Aggregate::Avg) {
+        if (__builtin_add_overflow(whole, cell.integer, &whole))
+            taken.whole.reset();
+    } else if (taken.values == 0) {
+        whole = cell.integer;
+    } else {
+        whole = kind == Aggregate::Max ? std::max(whole, cell.integer) : std::min(whole, cell.integer);
+    }
+}
+
+void Take(AggregateResult& taken, const Cell& cell, Aggregate kind)
+{
+    TakeWhole(taken, cell, kind);
+    const double number = NumberOf(cell);
     if (kind == Aggregate::Sum || kind == Aggregate::Avg)
         taken.value += number;
     else if (taken.values == 0)
@@ -33,6 +52,8 @@ QString AggregateResult::Text(Aggregate kind) const
 {
     if (values == 0 && (kind == Aggregate::Max || kind == Aggregate::Min))
         return {};
+    if (whole && kind != Aggregate::Avg)
+        return QString::number(*whole);
     if (value == std::trunc(value)) // the negative zero is a zero to people
         return QString::number(value == 0 ? 0.0 : value, 'f', 0);
     QString text = QString::number(value, 'f', 6);
@@ -52,7 +73,7 @@ std::optional<AggregateResult> RunAggregate(DbRecordset& result, int field, Aggr
     bool stopped = false;
     const auto take = [&](std::span<const Cell> cells) {
         if (IsTaken(cells.front()))
-            Take(taken, NumberOf(cells.front()), kind);
+            Take(taken, cells.front(), kind);
         stopped = ++records % kRecordsPerStep == 0 && progress && !progress(records);
         return !stopped;
     };

@@ -19,7 +19,8 @@ constexpr bool CanAggregate(FieldType type)
 
 struct AggregateResult {
     double value = 0;
-    qint64 values = 0; // how many were taken; NULL is left out
+    qint64 values = 0;               // how many were taken; NULL is left out
+    std::optional<qint64> whole = 0; // the value to the last digit, while all that was taken is whole and fits
 
     // As people read it: whole numbers without a point, others with up to six decimals and no trailing zeros. A
     // sum or average of no value is 0, a greatest or smallest one the empty text.

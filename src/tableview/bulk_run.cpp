@@ -55,7 +55,11 @@ std::optional<AggregateResult> BulkRun::Sum(int field, Aggregate kind)
         return {};
     }
     std::optional<AggregateResult> result;
-    const bool ended = Run(Str::SummingRecords, records_.RecordCount(), [&](const BulkProgress& progress) {
+    // Summing needs no count, and counting would take half as long again: a display does without until one is
+    // known.
+    constexpr int kAsk = -1;
+    const qint64 total = records_.CountStep(kAsk) ? records_.RecordCount() : kUnknownTotal;
+    const bool ended = Run(Str::SummingRecords, total, [&](const BulkProgress& progress) {
         result = RunAggregate(records_, field, kind, progress);
         return !Failed(records_.LastResult());
     });

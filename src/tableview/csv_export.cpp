@@ -9,12 +9,41 @@
 #include <QFileInfo>
 #include <QSaveFile>
 
+#include <fcntl.h>
+
+#include <algorithm>
+
 namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
 
 constexpr qint64 kRecordsPerStep = 1024; // between two looks at the progress display
+
+// Has the disk write while the export goes on: otherwise all of the file is written when it is committed, and the
+// export waits for that.
+class EagerFile : public QSaveFile {
+public:
+    using QSaveFile::QSaveFile;
+
+protected:
+    qint64 writeData(const char* bytes, qint64 size) override
+    {
+        constexpr qint64 kPieceBytes = 8 << 20;
+        const qint64 written = QSaveFile::writeData(bytes, size);
+        waiting_ += std::max<qint64>(written, 0);
+        if (waiting_ >= kPieceBytes) {
+            (void)sync_file_range(handle(), begun_, waiting_, SYNC_FILE_RANGE_WRITE);
+            begun_ += waiting_;
+            waiting_ = 0;
+        }
+        return written;
+    }
+
+private:
+    qint64 begun_ = 0;   // bytes that the disk was told to write
+    qint64 waiting_ = 0; // behind them
+};
 
 } // namespace
 
@@ -51,15 +80,16 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
 {
     using Ending = CsvExportResult::Ending;
     const QString path = QDir::toNativeSeparators(target.path);
-    QSaveFile file(target.path);
+    EagerFile file(target.path);
     if (IsSameFile(target.path, target.database) || !file.open(QIODevice::WriteOnly)) {
         prompt.Show({Str::FileCreationFail, {path}});
         return {};
     }
     CsvExportResult result;
     {
-        const std::unique_ptr<Progress> progress =
-            prompt.StartProgress({Str::ExportingRecords, {}}, source.RecordCount());
+        constexpr int kAsk = -1;
+        const qint64 total = source.CountStep(kAsk) ? source.RecordCount() : kUnknownTotal;
+        const std::unique_ptr<Progress> progress = prompt.StartProgress({Str::ExportingRecords, {}}, total);
         result = ExportCsv(source, options, file, progress.get());
     } // the display goes before a message comes
     if (result.ending == Ending::ReadFailed) {

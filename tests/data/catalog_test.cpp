@@ -40,12 +40,31 @@ TEST_F(CatalogTest, FindsTheOldestStampAndNoTableLikeIt)
     Run(u"CREATE TABLE MirelSysNotes (F Integer)"_s);
     Run(u"CREATE TABLE mirelsys19990101000000 (F Integer)"_s);
     EXPECT_EQ(Stamp(), QString());
-    Run(u"CREATE TABLE MirelSys20011024153012 (SysParam Varchar(255))"_s);
     Run(u"CREATE TABLE MirelSys20000101000000 (SysParam Varchar(255))"_s);
     EXPECT_EQ(Stamp(), u"20000101000000"_s);
     EXPECT_TRUE(catalog_.BearsStamp(path_, u"20000101000000"_s));
     EXPECT_FALSE(catalog_.BearsStamp(folder_.filePath(u"nothing.cdb"_s), u"20000101000000"_s));
     EXPECT_EQ(prompt_.shown, QStringList());
+}
+
+TEST_F(CatalogTest, LetsNoStatementTouchTheStampTable)
+{
+    Run(u"CREATE TABLE MirelSys20000101000000 (SysParam Varchar(255))"_s);
+    Run(u"CREATE TABLE Mine (F Integer)"_s);
+    for (const QString& statement :
+         {u"DROP TABLE mirelsys20000101000000"_s, u"ALTER TABLE MirelSys20000101000000 TO Other"_s,
+          u"ALTER TABLE Mine TO MirelSys20010101000000"_s, u"ALTER TABLE MirelSys20000101000000 ADD G Bit"_s,
+          u"CREATE INDEX i ON MirelSys20000101000000 (SysParam)"_s,
+          u"CREATE TABLE MirelSys19990101000000 (SysParam Varchar(255))"_s,
+          u"INSERT INTO MirelSys20000101000000 VALUES ('x')"_s, u"DELETE FROM MirelSys20000101000000"_s}) {
+        EXPECT_FALSE(catalog_.ExecuteStatement(path_, statement));
+        EXPECT_TRUE(prompt_.shown.last().startsWith(u"Error: (80070005) "_s))
+            << prompt_.shown.last().toStdString();
+    }
+    DbRecordset rows(connection_);
+    ASSERT_TRUE(rows.Open(u"MirelSys20000101000000"_s, path_, CursorType::Static, LockType::Optimistic));
+    EXPECT_FALSE(rows.AddNew({}));
+    EXPECT_EQ(Stamp(), u"20000101000000"_s);
 }
 
 TEST_F(CatalogTest, StampsWithAMomentThatNoSideFileBears)

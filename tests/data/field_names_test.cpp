@@ -47,7 +47,7 @@ TEST(FieldReference, BracketsWhatCouldNotStandBare)
         QString reference;
     } rows[] = {
         {"plain", u"Ship_Name2"_s, u"Ship_Name2"_s},
-        {"letters of any language", u"Größe"_s, u"Größe"_s},
+        {"letters of any language", u"Größe"_s, u"[Größe]"_s},
         {"first letter beyond A to Z", u"Ärger"_s, u"[Ärger]"_s},
         {"blank", u"Ship Name"_s, u"[Ship Name]"_s},
         {"digit in front", u"2nd"_s, u"[2nd]"_s},

@@ -23,6 +23,10 @@ TEST(ConditionFromCell, FollowsTheTypeOfTheField)
         {FieldType::SmallInt, Value::SmallInt(-7), u"-7"_s, u"F = -7"_s},
         {FieldType::Double, Value::Double(2.5), u"2.5"_s, u"F >= 2.500000 AND F <= 2.500000"_s},
         {FieldType::Date, Value::Date(37076), u"7/4/2001"_s, u"F = '7/4/2001'"_s},
+        {FieldType::Date, Value::Date(37076.5 + 0.25 / 86400), u"7/4/2001 12:00:00 PM"_s,
+         u"F = '2001-07-04 12:00:00.250'"_s},
+        {FieldType::Date, Value::Text(u"next '99"_s), u"next '99"_s, u"F = 'next ''99'"_s},
+        {FieldType::Integer, Value::Double(2.5), u"2.5"_s, u"F = 2.5"_s},
         {FieldType::YesNo, Value::Bool(true), u"Oui"_s, u"F IS TRUE"_s},
         {FieldType::YesNo, Value::Bool(true), u"oui"_s, u"F IS FALSE"_s}, // the words are compared exactly
     };

@@ -1,5 +1,9 @@
 // Files that other programs made: opened as they are, read as well as they can be, never rewritten unasked.
+#include "data/catalog.h"
 #include "data/db_recordset.h"
+#include "data/filter_condition.h"
+#include "data/statement_text.h"
+#include "platform/user_locale.h"
 #include "support/printing.h"
 #include "support/sqlite_file.h"
 
@@ -151,6 +155,78 @@ TEST_F(ForeignFile, ReadsTypesByTheirNearestCode)
     EXPECT_EQ(rows.FieldSize(3), 30);
     EXPECT_EQ(rows.ValueText(0), u"9000000000"_s); // shown whole though an Integer field has 32 bits
     EXPECT_EQ(rows.ValueText(8), u"free"_s);
+}
+
+TEST_F(ForeignFile, KeepsWholeNumbersToTheLastDigit)
+{
+    Make("CREATE TABLE t (Id BIGINT, n NUMERIC); INSERT INTO t VALUES (9007199254740993, 9007199254740995),"
+         "(9007199254740992, 9007199254740994), (0, 0);");
+    DbRecordset rows(connection_);
+    ASSERT_TRUE(Open(rows, u"t"_s));
+    for (int field : {0, 1}) {
+        const Value value = rows.FieldValue(field);
+        EXPECT_EQ(value.Tag(), ValueTag::Double);
+        const QString condition = ConditionFromCell(CellFilter::BySelection, rows.FieldName(field),
+                                                    rows.TypeOfField(field), value, VariantText(value), {});
+        EXPECT_EQ(Column(u"SELECT Id FROM t WHERE "_s + condition), QStringList(u"9007199254740993"_s))
+            << condition.toStdString();
+    }
+    EXPECT_EQ(rows.ValueText(1), u"9007199254740995"_s);
+    EXPECT_EQ(Column(u"SELECT SUM(Id) FROM t"_s), QStringList(u"18014398509481985"_s));
+    EXPECT_EQ(Column(u"SELECT n & '' FROM t WHERE Id = '9007199254740993'"_s), QStringList(u"9007199254740995"_s));
+
+    ASSERT_TRUE(rows.Update(0, Value::Text(u"9223372036854775807"_s)));
+    ASSERT_TRUE(rows.Update(1, rows.FieldValue(0)));
+    EXPECT_EQ(ResultOf(u"UPDATE t SET Id = '9007199254740997' WHERE Id = 9007199254740992"_s), Hr::Ok);
+    EXPECT_EQ(ResultOf(u"UPDATE t SET Id = 9223372036854775808 WHERE Id = 0"_s), Hr::Overflow);
+    EXPECT_EQ(SqliteFile(path_).Column("SELECT Id || ' ' || n FROM t"),
+              QStringList({u"9223372036854775807 9223372036854775807"_s, u"9007199254740997 9007199254740994"_s,
+                           u"0 0"_s}));
+}
+
+TEST_F(ForeignFile, ShowsAReplacementForBytesThatAreNoText)
+{
+    Make("CREATE TABLE t (v TEXT); INSERT INTO t VALUES (CAST(x'41FF42' AS TEXT)), (CAST(x'C3A4' AS TEXT));");
+    EXPECT_EQ(Column(u"t"_s), QStringList({u"A\uFFFDB"_s, u"ä"_s}));
+    DbRecordset rows(connection_);
+    ASSERT_TRUE(Open(rows, u"t"_s));
+    QByteArray raw;
+    EXPECT_TRUE(rows.Read({.fields = {}}, [&](std::span<const Cell> cells) {
+        raw += QByteArrayView(cells[0].bytes.data(), qsizetype(cells[0].bytes.size()));
+        return true;
+    }));
+    EXPECT_EQ(QString::fromUtf8(raw), u"A\uFFFDBä"_s);
+    EXPECT_TRUE(raw.isValidUtf8()) << "cells pass on as they are to files";
+
+    Hr result = Hr::Ok;
+    QString context;
+    const auto appender = connection_.Provider()->CreateAppender(path_, u"t"_s, {}, result, context);
+    ASSERT_TRUE(appender) << context.toStdString();
+    const Cell broken = Cell::OfText("A\xFF");
+    EXPECT_EQ(appender->Append({&broken, 1}), Hr::BadLiteral);
+}
+
+TEST_F(ForeignFile, MayHaveNamesThatCannotBeMadeHere)
+{
+    Make("CREATE TABLE \"a]b\" (\"[x\" INTEGER, \"y]\" TEXT); INSERT INTO \"a]b\" VALUES (1, 'one'), (2, 'two');"
+         "CREATE TABLE msystables (own TEXT); INSERT INTO msystables VALUES ('mine');");
+    const QString table = FieldReference(u"a]b"_s);
+    EXPECT_EQ(table, u"[a]]b]"_s);
+    DbRecordset rows(connection_);
+    ASSERT_TRUE(Open(rows, u"SELECT * FROM "_s + table)) << rows.ErrorContext().toStdString();
+    EXPECT_EQ(Column(u"SELECT %1 FROM %2 WHERE %3 = 2"_s.arg(FieldReferenceIn(rows.Fields(), 1), table,
+                                                             FieldReferenceIn(rows.Fields(), 0))),
+              QStringList(u"two"_s));
+    ASSERT_TRUE(rows.Update(1, Value::Text(u"uno"_s)));
+    EXPECT_EQ(Column(u"SELECT [y]]] AS [z]]] FROM [a]]b] ORDER BY [z]]] DESC"_s),
+              QStringList({u"uno"_s, u"two"_s}));
+    for (const QString& made : {u"CREATE TABLE [c]]d] (a Integer)"_s, u"CREATE TABLE n ([[a] Integer)"_s,
+                                u"ALTER TABLE [a]]b] RENAME [y]]] TO [z]]]"_s})
+        EXPECT_EQ(ResultOf(made), Hr::SyntaxError) << made.toStdString();
+
+    EXPECT_EQ(Column(u"SELECT own FROM msystables"_s), QStringList(u"mine"_s));
+    EXPECT_EQ(Column(u"SELECT TableName FROM MSysTables WHERE TableName LIKE 'msystables'"_s),
+              QStringList({u"MSysTables"_s, u"msystables"_s}));
 }
 
 TEST_F(ForeignFile, ThatIsNoDatabaseIsRefusedAndLeftAlone)

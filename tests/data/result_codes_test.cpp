@@ -129,12 +129,14 @@ TEST_F(ResultCodes, OfResultsTellWhyTheyCannotBeChanged)
         qint64 record;
         QString code;
         Str message;
+        QString reason;
     } rows[] = {
         {"columns of two tables",
          u"SELECT People.Name,Towns.Town FROM People INNER JOIN Towns ON People.Id=Towns.Id"_s, 0, u"800A0CB3"_s,
-         Str::ErrorReadOnlyJoin},
-        {"no keys", u"SELECT DISTINCT Name FROM People"_s, 0, u"800A0CB3"_s, Str::ErrorInCommand},
-        {"behind the last record", u"SELECT Name FROM People"_s, 1, u"800A0BCD"_s, Str::ErrorInCommand},
+         Str::ErrorReadOnlyJoin, StringText(Str::JoinIsReadOnly)},
+        {"no keys", u"SELECT DISTINCT Name FROM People"_s, 0, u"800A0CB3"_s, Str::ErrorInCommand,
+         StringText(Str::DistinctIsReadOnly)},
+        {"behind the last record", u"SELECT Name FROM People"_s, 1, u"800A0BCD"_s, Str::ErrorInCommand, {}},
     };
     for (const auto& row : rows) {
         DbRecordset recordset(connection_);
@@ -142,7 +144,7 @@ TEST_F(ResultCodes, OfResultsTellWhyTheyCannotBeChanged)
         ASSERT_TRUE(recordset.MoveTo(row.record)) << row.what;
         EXPECT_FALSE(recordset.Update(0, Value::Text(u"Bob"_s))) << row.what;
         ReportProviderError(prompt_, &recordset, recordset.LastResult());
-        ExpectShown(row.code, row.message, {}, QString::fromLatin1(row.what));
+        ExpectShown(row.code, row.message, row.reason, QString::fromLatin1(row.what));
     }
 }
 

@@ -28,6 +28,7 @@ TEST(KeywordPosition, StandsAsAWholeWord)
                  {"at the end", u"FROM T WHERE", 7},
                  {"after a tab, before a bracket", u"FROM T\tWHERE(A=1)", 7},
                  {"inside longer names", u"FROM NOWHERE WHEREVER", -1},
+                 {"between line ends", u"SELECT *\nFROM T\r\nWHERE\nA=1", 17},
                  {"behind a comma", u"A,WHERE B", -1}});
 }
 
@@ -37,6 +38,7 @@ TEST(KeywordPosition, IsNotFoundInsideQuotesAndBrackets)
                  {"the other quote inside", u"A='\" WHERE' WHERE B=2", 12},
                  {"a doubled quote ends and reopens", u"A='it''s WHERE ' WHERE B", 17},
                  {"a name in brackets", u"SELECT [No WHERE here] FROM T WHERE A", 30},
+                 {"a doubled bracket in a name", u"SELECT [a]] WHERE b] FROM T WHERE A", 28},
                  {"quote never closed", u"A='x WHERE y", -1},
                  {"bracket never closed", u"[x WHERE y", -1}});
 }
@@ -58,6 +60,19 @@ TEST(WithCondition, KeepsWhatIsThere)
     };
     for (const Row& row : rows)
         EXPECT_EQ(WithCondition(row.statement, u"b=2"_s), row.expected);
+}
+
+TEST(WithCondition, PutsWhatSpeaksOfGroupsIntoHaving)
+{
+    const QString total = u"sum (a) > 2"_s;
+    EXPECT_EQ(WithCondition(u"SELECT b FROM T GROUP BY b"_s, total),
+              u"SELECT b FROM T GROUP BY b HAVING sum (a) > 2"_s);
+    EXPECT_EQ(WithCondition(u"SELECT b FROM T GROUP BY b HAVING c\nORDER BY b"_s, total),
+              u"SELECT b FROM T GROUP BY b HAVING ( c\n) AND (sum (a) > 2) ORDER BY b"_s);
+    EXPECT_EQ(WithCondition(u"SELECT COUNT(*) FROM T HAVING c"_s, u"a=1"_s),
+              u"SELECT COUNT(*) FROM T  WHERE a=1 HAVING c"_s);
+    for (const QString& other : {u"[Count(x)] = 1"_s, u"a = 'SUM(b)'"_s, u"summ(a) = 1"_s, u"Count = 1"_s})
+        EXPECT_EQ(WithCondition(u"SELECT b FROM T"_s, other), u"SELECT b FROM T WHERE "_s + other);
 }
 
 TEST(WithOrder, ReplacesTheOrderBefore)
@@ -97,7 +112,8 @@ TEST(SelectList, IsCutAtItsOwnCommas)
 
 TEST(IsBalanced, LooksOutsideOfTexts)
 {
-    for (const QString& balanced : {u""_s, u"SELECT [x] FROM t WHERE b = ')'"_s, u"'it''s'"_s, u"([)]"_s})
+    for (const QString& balanced :
+         {u""_s, u"SELECT [x] FROM t WHERE b = ')'"_s, u"'it''s'"_s, u"([)]"_s, u"[a]]b]"_s})
         EXPECT_TRUE(IsBalanced(balanced)) << balanced.toStdString();
     for (const QString& unbalanced :
          {u"SELECT * FROM t WHERE (a = 1"_s, u"a)("_s, u"[a"_s, u"a]"_s, u"'a"_s, u"\"a'"_s})

@@ -138,6 +138,28 @@ TEST(Aggregates, StandWhereAGroupIs)
     });
 }
 
+TEST(Nesting, IsHeldAgainstWhatTheEngineReads)
+{
+    const auto ladder = [](int steps) {
+        return u"IIF(Qty>1,'a',"_s.repeated(steps) + u"'z'"_s + u")"_s.repeated(steps);
+    };
+    const auto within = [](int steps) {
+        return u"IIF("_s.repeated(steps) + u"Sold"_s + u",Sold,Sold)"_s.repeated(steps);
+    };
+    ExpectCodes({
+        {"a chain of texts", u"SELECT Name"_s + u" & Name"_s.repeated(90) + u" FROM Items"_s, Hr::Ok},
+        {"the same from the right",
+         u"SELECT Name"_s + u" || (Name"_s.repeated(90) + u")"_s.repeated(90) + u" FROM Items"_s, Hr::Ok},
+        {"a ladder of choices", u"SELECT "_s + ladder(90) + u" FROM Items"_s, Hr::Ok},
+        {"a text of 16 million", u"INSERT INTO Items (Note) VALUES ('"_s + QString(16'000'000, u'ß') + u"')"_s,
+         Hr::Ok},
+        {"choices within choices", u"SELECT "_s + within(40) + u" FROM Items"_s, Hr::SyntaxError},
+    });
+    const PlanResult deep = PlanStatement(u"SELECT "_s + within(40) + u" FROM Items"_s, dialect::TestSchema());
+    EXPECT_TRUE(std::get<PlanFailure>(deep).context.endsWith(u"nested too deeply"))
+        << qPrintable(std::get<PlanFailure>(deep).context);
+}
+
 TEST(Structure, IsHeldAgainstTheSchema)
 {
     ExpectCodes({

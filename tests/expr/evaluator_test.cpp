@@ -66,6 +66,18 @@ protected:
     FakeRecord record;
 };
 
+TEST_F(Expressions, WriteWholeNumbersToTheLastDigit)
+{
+    record.columns[2].value = Value::Whole(9007199254740993);
+    ExpectValues({{u"'No '+[Qty]"_s, u"<No 9007199254740993>"_s}, {u"TO_CHAR([Qty])"_s, u"<9007199254740993>"_s}});
+    const ExprTree tree = ParseExpression(u"[Qty]"_s, ExprMode::Value);
+    EvaluateExpression(record, *tree);
+    EXPECT_EQ(ShownText(*tree), u"9007199254740993"_s);
+    record.columns[2].value = Value::Double(1e20);
+    EvaluateExpression(record, *tree);
+    EXPECT_EQ(ShownText(*tree), u"100000000000000000000"_s) << "not the number before";
+}
+
 TEST_F(Expressions, ReadFieldsByTheirColumnsType)
 {
     ExpectValues({{u"Name"_s, u"<Smith>"_s},

@@ -149,7 +149,7 @@ TEST_F(DatabaseFiles, OfOtherProgramsShowWhatTheyHold)
                                              u"2|7|2|3|4|2001-07-04|2001-07-04 09:05:00|0|text|ff"_s}));
     auto cursor = provider->CreateRecordset();
     ASSERT_EQ(cursor->Open(u"Kinds"_s, foreign, CursorType::Static, LockType::Optimistic), Hr::Ok);
-    EXPECT_EQ(FieldOf(*cursor, 1), Value::Double(9e9));
+    EXPECT_EQ(FieldOf(*cursor, 1), Value::Whole(9000000000));
     EXPECT_EQ(FieldOf(*cursor, 5), Value::Date(37076));
     EXPECT_EQ(cursor->Fields()[3].type, FieldType::Text);
     EXPECT_EQ(cursor->Fields()[4].type, FieldType::Memo);

@@ -39,6 +39,11 @@ TEST_F(EngineFunctions, LikeIgnoresCaseAndKnowsPercentAlone)
         {u"ÄPFEL"_s, u"äpf%"_s, true},
         {u"Äpfel"_s, u"%FEL"_s, true},
         {u"Straße"_s, u"%STRAßE%"_s, true},
+        {u"Zürich Kloten"_s, u"%KLOT%"_s, true},
+        {u"5 \u212A"_s, u"%k"_s, true},       // the Kelvin sign
+        {u"Gro\u017Fse"_s, u"gros%"_s, true}, // a long s
+        {u"Äußere Größe"_s, u"%re%GRÖSSE%"_s, false},
+        {u"Äußere Größe"_s, u"%re%GRÖßE%"_s, true},
         {u"ab"_s, u"ab%b"_s, false},
         {u""_s, u"%"_s, true},
         {u""_s, u""_s, true},
@@ -63,9 +68,9 @@ TEST_F(EngineFunctions, TextIsOrderedByLanguageNullsFirstTiesExactly)
     EXPECT_EQ(Rows(u"SELECT A FROM T ORDER BY A DESC"_s, CursorType::Static), reversed);
 }
 
-// A static cursor sorts by itself, piece by piece of the keys; the engine's own sorting must agree with it on
-// texts that differ late, only by case, or not at all.
-TEST_F(EngineFunctions, StaticAndForwardResultsHaveTheSameOrder)
+// Results in the order of one text are sorted here, piece by piece of the keys; the engine's own sorting, which
+// does two terms, must agree on texts that differ late, only by case, or not at all.
+TEST_F(EngineFunctions, OwnSortingAndTheEnginesHaveTheSameOrder)
 {
     constexpr std::array kWords = {"flock", "Flock", "runway ", "tower", "Öl", "a", "", "0"};
     QRandomGenerator random(7);
@@ -78,8 +83,12 @@ TEST_F(EngineFunctions, StaticAndForwardResultsHaveTheSameOrder)
         insert += ",('" + text.toUtf8() + "')";
     }
     Outside(insert);
-    for (const QString& source : {u"SELECT A FROM T ORDER BY A"_s, u"SELECT A FROM T ORDER BY A DESC"_s})
-        EXPECT_EQ(Read(*Open(source), {.count = 3000}), Rows(source)) << source.toStdString();
+    for (const QString& direction : {u""_s, u" DESC"_s}) {
+        const QString source = u"SELECT A FROM T ORDER BY A"_s + direction;
+        const QStringList byEngine = Rows(source + u",A"_s + direction);
+        EXPECT_EQ(Read(*Open(source), {.count = 3000}), byEngine) << source.toStdString();
+        EXPECT_EQ(Rows(source), byEngine) << source.toStdString();
+    }
 }
 
 TEST_F(EngineFunctions, ForeignDatesCompareAndSortAsDates)

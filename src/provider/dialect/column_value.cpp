@@ -10,6 +10,8 @@
 namespace mirel::dialect {
 namespace {
 
+constexpr qsizetype kMostDigits = 64; // of a whole number, blanks around it included
+
 bool IsNumberUnit(QChar unit)
 {
     return (unit >= u'0' && unit <= u'9') || unit == u'.' || unit == u'-' || unit == u'+' || unit == u'e' ||
@@ -45,9 +47,27 @@ Hr NumberOf(const Value& value, double& number)
     return Hr::BadLiteral;
 }
 
+// The number to its last digit, where it is written as a plain whole one.
+std::optional<qint64> WholeNumberOf(const Value& value)
+{
+    if (value.Tag() != ValueTag::Text)
+        return value.WholeNumber();
+    const QStringView text = value.TextView();
+    bool reads = false;
+    const qint64 number = text.size() <= kMostDigits ? text.trimmed().toLongLong(&reads) : 0;
+    return reads ? std::optional(number) : std::nullopt;
+}
+
 template <typename Whole>
 Hr ConvertWhole(const Value& value, Value (*make)(Whole), Value& converted)
 {
+    using Limits = std::numeric_limits<Whole>;
+    if (const std::optional<qint64> whole = WholeNumberOf(value)) {
+        if (*whole < Limits::min() || *whole > Limits::max())
+            return Hr::Overflow;
+        converted = make(Whole(*whole));
+        return Hr::Ok;
+    }
     double number = 0;
     if (const Hr hr = NumberOf(value, number); Failed(hr))
         return hr;
@@ -55,7 +75,8 @@ Hr ConvertWhole(const Value& value, Value (*make)(Whole), Value& converted)
         return Hr::Overflow;
     if (number != std::trunc(number))
         return Hr::BadLiteral;
-    if (number < std::numeric_limits<Whole>::min() || number > std::numeric_limits<Whole>::max())
+    // The greatest one of 64 bits is no double; the power of two behind it is.
+    if (number < double(Limits::min()) || number >= -double(Limits::min()))
         return Hr::Overflow;
     converted = make(Whole(number));
     return Hr::Ok;
@@ -64,6 +85,10 @@ Hr ConvertWhole(const Value& value, Value (*make)(Whole), Value& converted)
 Hr ConvertDouble(const Value& value, Value& converted)
 {
     double number = value.Number();
+    if (const std::optional<qint64> whole = WholeNumberOf(value); whole && qint64(double(*whole)) != *whole) {
+        converted = Value::Whole(*whole);
+        return Hr::Ok;
+    }
     if (value.Tag() != ValueTag::Date) {
         if (const Hr hr = NumberOf(value, number); Failed(hr))
             return hr;
@@ -179,7 +204,8 @@ Hr ConvertValue(const Value& value, FieldType type, int size, Value& converted)
     case FieldType::SmallInt:
         return ConvertWhole<qint16>(value, Value::SmallInt, converted);
     case FieldType::Integer:
-        return ConvertWhole<qint32>(value, Value::Integer, converted);
+        return size == kWideIntegerSize ? ConvertWhole<qint64>(value, Value::Whole, converted)
+                                        : ConvertWhole<qint32>(value, Value::Integer, converted);
     case FieldType::Double:
         return ConvertDouble(value, converted);
     case FieldType::Date:

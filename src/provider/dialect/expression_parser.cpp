@@ -137,7 +137,7 @@ bool ExpressionParser::ReadName()
         return cursor_.Fail({token.begin, token.end});
     Expr& column = operands_.emplace_back();
     column.operation = Operation::Column;
-    column.text = token.text.toString();
+    column.text = token.Text();
     column.place = place;
     wantsOperand_ = false;
     if (!cursor_.Take(Symbol::Point))

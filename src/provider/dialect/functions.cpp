@@ -71,9 +71,4 @@ const FunctionDef* FindFunction(QStringView name)
     return row == kFunctions.end() ? nullptr : &*row;
 }
 
-QStringView NameOf(Function function)
-{
-    return std::ranges::find(kFunctions, function, &FunctionDef::function)->name;
-}
-
 } // namespace mirel::dialect

@@ -68,7 +68,4 @@ std::span<const FunctionDef> Functions();
 
 const FunctionDef* FindFunction(QStringView name); // in any case; null: none
 
-// The first of a function's names.
-QStringView NameOf(Function function);
-
 } // namespace mirel::dialect

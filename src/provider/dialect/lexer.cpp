@@ -49,7 +49,7 @@ constexpr std::array kSymbols = {
 QString Token::Text() const
 {
     QString value = text.toString();
-    if (kind == TokenKind::Text && text.contains(quote))
+    if (!quote.isNull() && text.contains(quote))
         value.replace(QString(2, quote), QString(quote));
     return value;
 }
@@ -96,7 +96,8 @@ Token Lexer::Bare(Token token)
 
 Token Lexer::Bracketed(Token token)
 {
-    const qsizetype close = statement_.indexOf(u']', position_);
+    token.quote = u']';
+    const qsizetype close = ClosingQuote(token.quote);
     const QStringView name = close < 0 ? QStringView() : statement_.sliced(position_ + 1, close - position_ - 1);
     if (name.isEmpty() || name.contains(QChar(u'\0')))
         return Finish(token, TokenKind::Fault, statement_.size());
@@ -104,17 +105,22 @@ Token Lexer::Bracketed(Token token)
     return Finish(token, TokenKind::BracketedName, close + 1);
 }
 
+// Behind the current position, where a doubled one is part of the text. -1: it is never closed.
+qsizetype Lexer::ClosingQuote(QChar quote) const
+{
+    for (qsizetype at = position_ + 1;; at += 2) {
+        at = statement_.indexOf(quote, at);
+        if (at < 0 || At(at + 1) != quote)
+            return at;
+    }
+}
+
 Token Lexer::Quoted(Token token)
 {
     token.quote = statement_[position_];
-    qsizetype close = position_ + 1;
-    for (;; close += 2) {
-        close = statement_.indexOf(token.quote, close);
-        if (close < 0)
-            return Finish(token, TokenKind::Fault, statement_.size());
-        if (At(close + 1) != token.quote)
-            break;
-    }
+    const qsizetype close = ClosingQuote(token.quote);
+    if (close < 0)
+        return Finish(token, TokenKind::Fault, statement_.size());
     token.text = statement_.sliced(position_ + 1, close - position_ - 1);
     return Finish(token, TokenKind::Text, close + 1);
 }

@@ -9,7 +9,7 @@ namespace mirel::dialect {
 enum class TokenKind : quint8 {
     End,
     Name,          // a bare word; `keyword` says whether it is a reserved one
-    BracketedName, // [Ship To]
+    BracketedName, // [Ship To], a "]" of the name doubled
     Text,          // 'O''Brien' or "so"
     Number,
     Symbol,
@@ -42,11 +42,11 @@ struct Token {
     TokenKind kind = TokenKind::End;
     Keyword keyword = Keyword::None;
     Symbol symbol = Symbol::None;
-    QStringView text;     // of names and texts without brackets and quotes; a text's inner quotes still doubled
+    QStringView text;     // of names and texts without brackets and quotes; what is doubled inside still is
     qsizetype begin = 0;  // in the statement, from 0
     qsizetype end = 0;    // just behind it
-    QChar quote;          // a text's own
-    QString Text() const; // a text's value
+    QChar quote;          // that closes a text or a bracketed name
+    QString Text() const; // the text or name itself
 };
 
 // Cuts a statement into tokens, one at a time. Keeps views into the statement, which must outlive the tokens.
@@ -68,6 +68,7 @@ private:
     Token Quoted(Token token);
     Token Number(Token token);
     Token SymbolToken(Token token);
+    qsizetype ClosingQuote(QChar quote) const;
     Token Finish(Token token, TokenKind kind, qsizetype end);
     QChar At(qsizetype position) const { return position < statement_.size() ? statement_[position] : QChar(); }
 

@@ -38,6 +38,12 @@ QString StoredText(double oleDays)
     return stored ? QString::fromLatin1(stored->Text().data(), stored->length) : QString();
 }
 
+QString NumberText(const Value& value)
+{
+    const std::optional<qint64> whole = value.WholeNumber();
+    return whole ? QString::number(*whole) : QString::number(value.Number(), 'g', QLocale::FloatingPointShortest);
+}
+
 void BecomeValue(Expr& literal, FieldType type, const Value& value)
 {
     switch (value.Tag()) {
@@ -45,8 +51,7 @@ void BecomeValue(Expr& literal, FieldType type, const Value& value)
     case ValueTag::Integer:
     case ValueTag::Double:
         if (literal.operation != Operation::Number) // else it stays as it was written
-            Become(literal, Operation::Number, type,
-                   QString::number(value.Number(), 'g', QLocale::FloatingPointShortest));
+            Become(literal, Operation::Number, type, NumberText(value));
         break;
     case ValueTag::Date:
         Become(literal, Operation::Date, type, StoredText(value.Number()));

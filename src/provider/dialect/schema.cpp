@@ -32,6 +32,17 @@ const Table* Schema::FindTable(QStringView tableName) const
     return FindByName(tables, tableName);
 }
 
+QStringView StampOfTable(QStringView tableName)
+{
+    constexpr QStringView kPrefix = u"MirelSys";
+    constexpr qsizetype kStampDigits = 14;
+    if (!tableName.startsWith(kPrefix) || tableName.size() != kPrefix.size() + kStampDigits)
+        return {};
+    const QStringView stamp = tableName.sliced(kPrefix.size());
+    return std::ranges::all_of(stamp, [](QChar each) { return each >= u'0' && each <= u'9'; }) ? stamp
+                                                                                               : QStringView();
+}
+
 bool SameName(QStringView a, QStringView b)
 {
     return a.compare(b, Qt::CaseInsensitive) == 0;

@@ -16,7 +16,7 @@ namespace mirel::dialect {
 struct Column {
     QString name;
     FieldType type = FieldType::None;
-    int size = 0;              // characters of a Text, bytes of a VarBinary; -1: no limit
+    int size = 0;              // characters of a Text, bytes of a VarBinary and of a wide Integer; -1: no limit
     int id = 0;                // FieldID: stable within a session
     bool foreignDates = false; // a date column whose values may be in forms other than ours: compared and
                                // sorted through a normalising function
@@ -40,8 +40,9 @@ struct Table {
     std::vector<Column> columns;
     std::vector<Index> indexes;
     QByteArray rowId;      // the alias under which rows are addressed (rowid, _rowid_, oid); empty: there is none
-    bool writable = true;  // false for views, the catalog's tables and tables without an addressable row id
+    bool writable = true;  // false for views, catalog and stamp tables, tables without an addressable row id
     bool isSystem = false; // the catalog's own tables
+    bool isView = false;
 
     const Column* FindColumn(QStringView columnName) const; // null: none
     const Index* FindIndex(QStringView indexName) const;    // null: none
@@ -53,6 +54,10 @@ public:
 
     const Table* FindTable(QStringView tableName) const; // null: none
 };
+
+// The digits behind "MirelSys" in the name of a stamp table, the one that gives a database its identity; empty
+// for every other table, also for one that merely begins so.
+QStringView StampOfTable(QStringView tableName);
 
 // The one rule by which names are the same.
 bool SameName(QStringView a, QStringView b);

@@ -36,6 +36,7 @@ private:
     bool FindTable(QString& name);
     bool FindColumn(QString& name);
     bool CheckNewTable(const QString& name);
+    bool HasStampTable() const;
     bool Fail(Hr code, QString context = {})
     {
         failure_ = {code, std::move(context)};
@@ -75,10 +76,19 @@ bool StructureChecker::CheckNewTable(const QString& name)
     return true;
 }
 
+bool StructureChecker::HasStampTable() const
+{
+    return std::ranges::any_of(schema_.tables,
+                               [](const Table& table) { return !StampOfTable(table.name).isEmpty(); });
+}
+
 bool StructureChecker::Check(CreateTable& create)
 {
     if (!CheckNewTable(create.table))
         return false;
+    // A database gets its stamp once: a second one would cut it off from its forms and queries.
+    if (!StampOfTable(create.table).isEmpty() && HasStampTable())
+        return Fail(Hr::AccessDenied, StringText(Str::StampTableIsGuarded, {create.table}));
     if (create.columns.size() > kMaxColumns)
         return Fail(Hr::TooManyColumns);
     for (auto column = create.columns.begin(); column != create.columns.end(); ++column) {
@@ -93,7 +103,10 @@ bool StructureChecker::Check(CreateTable& create)
 
 bool StructureChecker::Check(RenameTable& rename)
 {
-    return FindTable(rename.table) && CheckNewTable(rename.newName);
+    if (!FindTable(rename.table) || !CheckNewTable(rename.newName))
+        return false;
+    return StampOfTable(rename.newName).isEmpty() ||
+           Fail(Hr::AccessDenied, StringText(Str::StampTableIsGuarded, {rename.newName}));
 }
 
 bool StructureChecker::Check(AddColumn& add)
@@ -152,11 +165,22 @@ std::optional<Failure> CheckStructure(StructureChange& change, const Schema& sch
 
 std::optional<Failure> RefuseChange(const Table& table)
 {
-    if (table.isSystem)
-        return Failure{Hr::AccessDenied, StringText(Str::CatalogTableIsReadOnly, {table.name})};
-    if (!table.writable)
-        return Failure{Hr::ReadOnly, {}};
-    return {};
+    if (table.writable)
+        return {};
+    const bool isGuarded = table.isSystem || !StampOfTable(table.name).isEmpty();
+    return Failure{isGuarded ? Hr::AccessDenied : Hr::ReadOnly, ReadOnlyReason(table)};
+}
+
+QString ReadOnlyReason(const Table& table)
+{
+    if (table.writable)
+        return {};
+    const bool isStamp = !StampOfTable(table.name).isEmpty();
+    const Str reason = table.isSystem ? Str::CatalogTableIsReadOnly
+                       : isStamp      ? Str::StampTableIsGuarded
+                       : table.isView ? Str::ViewIsReadOnly
+                                      : Str::TableHasNoRowIds;
+    return StringText(reason, {table.name});
 }
 
 } // namespace mirel::dialect

@@ -16,5 +16,7 @@ std::optional<Failure> CheckStructure(StructureChange& change, const Schema& sch
 
 // Why a table cannot be changed by any statement; empty when it can.
 std::optional<Failure> RefuseChange(const Table& table);
+// For people: why the table's records cannot be changed. Empty when they can.
+QString ReadOnlyReason(const Table& table);
 
 } // namespace mirel::dialect

@@ -25,7 +25,7 @@ private:
     bool ParseMove(QString table);
     bool ParseColumn(ColumnDefinition& column)
     {
-        return cursor_.ExpectName(column.name) && ParseColumnType(cursor_, column);
+        return cursor_.ExpectNewName(column.name) && ParseColumnType(cursor_, column);
     }
     template <typename Change>
     bool Keep(Change change)
@@ -65,7 +65,7 @@ bool StructureParser::ParseCreate()
 bool StructureParser::ParseCreateTable()
 {
     CreateTable create;
-    if (!cursor_.ExpectName(create.table) || !cursor_.Expect(Symbol::Open))
+    if (!cursor_.ExpectNewName(create.table) || !cursor_.Expect(Symbol::Open))
         return false;
     do {
         if (!ParseColumn(create.columns.emplace_back()))
@@ -78,8 +78,8 @@ bool StructureParser::ParseCreateIndex(bool unique)
 {
     CreateIndex create;
     create.unique = unique;
-    if (!cursor_.ExpectName(create.index) || !cursor_.Expect(Keyword::On) || !cursor_.ExpectName(create.table) ||
-        !cursor_.Expect(Symbol::Open)) {
+    if (!cursor_.ExpectNewName(create.index) || !cursor_.Expect(Keyword::On) ||
+        !cursor_.ExpectName(create.table) || !cursor_.Expect(Symbol::Open)) {
         return false;
     }
     do {
@@ -118,7 +118,7 @@ bool StructureParser::ParseAlter()
         return false;
     if (cursor_.TakeWord(u"TO")) {
         RenameTable rename{std::move(table), {}};
-        return cursor_.ExpectName(rename.newName) && Keep(std::move(rename));
+        return cursor_.ExpectNewName(rename.newName) && Keep(std::move(rename));
     }
     if (cursor_.TakeWord(u"ADD")) {
         cursor_.TakeWord(u"COLUMN");
@@ -139,12 +139,12 @@ bool StructureParser::ParseRename(QString table)
 {
     if (cursor_.TakeWord(u"TO")) {
         RenameTable rename{std::move(table), {}};
-        return cursor_.ExpectName(rename.newName) && Keep(std::move(rename));
+        return cursor_.ExpectNewName(rename.newName) && Keep(std::move(rename));
     }
     cursor_.TakeWord(u"COLUMN");
     RenameColumn rename{std::move(table), {}, {}};
-    return cursor_.ExpectName(rename.column) && cursor_.ExpectWord(u"TO") && cursor_.ExpectName(rename.newName) &&
-           Keep(std::move(rename));
+    return cursor_.ExpectName(rename.column) && cursor_.ExpectWord(u"TO") &&
+           cursor_.ExpectNewName(rename.newName) && Keep(std::move(rename));
 }
 
 bool StructureParser::ParseMove(QString table)

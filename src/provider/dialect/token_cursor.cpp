@@ -6,7 +6,7 @@ namespace mirel::dialect {
 namespace {
 
 // Room for filters that have added up to thousands of conditions, and for long texts in an INSERT.
-constexpr qsizetype kMaxUnits = 1 << 20;
+constexpr qsizetype kMaxUnits = 48 << 20;
 constexpr int kMaxTokens = 200000;
 
 } // namespace
@@ -55,8 +55,16 @@ bool TokenCursor::ExpectName(QString& name)
 {
     if (!AtName())
         return Fail();
-    name = current_.text.toString();
+    name = current_.Text();
     return Step();
+}
+
+bool TokenCursor::ExpectNewName(QString& name)
+{
+    if (!AtName())
+        return Fail();
+    name = current_.Text();
+    return name.startsWith(u'[') || name.contains(u']') ? Fail() : Step();
 }
 
 bool TokenCursor::ExpectText(QString& text)

@@ -39,6 +39,8 @@ public:
     [[nodiscard]] bool Expect(Keyword keyword) { return Take(keyword) || Fail(); }
     [[nodiscard]] bool ExpectWord(QStringView upperCase) { return TakeWord(upperCase) || Fail(); }
     [[nodiscard]] bool ExpectName(QString& name);
+    // A name that this statement makes: a bracket in it is a fault, because few programs could say it.
+    [[nodiscard]] bool ExpectNewName(QString& name);
     [[nodiscard]] bool ExpectText(QString& text);
 
     // Each is always false. Without a code: a syntax error, at the current token or at `place`.

@@ -5,6 +5,7 @@
 #include "provider/sqlite/forward_cursor.h"
 #include "provider/sqlite/static_cursor.h"
 #include "provider/sqlite/structure_change.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 
@@ -44,7 +45,7 @@ template <typename Call>
 Hr CedbRecordset::Change(Call call)
 {
     if (HasCursor() && lock_ == LockType::ReadOnly)
-        return Keep({Hr::ReadOnly, {}});
+        return Keep({Hr::ReadOnly, readOnlyReason_});
     return OnCursor(call);
 }
 
@@ -118,6 +119,11 @@ Outcome CedbRecordset::RunPlan(Plan plan, CursorType cursor, LockType lock)
 
 Outcome CedbRecordset::OpenSelect(SelectPlan plan, CursorType cursor, LockType lock)
 {
+    readOnlyReason_ = plan.readOnlyReason;
+    if (file_->IsReadOnly())
+        readOnlyReason_ = StringText(Str::DatabaseIsReadOnly, {file_->Path()});
+    if (readOnlyReason_.isEmpty())
+        readOnlyReason_ = StringText(Str::OpenedForReading);
     if (cursor == CursorType::Static)
         cursor_ = std::make_unique<StaticCursor>(file_, std::move(plan));
     else

@@ -79,6 +79,7 @@ private:
     std::unique_ptr<ResultCursor> cursor_; // none: not open, or a statement without rows
     QString source_;
     QString context_;
+    QString readOnlyReason_; // of an open result that refuses changes
     LockType lock_ = LockType::ReadOnly;
 };
 

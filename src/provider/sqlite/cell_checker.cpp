@@ -62,6 +62,8 @@ Hr CellChecker::Check(const Cell& cell, Cell& stored)
 
 Hr CellChecker::CheckText(std::string_view utf8, Cell& stored) const
 {
+    if (!QByteArrayView(utf8.data(), qsizetype(utf8.size())).isValidUtf8())
+        return Hr::BadLiteral;
     const bool limited = type_ == FieldType::Text && size_ > 0;
     if (limited && utf8.size() > size_t(size_) && UnitsOf(utf8) > size_)
         return Hr::Overflow;
@@ -86,7 +88,9 @@ Hr CellChecker::CheckDate(std::string_view text, Cell& stored)
 
 Hr CellChecker::CheckInteger(qint64 number, Cell& stored) const
 {
-    const bool fits = type_ == FieldType::SmallInt ? number == qint16(number) : number == qint32(number);
+    const bool fits = type_ == FieldType::SmallInt ? number == qint16(number)
+                      : size_ == kWideIntegerSize  ? true
+                                                   : number == qint32(number);
     if (!fits && type_ != FieldType::YesNo)
         return Hr::Overflow;
     stored = Cell::Of(type_ == FieldType::YesNo ? qint64(number != 0) : number);
@@ -103,13 +107,16 @@ Hr CellChecker::Convert(const Cell& cell, Cell& stored)
     case ValueTag::Null:
         stored = {};
         break;
+    case ValueTag::Bool:
+        stored = Cell::Of(qint64(value.ToBool()));
+        break;
     case ValueTag::SmallInt:
     case ValueTag::Integer:
-    case ValueTag::Bool:
-        stored = Cell::Of(qint64(value.ToInt()));
-        break;
     case ValueTag::Double:
-        stored = Cell::Of(value.Number());
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            stored = Cell::Of(*whole);
+        else
+            stored = Cell::Of(value.Number());
         break;
     case ValueTag::Date:
         date_ = StoredDateOf(value.Number()).value_or(StoredDate());

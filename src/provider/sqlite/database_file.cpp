@@ -38,7 +38,7 @@ struct Limit {
 };
 // Above what any database of this system needs, below what takes the machine down.
 constexpr std::array kLimits = {
-    Limit{SQLITE_LIMIT_LENGTH, 512 << 20},    Limit{SQLITE_LIMIT_SQL_LENGTH, 64 << 20},
+    Limit{SQLITE_LIMIT_LENGTH, 512 << 20},    Limit{SQLITE_LIMIT_SQL_LENGTH, 192 << 20},
     Limit{SQLITE_LIMIT_COMPOUND_SELECT, 100}, Limit{SQLITE_LIMIT_TRIGGER_DEPTH, 32},
     Limit{SQLITE_LIMIT_ATTACHED, 1}, // compacting attaches its new file
 };

@@ -71,11 +71,13 @@ Value ValueOf(sqlite3_value* value)
 void ResultValue(sqlite3_context* context, const Value& value)
 {
     switch (value.Tag()) {
+    case ValueTag::Bool:
+        return sqlite3_result_int(context, value.ToBool() ? 1 : 0);
     case ValueTag::SmallInt:
     case ValueTag::Integer:
-    case ValueTag::Bool:
-        return sqlite3_result_int(context, value.ToInt());
     case ValueTag::Double:
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            return sqlite3_result_int64(context, *whole);
         return sqlite3_result_double(context, value.Number());
     case ValueTag::Date: {
         const std::optional<StoredDate> stored = StoredDateOf(value.Number());
@@ -101,7 +103,7 @@ bool FitsAsItIs(sqlite3_value* value, FieldType type, int size)
         return true;
     case SQLITE_INTEGER: {
         const qint64 number = sqlite3_value_int64(value);
-        return (type == FieldType::Integer && qint32(number) == number) ||
+        return (type == FieldType::Integer && (size == kWideIntegerSize || qint32(number) == number)) ||
                (type == FieldType::SmallInt && qint16(number) == number);
     }
     case SQLITE_FLOAT:

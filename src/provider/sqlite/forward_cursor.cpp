@@ -3,15 +3,19 @@
 #include "provider/sqlite/row_reader.h"
 #include "provider/sqlite/select_sql.h"
 #include "provider/sqlite/static_cursor.h"
+#include "provider/sqlite/text_sort.h"
 #include "provider/sqlite/transaction.h"
 
 #include <QElapsedTimer>
 
+#include <algorithm>
+
 namespace mirel::sqlite {
 namespace {
 
-constexpr size_t kBlockSize = 256;
+constexpr qint64 kBlockSize = 256;
 constexpr int kFirstBlockMs = 2;
+constexpr size_t kMostKeptBytes = size_t(192) << 20;
 
 } // namespace
 
@@ -21,28 +25,75 @@ ForwardCursor::ForwardCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan
 {
 }
 
-void ForwardCursor::Keep(std::span<const Cell> cells)
-{
-    std::vector<Value>& row = block_.emplace_back();
-    row.reserve(cells.size());
-    for (size_t i = 0; i < cells.size(); ++i)
-        row.push_back(ValueOfCell(cells[i], plan_.fields[i].type));
-}
-
 Outcome ForwardCursor::FetchBlock()
 {
-    block_.clear();
+    block_.Clear();
     blockStart_ = position_;
+    blockIsLast_ = true;
+    if (position_ == 0)
+        return FetchFirst();
+    return FetchFurther([this](std::span<const Cell> cells) {
+        block_.Append(cells);
+        return blockIsLast_ = block_.Size() < kBlockSize;
+    });
+}
+
+Outcome ForwardCursor::FetchFirst()
+{
+    if (plan_.keyed && plan_.order.size() == 1 && plan_.order.front().isText) {
+        bool sorted = false;
+        Outcome outcome = FetchByText(sorted);
+        if (sorted || !outcome.Ok())
+            return outcome;
+        block_.Clear();
+    }
+    Outcome outcome;
+    Statement statement = file_->Prepare(WholeSelect(plan_), outcome);
+    if (!statement)
+        return outcome;
     QElapsedTimer timer;
     timer.start();
-    blockIsLast_ = true;
-    const CellSink keep = [&](std::span<const Cell> cells) {
-        Keep(cells);
+    RowReader reader(plan_.fields, AllFields(plan_.fields), RowReader::Layout::Whole);
+    bool isWorkedOut = plan_.isAggregated;
+    int result = statement.Step();
+    for (; result == SQLITE_ROW && blockIsLast_; result = blockIsLast_ ? statement.Step() : result) {
+        block_.Append(reader.Read(statement.Get()));
+        isWorkedOut = isWorkedOut || sqlite3_stmt_status(statement.Get(), SQLITE_STMTSTATUS_SORT, 0) > 0;
         // A search that finds little is not run to the block's end: reading on starts it again.
-        blockIsLast_ = block_.size() < kBlockSize && (position_ > 0 || !timer.hasExpired(kFirstBlockMs));
-        return blockIsLast_;
-    };
-    return position_ == 0 ? Walk(AllFields(plan_.fields), keep) : FetchFurther(keep);
+        blockIsLast_ = isWorkedOut ? block_.Bytes() < kMostKeptBytes
+                                   : block_.Size() < kBlockSize && !timer.hasExpired(kFirstBlockMs);
+    }
+    return file_->OutcomeOf(result);
+}
+
+Outcome ForwardCursor::FetchByText(bool& sorted)
+{
+    const PlannedOrder& order = plan_.order.front();
+    SelectPlan unsorted = plan_;
+    unsorted.order.clear();
+    unsorted.fields.emplace_back();
+    unsorted.columns.push_back(order.expression);
+    Outcome outcome;
+    Statement statement = file_->Prepare(WholeSelect(unsorted), outcome);
+    if (!statement)
+        return outcome;
+    const int textColumn = int(plan_.fields.size());
+    RowReader reader(plan_.fields, AllFields(plan_.fields), RowReader::Layout::Whole);
+    TextSort sort;
+    int result = statement.Step();
+    for (; result == SQLITE_ROW; result = statement.Step()) {
+        if (!sort.Add(block_.Size(), statement.TextView(textColumn)) || block_.Bytes() > kMostKeptBytes)
+            return {};
+        block_.Append(reader.Read(statement.Get()));
+    }
+    if (result != SQLITE_DONE)
+        return file_->OutcomeOf(result);
+    std::vector<qint64> places;
+    places.reserve(size_t(block_.Size()));
+    sort.Finish(order.descending, [&places](qint64 place) { places.push_back(place); });
+    block_.Arrange(places);
+    sorted = true;
+    return {};
 }
 
 // Most results end within the first block; a longer one that is walked record by record gets positions.
@@ -54,7 +105,7 @@ Outcome ForwardCursor::FetchFurther(const CellSink& keep)
             return outcome;
         rest_ = std::move(rest);
     }
-    return rest_->Read({.first = position_, .count = qint64(kBlockSize) + 1, .fields = {}}, keep);
+    return rest_->Read({.first = position_, .count = kBlockSize + 1, .fields = {}}, keep);
 }
 
 // Hands over the records from the current one on, running the SELECT anew: nothing was left running.
@@ -111,7 +162,7 @@ Outcome ForwardCursor::GetValue(int field, Value& value)
 {
     if (AtEnd())
         return {Hr::NoCurrentRecord, {}};
-    value = block_[size_t(position_ - blockStart_)][size_t(field)];
+    value = ValueOfCell(block_.At(position_ - blockStart_)[size_t(field)], plan_.fields[size_t(field)].type);
     return {};
 }
 
@@ -119,28 +170,53 @@ Outcome ForwardCursor::Read(const ReadRange& range, const CellSink& sink)
 {
     if (AtEnd() || range.count == 0)
         return {};
+    const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;
+    if (blockIsLast_) {
+        ReadBlock(range, fields, sink);
+        return {};
+    }
     ReadTransaction transaction(*file_);
     Outcome outcome = transaction.Begin();
-    if (!outcome.Ok())
-        return outcome;
+    if (outcome.Ok())
+        outcome = ReadOn(range, fields, sink);
+    if (outcome.Ok())
+        outcome = transaction.End();
+    return outcome;
+}
+
+// All that is left of the result is in the block.
+void ForwardCursor::ReadBlock(const ReadRange& range, const std::vector<int>& fields, const CellSink& sink)
+{
+    const qint64 end = blockStart_ + block_.Size();
+    const qint64 stop = range.count < 0 ? end : std::min(end, position_ + range.count);
+    std::vector<Cell> wanted(fields.size());
+    bool goOn = true;
+    while (goOn && position_ < stop) {
+        const std::span<const Cell> cells = block_.At(position_ - blockStart_);
+        for (size_t i = 0; i < fields.size(); ++i)
+            wanted[i] = cells[size_t(fields[i])];
+        ++position_;
+        goOn = sink(wanted);
+    }
+}
+
+Outcome ForwardCursor::ReadOn(const ReadRange& range, const std::vector<int>& fields, const CellSink& sink)
+{
     qint64 done = 0;
     bool isStopped = false;
-    const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;
-    outcome = Walk(fields, [&](std::span<const Cell> cells) {
+    Outcome outcome = Walk(fields, [&](std::span<const Cell> cells) {
         ++done;
         isStopped = !sink(cells) || done == range.count;
         return !isStopped;
     });
     position_ += done;
     if (outcome.Ok() && !isStopped) {
-        block_.clear();
+        block_.Clear();
         blockStart_ = position_;
         blockIsLast_ = true;
-    } else if (outcome.Ok() && AtEnd() && !blockIsLast_) {
+    } else if (outcome.Ok() && AtEnd()) {
         outcome = FetchBlock();
     }
-    if (outcome.Ok())
-        outcome = transaction.End();
     return outcome;
 }
 

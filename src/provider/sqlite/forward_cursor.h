@@ -1,6 +1,7 @@
 #pragma once
 
 #include "provider/sqlite/database_file.h"
+#include "provider/sqlite/kept_records.h"
 #include "provider/sqlite/plan.h"
 #include "provider/sqlite/result_cursor.h"
 
@@ -10,7 +11,8 @@
 namespace mirel::sqlite {
 
 // Walks a result once, from its first record to its end. Holds a block of records at a time, so that no
-// statement is left running between two calls.
+// statement is left running between two calls; of a result that has to be worked out before it yields its first
+// record (sorted, grouped) it holds all that memory allows, so that the work is done once.
 class ForwardCursor : public ResultCursor {
 public:
     ForwardCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan);
@@ -19,7 +21,7 @@ public:
     std::span<const ResultField> Fields() const override { return plan_.fields; }
 
     bool AtBegin() const override { return false; }
-    bool AtEnd() const override { return position_ >= blockStart_ + qint64(block_.size()); }
+    bool AtEnd() const override { return position_ >= blockStart_ + block_.Size(); }
     qint64 Position() const override { return AtEnd() ? -1 : position_; }
     Outcome MoveFirst() override;
     Outcome MoveLast() override;
@@ -32,13 +34,17 @@ public:
 
 private:
     Outcome FetchBlock();
+    Outcome FetchFirst();
+    // In the order of one text, by an own sort. `sorted` stays false when it is too much for memory.
+    Outcome FetchByText(bool& sorted);
     Outcome FetchFurther(const CellSink& keep);
     Outcome Walk(const std::vector<int>& fields, const CellSink& sink);
-    void Keep(std::span<const Cell> cells);
+    Outcome ReadOn(const ReadRange& range, const std::vector<int>& fields, const CellSink& sink);
+    void ReadBlock(const ReadRange& range, const std::vector<int>& fields, const CellSink& sink);
 
     std::shared_ptr<DatabaseFile> file_;
     SelectPlan plan_;
-    std::vector<std::vector<Value>> block_;
+    KeptRecords block_;
     qint64 blockStart_ = 0;
     bool blockIsLast_ = false;
     qint64 position_ = 0;

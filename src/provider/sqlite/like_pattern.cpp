@@ -23,6 +23,15 @@ bool IsAscii(std::string_view text)
     return ((all | rest) & 0x8080808080808080) == 0;
 }
 
+// Whether a search for ASCII letters may miss one that the text has once its case is folded: two characters beyond
+// ASCII become one, the long s and the Kelvin sign.
+bool HidesAscii(std::string_view text)
+{
+    constexpr std::string_view kLongS = "\xC5\xBF";
+    constexpr std::string_view kKelvin = "\xE2\x84\xAA";
+    return text.find(kLongS) != std::string_view::npos || text.find(kKelvin) != std::string_view::npos;
+}
+
 constexpr bool IsSmall(char unit)
 {
     return unit >= 'a' && unit <= 'z';
@@ -166,15 +175,23 @@ LikePattern::LikePattern(std::string_view utf8)
     const QString pattern = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
     for (const QString& part : pattern.split(u'%')) {
         folded_.push_back(part);
+        const std::string bytes = part.toStdString();
         if (IsAscii(utf8))
-            ascii_.push_back(part.toStdString());
+            ascii_.push_back(bytes);
+        else if (IsAscii(bytes) && bytes.size() > probe_.size())
+            probe_ = bytes;
     }
 }
 
 bool LikePattern::Matches(std::string_view utf8) const
 {
-    if (!ascii_.empty() && IsAscii(utf8))
-        return MatchesParts(utf8, ascii_);
+    // Letters beyond ASCII leave the others alone, but for a few.
+    if ((!ascii_.empty() || !probe_.empty()) && !HidesAscii(utf8)) {
+        if (!ascii_.empty())
+            return MatchesParts(utf8, ascii_);
+        if (Find(utf8, probe_) < 0)
+            return false;
+    }
     const QString folded = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
     return MatchesParts(QStringView(folded), folded_);
 }

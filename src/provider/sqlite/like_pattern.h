@@ -19,6 +19,7 @@ public:
 private:
     // Its parts between the wildcards, in small letters. Most texts are ASCII and are compared as bytes.
     std::vector<std::string> ascii_; // empty when a part is not ASCII
+    std::string probe_;              // then a part that is, to look for before a text is folded
     std::vector<QString> folded_;
 };
 

@@ -37,9 +37,9 @@ Outcome OutcomeOfSqlite(int resultCode, const QString& path, const QString& reas
     case SQLITE_FORMAT:
         return {Hr::NotADatabase, StringText(Str::DatabaseIsDamaged, {path, reason})};
     case SQLITE_TOOBIG:
-        return {Hr::Overflow, reason};
+        return {Hr::Overflow, {}};
     case SQLITE_MISMATCH:
-        return {Hr::BadLiteral, reason};
+        return {Hr::BadLiteral, {}};
     case SQLITE_CONSTRAINT:
         return {Hr::IntegrityViolation, reason};
     case SQLITE_ERROR:

@@ -42,10 +42,12 @@ struct SelectPlan {
     QByteArray group; // "GROUP BY … HAVING …" or empty
     std::vector<PlannedOrder> order;
     bool distinct = false;
-    bool keyed = true; // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
+    bool isAggregated = false; // groups, or a total
+    bool keyed = true;         // false: DISTINCT, GROUP BY, aggregates, expressions only, a source without row ids
     // The one source that all columns come from and that can be written; -1: none. Fields without a `column`
     // (expressions over that source) cannot be written even so.
     int updatableSource = -1;
+    QString readOnlyReason; // for people: why no source can be written; empty when one can
 };
 
 // INSERT, UPDATE … SET, DELETE FROM: complete SQL.

@@ -23,7 +23,7 @@ int FieldSize(FieldType type, int declared)
     case FieldType::YesNo:
         return 2;
     case FieldType::Integer:
-        return 4;
+        return declared == kWideIntegerSize ? declared : 4;
     case FieldType::Double:
     case FieldType::Date:
         return 8;
@@ -71,6 +71,7 @@ private:
     void PlanGroup(const Select& select, SelectPlan& plan);
     void PlanOrder(const Select& select, SelectPlan& plan);
     void PlanUse(const Select& select, SelectPlan& plan) const;
+    QString WhyReadOnly(const SelectPlan& plan, const std::vector<bool>& used) const;
     ResultField FieldOf(const SelectColumn& column) const;
 
     const Schema& schema_;
@@ -78,15 +79,17 @@ private:
     SqlWriter writer_;
 };
 
-PlanFailure TooLong()
-{
-    return {Hr::SyntaxError, StringText(Str::StatementTooLong)};
-}
-
 PlanResult Planner::Finish(sqlite::Plan plan) const
 {
-    if (!writer_.Fits())
-        return TooLong();
+    switch (writer_.HowItFits()) {
+    case SqlWriter::Fit::Fits:
+        break;
+    case SqlWriter::Fit::TooDeep:
+        return PlanFailure{Hr::SyntaxError,
+                           StringText(Str::SyntaxTooDeep, {QString::number(writer_.TooDeepAt() + 1)})};
+    case SqlWriter::Fit::TooLong:
+        return PlanFailure{Hr::SyntaxError, StringText(Str::StatementTooLong)};
+    }
     return plan;
 }
 
@@ -156,10 +159,15 @@ ResultField Planner::FieldOf(const SelectColumn& column) const
     const Expr& expression = column.expression;
     if (expression.operation != Operation::Column) {
         const QString& name = column.alias.isEmpty() ? column.name.text : column.alias;
-        return {name, expression.type, FieldSize(expression.type, -1), {}, {}};
+        ResultField field{name, expression.type, FieldSize(expression.type, -1), {}, {}};
+        const bool isOperand = BindingOf(expression.operation) >= Binding::Text;
+        field.expression = isOperand ? column.name.text : u'(' + column.name.text + u')';
+        return field;
     }
-    const Table& table = *checker_.Sources()[size_t(expression.source)].table;
-    ResultField field = ResultFieldOf(table, table.columns[size_t(expression.column)]);
+    const Source& source = checker_.Sources()[size_t(expression.source)];
+    ResultField field = ResultFieldOf(*source.table, source.table->columns[size_t(expression.column)]);
+    field.source = source.name;
+    field.isJoined = checker_.Sources().size() > 1;
     if (!column.alias.isEmpty())
         field.name = column.alias;
     return field;
@@ -213,19 +221,34 @@ void Planner::PlanUse(const Select& select, SelectPlan& plan) const
     const auto isColumn = [](const ResultField& field) { return !field.column.isEmpty(); };
     const auto hasRowId = [](const PlannedSource& source) { return !source.rowId.isEmpty(); };
     plan.distinct = select.distinct;
+    plan.isAggregated = checker_.IsAggregated();
     plan.keyed = !select.distinct && !checker_.IsAggregated() && std::ranges::any_of(plan.fields, isColumn) &&
                  std::ranges::all_of(plan.sources, hasRowId);
-    if (!plan.keyed)
-        return;
     std::vector<bool> used(plan.sources.size());
     for (const SelectColumn& column : select.columns)
         CollectSources(column.expression, used);
+    plan.readOnlyReason = WhyReadOnly(plan, used);
+    if (plan.readOnlyReason.isEmpty())
+        plan.updatableSource = int(std::ranges::find(used, true) - used.begin());
+}
+
+// `used`: the sources that the columns read from.
+QString Planner::WhyReadOnly(const SelectPlan& plan, const std::vector<bool>& used) const
+{
+    if (plan.distinct)
+        return StringText(Str::DistinctIsReadOnly);
+    if (checker_.IsAggregated())
+        return StringText(Str::GroupsAreReadOnly);
+    for (const Source& source : checker_.Sources()) {
+        if (source.table->rowId.isEmpty() && !source.table->writable)
+            return ReadOnlyReason(*source.table);
+    }
+    if (!plan.keyed)
+        return StringText(Str::ComputedIsReadOnly);
     if (std::ranges::count(used, true) != 1)
-        return;
-    const auto only = std::ranges::find(used, true) - used.begin();
-    const Source& source = checker_.Sources()[size_t(only)];
-    if (source.table->writable && !source.optional)
-        plan.updatableSource = int(only);
+        return StringText(Str::JoinIsReadOnly);
+    const Source& source = checker_.Sources()[size_t(std::ranges::find(used, true) - used.begin())];
+    return source.optional ? StringText(Str::JoinIsReadOnly) : ReadOnlyReason(*source.table);
 }
 
 // A value that is only known as the statement runs is held against its column then: refused, never cut.

@@ -46,9 +46,8 @@ Outcome RecordWriter::Convert(const FieldChange& change, Value& converted) const
 {
     const ResultField& field = fields_[size_t(change.field)];
     if (field.column.isEmpty())
-        return {Hr::ReadOnly, {}};
-    const int size = field.type == FieldType::Text || field.type == FieldType::VarBinary ? field.size : -1;
-    return {ConvertForColumn(change.value, field.type, size, converted), {}};
+        return {Hr::ReadOnly, StringText(Str::ColumnIsComputed, {field.name})};
+    return {ConvertForColumn(change.value, field.type, field.size, converted), {}};
 }
 
 Outcome RecordWriter::ConvertAll(std::span<const FieldChange> values, std::vector<Value>& converted) const

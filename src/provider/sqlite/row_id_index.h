@@ -39,7 +39,6 @@ public:
     std::optional<qint64> PositionOf(qint64 rowId) const;
     // A row id at or below the given one, and how many records stand in front of it.
     std::pair<qint64, qint64> SampleBefore(qint64 rowId) const;
-    qint64 LastRowId() const { return last_; }
 
     // Both once complete. False when the row id lies among the others, where no place can be made for it.
     [[nodiscard]] bool Append(qint64 rowId);

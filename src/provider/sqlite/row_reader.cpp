@@ -3,6 +3,7 @@
 #include "provider/dialect/column_value.h"
 #include "provider/sqlite/date_forms.h"
 
+#include <cstring>
 #include <numeric>
 
 namespace mirel::sqlite {
@@ -14,6 +15,31 @@ Cell TextOf(sqlite3_value* value)
 {
     const auto* text = reinterpret_cast<const char*>(sqlite3_value_text(value));
     return Cell::OfText({text ? text : "", size_t(sqlite3_value_bytes(value))});
+}
+
+bool IsAscii(std::string_view text)
+{
+    constexpr quint64 kHighBits = 0x8080808080808080;
+    quint64 seen = 0;
+    size_t at = 0;
+    for (; at + sizeof(quint64) <= text.size(); at += sizeof(quint64)) {
+        quint64 word = 0;
+        std::memcpy(&word, text.data() + at, sizeof word);
+        seen |= word;
+    }
+    for (; at < text.size(); ++at)
+        seen |= quint8(text[at]);
+    return (seen & kHighBits) == 0;
+}
+
+// A text whose bytes are no UTF-8 comes with a replacement character for each fault, everywhere alike.
+Cell WithValidText(const Cell& cell, QByteArray& repaired)
+{
+    const QByteArrayView bytes(cell.bytes.data(), qsizetype(cell.bytes.size()));
+    if (cell.kind != Cell::Kind::Text || IsAscii(cell.bytes) || bytes.isValidUtf8())
+        return cell;
+    repaired = QString::fromUtf8(bytes).toUtf8();
+    return Cell::OfText({repaired.constData(), size_t(repaired.size())});
 }
 
 Cell BinaryOf(sqlite3_value* value)
@@ -103,7 +129,7 @@ RowReader::RowReader(std::span<const ResultField> result, std::span<const int> f
     : cells_(fields.size())
 {
     for (size_t i = 0; i < fields.size(); ++i)
-        slots_.push_back({layout == Layout::Whole ? fields[i] : int(i), result[size_t(fields[i])].type, {}});
+        slots_.push_back({layout == Layout::Whole ? fields[i] : int(i), result[size_t(fields[i])].type, {}, {}});
 }
 
 std::span<const Cell> RowReader::Read(sqlite3_stmt* row)
@@ -114,6 +140,11 @@ std::span<const Cell> RowReader::Read(sqlite3_stmt* row)
 }
 
 Cell RowReader::ReadSlot(Slot& slot, sqlite3_stmt* row)
+{
+    return WithValidText(ReadStored(slot, row), slot.repaired);
+}
+
+Cell RowReader::ReadStored(Slot& slot, sqlite3_stmt* row)
 {
     sqlite3_value* value = sqlite3_column_value(row, slot.column);
     switch (slot.type) {

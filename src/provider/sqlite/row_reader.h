@@ -31,10 +31,12 @@ private:
     struct Slot {
         int column;
         FieldType type;
-        StoredDate date; // where a date in another form is written anew
+        StoredDate date;     // a date that the file holds in another form
+        QByteArray repaired; // a text that the file holds in no UTF-8
     };
 
     static Cell ReadSlot(Slot& slot, sqlite3_stmt* row);
+    static Cell ReadStored(Slot& slot, sqlite3_stmt* row);
 
     std::vector<Slot> slots_;
     std::vector<Cell> cells_;

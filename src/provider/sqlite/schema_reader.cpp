@@ -30,6 +30,11 @@ private:
     Outcome ReadIndexes(dialect::Table& table);
     Outcome ReadParts(dialect::Index& index);
     void ChooseRowId(dialect::Table& table) const;
+    // Exactly so: a file may have a table of its own whose name differs in the case of a letter.
+    bool IsCatalogName(const QString& name) const
+    {
+        return std::ranges::find(schema_.tables, name, &dialect::Table::name) != schema_.tables.end();
+    }
 
     DatabaseFile& file_;
     dialect::Schema& schema_;
@@ -63,13 +68,14 @@ Outcome SchemaReader::Read()
     const Outcome outcome = ForEachRow("PRAGMA main.table_list", [&](const Statement& row) {
         enum { Schema, Name, Type, ColumnCount, WithoutRowId };
         const QString name = row.Text(Name);
-        if (row.Text(Schema) != u"main" || !IsText(row, Name) || schema_.FindTable(name) ||
+        if (row.Text(Schema) != u"main" || !IsText(row, Name) || IsCatalogName(name) ||
             name.startsWith(u"sqlite_", Qt::CaseInsensitive)) {
             return;
         }
         dialect::Table table{name, name, file_.Ids().OfTable(name), {}, {}, {}, false, false};
         const bool isPlain = row.Text(Type) == u"table";
-        table.writable = isPlain && row.Integer(WithoutRowId) == 0;
+        table.writable = isPlain && row.Integer(WithoutRowId) == 0 && dialect::StampOfTable(name).isEmpty();
+        table.isView = row.Text(Type) == u"view";
         tables.push_back(std::move(table));
     });
     if (!outcome.Ok())
@@ -98,8 +104,9 @@ Outcome SchemaReader::ReadColumns(dialect::Table& table)
         const QString name = row.Text(Name);
         const DeclaredType declared = ReadDeclaredType(row.Text(Type));
         const bool foreignDates = declared.type == FieldType::Date && !(isOurs_ && declared.own);
-        table.columns.push_back(
-            {name, declared.type, declared.size, file_.Ids().OfField(table.name, name), foreignDates});
+        const bool isWide = declared.type == FieldType::Integer && !(isOurs_ && declared.own);
+        const int size = isWide ? kWideIntegerSize : declared.size;
+        table.columns.push_back({name, declared.type, size, file_.Ids().OfField(table.name, name), foreignDates});
     });
 }
 

@@ -13,7 +13,8 @@ namespace {
 
 // SQLite's parser keeps 100 symbols aside; a statement around the expression takes some of them.
 constexpr int kMaxWaiting = 80;
-constexpr qsizetype kMaxLength = 16 << 20;
+// Of all that one writer writes: a memo of 16 million characters goes in whole, whatever they are.
+constexpr qsizetype kMaxLength = 160 << 20;
 
 struct FunctionSql {
     Function function;
@@ -42,7 +43,7 @@ constexpr std::array kFunctions = {
     FunctionSql{Function::Absolute, "abs(%1)"},
     FunctionSql{Function::Whole, "CAST(floor(%1) AS INTEGER)"},
     FunctionSql{Function::Coalesce, "coalesce(%*)"},
-    FunctionSql{Function::Choose, "iif(%*)"},
+    FunctionSql{Function::Choose, ""}, // see Choice
     FunctionSql{Function::Year, "CAST(strftime('%Y',%1) AS INTEGER)"},
     FunctionSql{Function::Month, "CAST(strftime('%m',%1) AS INTEGER)"},
     FunctionSql{Function::Day, "CAST(strftime('%d',%1) AS INTEGER)"},
@@ -101,13 +102,17 @@ QByteArray QuoteText(QStringView text)
 // Counts what waits on SQLite's parser stack while an operand is written.
 class SqlWriter::Deeper {
 public:
-    Deeper(SqlWriter& writer, int waiting)
+    Deeper(SqlWriter& writer, int waiting, qsizetype at)
         : writer_(writer)
         , waiting_(waiting)
     {
         writer_.waiting_ += waiting_;
-        if (writer_.waiting_ > kMaxWaiting || writer_.sql_.size() > kMaxLength)
-            writer_.fits_ = false;
+        if (writer_.waiting_ > kMaxWaiting && writer_.fit_ == Fit::Fits) {
+            writer_.fit_ = Fit::TooDeep;
+            writer_.tooDeepAt_ = at;
+        } else if (writer_.written_ + writer_.sql_.size() > kMaxLength) {
+            writer_.fit_ = Fit::TooLong;
+        }
     }
     ~Deeper() { writer_.waiting_ -= waiting_; }
     Q_DISABLE_COPY_MOVE(Deeper)
@@ -122,14 +127,15 @@ QByteArray SqlWriter::Write(const Expr& expression)
     sql_.clear();
     waiting_ = 0;
     Node(expression);
+    written_ += sql_.size();
     return std::exchange(sql_, {});
 }
 
 void SqlWriter::Operand(const Expr& expression, Binding least, int waiting)
 {
     const bool bare = SqlBinding(expression) >= least;
-    const Deeper deeper(*this, waiting + (bare ? 0 : 1));
-    if (!fits_)
+    const Deeper deeper(*this, waiting + (bare ? 0 : 1), expression.place.begin);
+    if (fit_ != Fit::Fits)
         return;
     if (!bare)
         sql_ += '(';
@@ -220,9 +226,7 @@ void SqlWriter::Binary(const Expr& expression)
     case Operation::Join:
         return Joined(expression);
     case Operation::Concat: // binds tighter here than in the dialect
-        Shown(expression.arguments.front(), 0);
-        sql_ += " || ";
-        return Shown(expression.arguments.back(), 2);
+        return Concatenated(expression);
     case Operation::Add:
     case Operation::Subtract:
         return Sum(expression);
@@ -274,7 +278,7 @@ void SqlWriter::Chain(std::span<const Expr* const> parts, Operation operation)
     const auto rest = parts.subspan(half);
     if (rest.size() == 1)
         return Operand(*rest.front(), least, 2);
-    const Deeper deeper(*this, 3);
+    const Deeper deeper(*this, 3, rest.front()->place.begin);
     sql_ += '(';
     Chain(rest, operation);
     sql_ += ')';
@@ -283,7 +287,7 @@ void SqlWriter::Chain(std::span<const Expr* const> parts, Operation operation)
 void SqlWriter::Like(const Expr& expression)
 {
     sql_ += expression.operation == Operation::NotLike ? "NOT " : "";
-    const Deeper deeper(*this, expression.operation == Operation::NotLike ? 1 : 0);
+    const Deeper deeper(*this, expression.operation == Operation::NotLike ? 1 : 0, expression.place.begin);
     sql_ += kLikeFunction;
     sql_ += '(';
     List(expression.arguments.begin(), expression.arguments.end());
@@ -308,13 +312,36 @@ void SqlWriter::Between(const Expr& expression)
     Operand(*++argument, Binding::Text, 4);
 }
 
+// A chain of one operation in the order of its operands, however it is bracketed: joining texts is associative.
+void SqlWriter::CollectTerms(const Expr& expression, Operation operation, std::vector<const Expr*>& terms)
+{
+    for (const Expr& argument : expression.arguments) {
+        if (argument.operation == operation)
+            CollectTerms(argument, operation, terms);
+        else
+            terms.push_back(&argument);
+    }
+}
+
+void SqlWriter::Concatenated(const Expr& expression)
+{
+    std::vector<const Expr*> terms;
+    CollectTerms(expression, Operation::Concat, terms);
+    for (const Expr* term : terms) {
+        sql_ += term == terms.front() ? "" : " || ";
+        Shown(*term, term == terms.front() ? 0 : 2);
+    }
+}
+
 void SqlWriter::Joined(const Expr& expression)
 {
-    sql_ += "coalesce(";
-    Shown(expression.arguments.front(), 3);
-    sql_ += ",'')||coalesce(";
-    Shown(expression.arguments.back(), 5);
-    sql_ += ",'')";
+    std::vector<const Expr*> terms;
+    CollectTerms(expression, Operation::Join, terms);
+    for (const Expr* term : terms) {
+        sql_ += term == terms.front() ? "coalesce(" : "||coalesce(";
+        Shown(*term, term == terms.front() ? 3 : 5);
+        sql_ += ",'')";
+    }
 }
 
 // An operand of a joined text.
@@ -358,8 +385,30 @@ void SqlWriter::Negated(const Expr& expression)
     Operand(operand, Binding::Operand, 1); // two signs in a row would begin a comment
 }
 
+// A choice in the place of the last argument is one more WHEN of the same CASE, so that a long ladder of them is
+// not deep.
+void SqlWriter::Choice(const Expr& expression)
+{
+    const auto isChoice = [](const Expr& candidate) {
+        return candidate.operation == Operation::Call && candidate.function == Function::Choose;
+    };
+    sql_ += "CASE";
+    const Expr* choice = &expression;
+    for (; isChoice(*choice); choice = &choice->arguments.back()) {
+        sql_ += " WHEN ";
+        Operand(choice->arguments.front(), Binding::None, 4);
+        sql_ += " THEN ";
+        Operand(*std::next(choice->arguments.begin()), Binding::None, 6);
+    }
+    sql_ += " ELSE ";
+    Operand(*choice, Binding::None, 4);
+    sql_ += " END";
+}
+
 void SqlWriter::Call(const Expr& expression)
 {
+    if (expression.function == Function::Choose)
+        return Choice(expression);
     if (expression.distinct) {
         const QByteArray pattern = kFunctions[size_t(expression.function)].pattern;
         return Fill(QByteArray(pattern).replace('(', "(DISTINCT ").constData(), expression);
@@ -373,7 +422,7 @@ void SqlWriter::Fill(const char* pattern, const Expr& expression)
     for (const char* at = pattern; *at; ++at) {
         nesting += *at == '(' ? 1 : *at == ')' ? -1 : 0;
         const char next = *at == '%' ? at[1] : '\0';
-        const Deeper deeper(*this, 4 * (nesting - 1));
+        const Deeper deeper(*this, 4 * (nesting - 1), expression.place.begin);
         if (next == '*') {
             List(expression.arguments.begin(), expression.arguments.end());
         } else if (next == '1' || next == '2') {

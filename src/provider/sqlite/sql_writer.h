@@ -5,6 +5,7 @@
 #include <QByteArray>
 
 #include <span>
+#include <vector>
 
 namespace mirel::sqlite {
 
@@ -25,8 +26,10 @@ public:
     }
 
     QByteArray Write(const dialect::Expr& expression);
-    // False once an expression nests deeper, or comes out longer, than SQLite is asked to read.
-    bool Fits() const { return fits_; }
+    // Whether all that was written is no deeper and no longer than SQLite is asked to read.
+    enum class Fit : quint8 { Fits, TooDeep, TooLong };
+    Fit HowItFits() const { return fit_; }
+    qsizetype TooDeepAt() const { return tooDeepAt_; } // in the statement, from 0
 
     static QByteArray Alias(size_t source) { return "t" + QByteArray::number(qulonglong(source)); }
 
@@ -43,18 +46,24 @@ private:
     void Like(const dialect::Expr& expression);
     void In(const dialect::Expr& expression);
     void Between(const dialect::Expr& expression);
+    static void CollectTerms(const dialect::Expr& expression, dialect::Operation operation,
+                             std::vector<const dialect::Expr*>& terms);
+    void Concatenated(const dialect::Expr& expression);
     void Joined(const dialect::Expr& expression);
     void Shown(const dialect::Expr& operand, int waiting);
     void Sum(const dialect::Expr& expression);
     void Negated(const dialect::Expr& expression);
+    void Choice(const dialect::Expr& expression);
     void Call(const dialect::Expr& expression);
     void Fill(const char* pattern, const dialect::Expr& expression);
     void List(std::list<dialect::Expr>::const_iterator first, std::list<dialect::Expr>::const_iterator last);
 
     const std::vector<dialect::Source>& sources_;
     QByteArray sql_;
-    int waiting_ = 0; // symbols that SQLite's parser has put aside at this point
-    bool fits_ = true;
+    int waiting_ = 0;       // symbols that SQLite's parser has put aside at this point
+    qsizetype written_ = 0; // bytes, by earlier calls of Write
+    qsizetype tooDeepAt_ = 0;
+    Fit fit_ = Fit::Fits;
 };
 
 } // namespace mirel::sqlite

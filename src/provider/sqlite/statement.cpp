@@ -29,19 +29,6 @@ Statement::~Statement()
     }
 }
 
-void Statement::BindText(int parameter, std::string_view utf8)
-{
-    // A null pointer would bind NULL.
-    const char* bytes = utf8.data() ? utf8.data() : "";
-    Keep(sqlite3_bind_text64(Get(), parameter, bytes, utf8.size(), SQLITE_STATIC, SQLITE_UTF8));
-}
-
-void Statement::BindBinary(int parameter, std::string_view bytes)
-{
-    const char* data = bytes.data() ? bytes.data() : "";
-    Keep(sqlite3_bind_blob64(Get(), parameter, data, bytes.size(), SQLITE_STATIC));
-}
-
 void Statement::Bind(int parameter, const Value& value)
 {
     const auto copied = [this, parameter](const QByteArray& bytes, auto bind) {
@@ -52,11 +39,13 @@ void Statement::Bind(int parameter, const Value& value)
     case ValueTag::Empty:
     case ValueTag::Null:
         return BindNull(parameter);
+    case ValueTag::Bool:
+        return Bind(parameter, qint64(value.ToBool()));
     case ValueTag::SmallInt:
     case ValueTag::Integer:
-    case ValueTag::Bool:
-        return Bind(parameter, qint64(value.ToInt()));
     case ValueTag::Double:
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            return Bind(parameter, *whole);
         return Bind(parameter, value.Number());
     case ValueTag::Date:
         if (const std::optional<StoredDate> date = StoredDateOf(value.Number())) {

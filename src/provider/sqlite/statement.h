@@ -39,9 +39,6 @@ public:
     void Bind(int parameter, qint64 number) { Keep(sqlite3_bind_int64(Get(), parameter, number)); }
     void Bind(int parameter, double number) { Keep(sqlite3_bind_double(Get(), parameter, number)); }
     void BindNull(int parameter) { Keep(sqlite3_bind_null(Get(), parameter)); }
-    // Borrowed: the bytes must stay until the statement is reset or bound anew.
-    void BindText(int parameter, std::string_view utf8);
-    void BindBinary(int parameter, std::string_view bytes);
     // A value that was converted for its column.
     void Bind(int parameter, const Value& value);
 

@@ -242,6 +242,8 @@ qint64 StaticCursor::RecordCount()
 
 bool StaticCursor::CountStep(int budgetMs)
 {
+    if (budgetMs < 0)
+        return rows_->IsComplete();
     const Outcome outcome = InRead([this, budgetMs] {
         Outcome taken = TakeUpChanges();
         return taken.Ok() ? rows_->Extend(kAllRecords, QDeadlineTimer(budgetMs)) : taken;

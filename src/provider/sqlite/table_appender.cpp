@@ -1,5 +1,6 @@
 #include "provider/sqlite/table_appender.h"
 
+#include "provider/dialect/structure_checker.h"
 #include "provider/sqlite/cell_checker.h"
 #include "provider/sqlite/plan.h"
 #include "provider/sqlite/record_feed.h"
@@ -139,8 +140,8 @@ std::unique_ptr<RecordAppender> OpenAppender(std::shared_ptr<DatabaseFile> file,
         outcome = {Hr::NoSuchTable, {}};
         return {};
     }
-    if (!target->writable) {
-        outcome = {Hr::ReadOnly, {}};
+    if (const std::optional<dialect::Failure> refused = dialect::RefuseChange(*target)) {
+        outcome = {refused->code, refused->context};
         return {};
     }
     std::vector<ResultField> fields;

@@ -1,4 +1,4 @@
-#include "provider/dialect/tree_text.h"
+#include "support/tree_text.h"
 
 #include "provider/dialect/column_types.h"
 
@@ -11,9 +11,9 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-QString Name(const QString& name)
+QString Name(QString name)
 {
-    return u'[' + name + u']';
+    return u'[' + name.replace(u']', u"]]"_s) + u']';
 }
 
 QString Name(const QString& table, const QString& name)
@@ -24,6 +24,12 @@ QString Name(const QString& table, const QString& name)
 QString Quoted(QString text)
 {
     return u'\'' + text.replace(u'\'', u"''"_s) + u'\'';
+}
+
+// The first of a function's names.
+QString NameOf(Function function)
+{
+    return std::ranges::find(Functions(), function, &FunctionDef::function)->name.toString();
 }
 
 QString Text(const Expr& expression);
@@ -76,7 +82,7 @@ QString Call(const Expr& expression)
     QString list = List(expression.arguments.begin(), expression.arguments.end());
     if (expression.distinct)
         list.insert(1, u"DISTINCT "_s);
-    return NameOf(expression.function).toString() + list;
+    return NameOf(expression.function) + list;
 }
 
 QString Between(const Expr& expression, const QString& words)
