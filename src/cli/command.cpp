@@ -10,6 +10,7 @@ namespace {
 
 constexpr std::array kDropOptions = {Opt::Yes};
 constexpr std::array kFormatOptions = {Opt::Format};
+constexpr std::array kQueryOptions = {Opt::Format, Opt::Yes};
 constexpr std::array kSqlOptions = {Opt::Format, Opt::Offset, Opt::Limit};
 constexpr std::array kImportOptions = {
     Opt::Table,         Opt::Create,    Opt::Columns,       Opt::Header,        Opt::Separator, Opt::Quote,
@@ -41,21 +42,22 @@ constexpr std::array kCommands = {
     CommandDef{"import", "DB FILE", "read a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
     CommandDef{"export",
                "DB [SOURCE] FILE",
-               "write a table, a SELECT or a saved query as a CSV file (-: to standard output)",
+               "export a table, a saved query or a SELECT as a CSV file (-: standard output)",
                kExportOptions,
                {},
                RunExport},
     CommandDef{"aggregate",
                "DB SOURCE FIELD sum|max|min|avg",
-               "sum up a field over all records of a table or a SELECT",
+               "compute a field's aggregate over all records of a table, a saved query or a SELECT",
                {},
                {},
                RunAggregateCommand},
-    CommandDef{"update-all", "DB SOURCE FIELD VALUE", "set a field of all records of a table or a SELECT",
-               kDropOptions, kDropOptions, RunUpdateAll},
-    CommandDef{"delete-all", "DB SOURCE", "delete all records of a table or a SELECT", kDropOptions, kDropOptions,
-               RunDeleteAll},
-    CommandDef{"eval", "EXPRESSION", "the value of an expression", kEvalOptions, {}, RunEval, "text|json"},
+    CommandDef{"update-all", "DB SOURCE FIELD VALUE",
+               "set a field in all records of a table, a saved query or a SELECT", kDropOptions, kDropOptions,
+               RunUpdateAll},
+    CommandDef{"delete-all", "DB SOURCE", "delete all records of a table, a saved query or a SELECT", kDropOptions,
+               kDropOptions, RunDeleteAll},
+    CommandDef{"eval", "EXPRESSION", "evaluate an expression", kEvalOptions, {}, RunEval, "text|json"},
     CommandDef{"forms list",
                "DB",
                "list the forms with their tables and numbers of controls",
@@ -87,7 +89,7 @@ constexpr std::array kCommands = {
                RunQueriesList},
     CommandDef{"queries save", "DB NAME STATEMENT", "save a statement as a query", kSaveOptions, kImportNeeds,
                RunQueriesSave},
-    CommandDef{"queries run", "DB NAME", "print the records of a saved query", kFormatOptions, {}, RunQueriesRun},
+    CommandDef{"queries run", "DB NAME", "print the records of a saved query", kQueryOptions, {}, RunQueriesRun},
     CommandDef{"queries delete", "DB NAME", "delete a saved query", kDropOptions, kDropOptions, RunQueriesDelete},
     CommandDef{"config get", "SECTION KEY", "print a setting", {}, {}, RunConfigGet},
     CommandDef{"config set", "SECTION KEY VALUE", "change a setting", {}, {}, RunConfigSet},

@@ -3,6 +3,7 @@
 #include "cli/commands.h"
 #include "cli/run.h"
 #include "cli/sql_command.h"
+#include "data/db_recordset.h"
 #include "resources/string_table.h"
 #include "tableview/saved_queries.h"
 
@@ -80,6 +81,10 @@ ExitStatus RunQueriesRun(Run& run)
 }
 
 ExitStatus RunQueriesDelete(Run& run)
+    if (!OnlyReads(*statement) && !run.Args().Has(Opt::Yes)) {
+        run.Prompt().Show({Str::CliQueryChanges, {name}});
+        return ExitStatus::BadArguments;
+    }
 {
     const QString name = run.Argument(1);
     if (!OpenStore(run) || !SavedQueries(run.Session().Store(), run.Prompt()).Remove(name))

@@ -1,5 +1,6 @@
 #include "cli/run.h"
 
+#include "provider/dialect/parser.h"
 #include "resources/string_table.h"
 #include "tableview/record_browser.h"
 
@@ -94,7 +95,10 @@ QString Run::SourceOf(const QString& given)
 {
     QStringList tables;
     session_.ListTables(tables);
-    return tables.contains(given, Qt::CaseInsensitive) ? RecordBrowser::StatementOfTable(given) : given;
+    if (tables.contains(given, Qt::CaseInsensitive))
+        return RecordBrowser::StatementOfTable(given);
+    const QueryDef* query = dialect::BeginsAsStatement(given) ? nullptr : session_.Store().FindQuery(given);
+    return query ? query->text.Text() : given;
 }
 
 ExitStatus RunProgram(const QStringList& words, Output& output)

@@ -52,7 +52,8 @@ public:
     void WriteTiming() const;
     // What is wrong with the arguments, and how to get help.
     ExitStatus Refuse(const QString& fault) const;
-    // A table's name or a statement, as a recordset takes it; the name may stand there without its brackets.
+    // The statement for a source: the name of a table, which needs no brackets here, the name of a saved query, or
+    // the statement itself.
     QString SourceOf(const QString& given);
 
 private:

@@ -10,6 +10,10 @@
 
 namespace mirel {
 
+// Whether the statement yields records and does nothing else: a SELECT, or the bare name of a table. True also
+// for a text that does not parse: the provider then says what is wrong with it.
+bool OnlyReads(const QString& statement);
+
 // One open result: the rows of a table or of a SELECT, and a current position in them. Every statement of the
 // system runs through Open, those without rows as well.
 //
@@ -27,6 +31,10 @@ public:
     // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
     // with the full path `database`. CREATE and DROP DATABASE take an empty path.
     [[nodiscard]] bool Open(const QString& source, const QString& database, CursorType cursor, LockType lock);
+    // The same for a source: what is shown, exported, summed up or changed as a whole. That is a table or a
+    // SELECT; any other statement is refused before it runs (SyntaxError, with the reason as context).
+    [[nodiscard]] bool OpenSource(const QString& source, const QString& database, CursorType cursor,
+                                  LockType lock);
     void Close();
     bool IsOpen() const { return open_; }
 
@@ -81,6 +89,7 @@ private:
     std::unique_ptr<ProviderRecordset> cursor_;
     bool open_ = false;
     mutable Hr lastResult_ = Hr::Ok;
+    bool isNoSource_ = false; // OpenSource refused the statement
 };
 
 } // namespace mirel
