@@ -71,7 +71,7 @@ bool Run::OpenDatabase(const QString& file)
 std::unique_ptr<RecordWriter> Run::MakeWriter()
 {
     const OutputFormat format = FormatOfName(arguments_.Text(Opt::Format)).value_or(OutputFormat::Table);
-    return MakeRecordWriter(format, output_, Settings(Profile(folder_.ProfileFile())).Words());
+    return MakeRecordWriter(format, output_, Words());
 }
 
 void Run::WriteTiming() const
@@ -91,11 +91,16 @@ ExitStatus Run::Refuse(const QString& fault) const
     return RefuseArguments(fault, arguments_.command);
 }
 
-QString Run::SourceOf(const QString& given)
+bool Run::IsTable(const QString& name)
 {
     QStringList tables;
     session_.ListTables(tables);
-    if (tables.contains(given, Qt::CaseInsensitive))
+    return tables.contains(name, Qt::CaseInsensitive);
+}
+
+QString Run::SourceOf(const QString& given)
+{
+    if (IsTable(given))
         return RecordBrowser::StatementOfTable(given);
     const QueryDef* query = dialect::BeginsAsStatement(given) ? nullptr : session_.Store().FindQuery(given);
     return query ? query->text.Text() : given;

@@ -47,11 +47,15 @@ public:
     Output& Out() { return output_; }
     Timing& Times() { return timing_; }
 
+    // The user's words for Yes and No.
+    YesNoWords Words() const { return Settings(folder_.OpenProfile()).Words(); }
     // In the format that --format names, with the user's words for Yes and No.
     std::unique_ptr<RecordWriter> MakeWriter();
     void WriteTiming() const;
     // What is wrong with the arguments, and how to get help.
     ExitStatus Refuse(const QString& fault) const;
+    // Whether that is the name of one of the user's tables.
+    bool IsTable(const QString& name);
     // The statement for a source: the name of a table, which needs no brackets here, the name of a saved query, or
     // the statement itself.
     QString SourceOf(const QString& given);

@@ -84,7 +84,12 @@ private:
 
 ExprNumberChars::ExprNumberChars(double number)
 {
+    constexpr double kBeyondIntegers = 9.2e18;
     const bool whole = number == std::trunc(number);
+    if (whole && std::abs(number) < kBeyondIntegers) { // most are, and integers are quick to write
+        length_ = std::to_chars(characters_.begin(), characters_.end(), qint64(number)).ptr - characters_.data();
+        return;
+    }
     const auto written = std::to_chars(characters_.begin(), characters_.end(), number + 0.0,
                                        std::chars_format::fixed, whole ? 0 : 6);
     const char* end = written.ptr;

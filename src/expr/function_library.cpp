@@ -459,4 +459,12 @@ void EvaluateFunction(ExprNode& node, Evaluation& evaluation)
     function.evaluate(node, evaluation);
 }
 
+bool AsksForRecordCount(const ExprNode& tree)
+{
+    const bool asks = tree.function && tree.function->evaluate == FnRecCount;
+    return asks || std::ranges::any_of(tree.args, [](const ExprTree& argument) {
+               return argument && AsksForRecordCount(*argument);
+           });
+}
+
 } // namespace mirel

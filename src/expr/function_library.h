@@ -36,6 +36,9 @@ private:
 };
 
 std::span<const FunctionDef> Functions();
-const FunctionDef* FindFunction(QStringView name); // in any case; null: there is none
+const FunctionDef* FindFunction(QStringView name); // in any case; null: unknown
+
+// Whether the tree asks how many records there are. Counting takes time, so it is left out where nothing asks.
+bool AsksForRecordCount(const ExprNode& tree);
 
 } // namespace mirel
