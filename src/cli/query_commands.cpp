@@ -56,6 +56,10 @@ ExitStatus RunQueriesSave(Run& run)
     SavedQueries queries(run.Session().Store(), run.Prompt());
     const QString name = run.Argument(1);
     const QString statement = run.Argument(2);
+    if (name.trimmed().isEmpty()) {
+        run.Prompt().Show({Str::CliQueryWithoutName, {}});
+        return ExitStatus::Failed;
+    }
     // --yes answers for an unbalanced statement; what replaces a query is --replace alone.
     if (!run.Args().Has(Opt::Replace) && queries.Knows(name)) {
         run.Prompt().Show({Str::CliQueryExists, {name}});
@@ -77,14 +81,14 @@ ExitStatus RunQueriesRun(Run& run)
         run.Prompt().Show({Str::NoSuchQuery, {name}});
         return ExitStatus::Failed;
     }
-    return RunStatement(run, *statement) ? ExitStatus::Done : ExitStatus::Failed;
-}
-
-ExitStatus RunQueriesDelete(Run& run)
     if (!OnlyReads(*statement) && !run.Args().Has(Opt::Yes)) {
         run.Prompt().Show({Str::CliQueryChanges, {name}});
         return ExitStatus::BadArguments;
     }
+    return RunStatement(run, *statement) ? ExitStatus::Done : ExitStatus::Failed;
+}
+
+ExitStatus RunQueriesDelete(Run& run)
 {
     const QString name = run.Argument(1);
     if (!OpenStore(run) || !SavedQueries(run.Session().Store(), run.Prompt()).Remove(name))

@@ -14,10 +14,10 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-ExitStatus RefuseArguments(const QString& fault, const CommandDef* command)
+ExitStatus RefuseArguments(const ArgumentFault& fault)
 {
-    const QString name = command ? u' ' + QString::fromLatin1(command->name) : QString();
-    WriteMessage(fault + u'\n' + StringText(Str::CliSeeHelp, {name}));
+    const QString words = fault.helpOn.isEmpty() ? QString() : u' ' + fault.helpOn;
+    WriteMessage(fault.text + u'\n' + StringText(Str::CliSeeHelp, {words}));
     return ExitStatus::BadArguments;
 }
 
@@ -88,7 +88,7 @@ void Run::WriteTiming() const
 
 ExitStatus Run::Refuse(const QString& fault) const
 {
-    return RefuseArguments(fault, arguments_.command);
+    return RefuseArguments({fault, QString::fromLatin1(arguments_.command->name)});
 }
 
 bool Run::IsTable(const QString& name)
@@ -108,13 +108,12 @@ QString Run::SourceOf(const QString& given)
 
 ExitStatus RunProgram(const QStringList& words, Output& output)
 {
-    QString fault;
-    const CommandDef* command = nullptr;
-    std::optional<Arguments> arguments = ParseArguments(words, fault, command);
+    ArgumentFault fault;
+    std::optional<Arguments> arguments = ParseArguments(words, fault);
     if (!arguments)
-        return RefuseArguments(fault, command);
+        return RefuseArguments(fault);
     if (arguments->Has(Opt::Help)) {
-        output.WriteText(command ? CommandHelp(*command) : ProgramHelp());
+        output.WriteText(HelpFor(*arguments));
         return EndOutput(output, ExitStatus::Done);
     }
     if (arguments->Has(Opt::Version)) {

@@ -3,6 +3,7 @@
 #include "cli/run.h"
 #include "cli/statement_splitter.h"
 #include "data/provider_error.h"
+#include "resources/string_table.h"
 
 #include <QFile>
 
@@ -39,12 +40,16 @@ bool WriteRecords(Run& run, DbRecordset& records)
 bool RunScript(Run& run, QIODevice& script)
 {
     StatementSplitter splitter;
-    while (!script.atEnd()) {
+    for (qint64 number = 1; !script.atEnd(); ++number) {
         QByteArray line = script.readLine();
         while (line.endsWith('\n') || line.endsWith('\r'))
             line.chop(1);
         if (WasInterrupted())
             return false;
+        if (!line.isValidUtf8()) { // stored as U+FFFD it could never be told from what was meant
+            run.Prompt().Show({Str::CliNotUtf8Line, {QString::number(number)}});
+            return false;
+        }
         const std::optional<QString> statement = splitter.AddLine(QString::fromUtf8(line));
         if (statement && !statement->isEmpty() && !RunStatement(run, *statement))
             return false;
@@ -64,7 +69,7 @@ bool RunStatement(Run& run, const QString& statement)
                       (records.Fields().empty() || WriteRecords(run, records));
     if (!done)
         ReportProviderError(run.Prompt(), &records, records.LastResult());
-    // Whoever feeds a script may wait for the records before going on.
+    // The program that feeds a script may wait for the records before it goes on.
     return done && run.Out().Flush() && !WasInterrupted();
 }
 

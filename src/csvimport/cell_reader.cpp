@@ -170,9 +170,11 @@ Hr CellReader::ReadDate(std::string_view text, Cell& cell)
         return Hr::Ok;
     }
     // Every locale takes ISO; most files have it, and the locale's own reader is slow.
-    const std::optional<double> date = dates_.order == DateOrder::Locale && IsIsoDate(text)
-                                           ? OleDateFromStored(text)
-                                           : ParseDateFields(dates_, text);
+    std::optional<double> date = dates_.order == DateOrder::Locale && IsIsoDate(text)
+                                     ? OleDateFromStored(text)
+                                     : ParseDateFields(dates_, text);
+    if (!date)
+        date = ParseTimeFields(dates_, text); // an export writes no date for a time on the base date
     const std::optional<StoredDate> stored = date ? StoredDateOf(*date) : std::nullopt;
     if (!stored)
         return Hr::BadLiteral;

@@ -187,7 +187,7 @@ bool MatchInOrder(const QString& table, std::span<const ResultField> fields, int
         return Refuse(fault, Str::ImportMoreColumnsThanFields,
                       {QString::number(count), table, QString::number(fields.size())});
     columns.clear();
-    for (const ResultField& field : fields.first(size_t(count))) {
+    for (const ResultField& field : fields) {
         ImportColumn column;
         column.field = field.name;
         column.type = field.type;

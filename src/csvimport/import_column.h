@@ -44,7 +44,8 @@ ImportColumns NumberedColumns(int count);
 // their spelling and types.
 [[nodiscard]] bool MatchByName(const QString& table, std::span<const ResultField> fields, ImportColumns& columns,
                                UserMessage& fault);
-// The first of the file's `count` columns goes to the first field, and so on.
+// The file's columns go to the table's fields in order, one for each field, although the first line has only
+// `count` texts: later lines may have more. More texts than fields are refused.
 [[nodiscard]] bool MatchInOrder(const QString& table, std::span<const ResultField> fields, int count,
                                 ImportColumns& columns, UserMessage& fault);
 

@@ -266,6 +266,26 @@ std::optional<double> ParseDateFields(const DateFormat& format, std::string_view
     return OleDate(parts);
 }
 
+std::optional<double> ParseTimeFields(const DateFormat& format, std::string_view utf8)
+{
+    const auto isNumber = [](std::string_view field) {
+        return field.size() >= 1 && field.size() <= 2 &&
+               std::ranges::all_of(field, [](char byte) { return byte >= '0' && byte <= '9'; });
+    };
+    const Separator separator(format.timeSeparator);
+    std::string_view second = utf8;
+    const std::optional<std::string_view> hour = separator.CutField(second);
+    const std::optional<std::string_view> minute = hour ? separator.CutField(second) : std::nullopt;
+    if (format.order == DateOrder::Locale || !minute || !isNumber(*hour) || !isNumber(*minute) ||
+        !isNumber(second))
+        return {};
+    DateParts parts; // of the base date
+    parts.hour = FieldOrNone(LeadingNumber(*hour));
+    parts.minute = FieldOrNone(LeadingNumber(*minute));
+    parts.second = FieldOrNone(LeadingNumber(second));
+    return OleDate(parts);
+}
+
 bool ParseDateText(DateOrder order, QChar dateSeparator, QChar timeSeparator, QStringView text, QString& out)
 {
     const DateFormat format{order, dateSeparator.unicode(), timeSeparator.unicode()};

@@ -37,7 +37,12 @@ struct DateFormat {
 // This is the one for bulk work: in the orders 0 to 5 it makes no QString of the UTF-8 it is given.
 std::optional<double> ParseDateFields(const DateFormat& format, std::string_view utf8);
 
-// The same for one text: `out` becomes the date as the user's locale writes it. On false `out` is as it was.
+// Reads a time that stands alone, as FormatDateFields writes one on the base date: hour, minute and second, digits
+// only. Empty for anything else, and for DateOrder::Locale, whose own reader takes times.
+std::optional<double> ParseTimeFields(const DateFormat& format, std::string_view utf8);
+
+// ParseDateFields for one text: `out` becomes the date as the user's locale writes it. On false `out` is as it
+// was.
 [[nodiscard]] bool ParseDateText(DateOrder order, QChar dateSeparator, QChar timeSeparator, QStringView text,
                                  QString& out);
 

@@ -215,7 +215,7 @@ TEST_F(ResultProgram, TakesANegativeNumberForAValue)
     EXPECT_EQ(OnTable(u"update-all"_s, {u"Age"_s, u"-7"_s, u"--yes"_s}), (Ended{0, u"3\n"_s, {}}));
     EXPECT_EQ(OnTable(u"update-all"_s, {u"Price"_s, u"-.5"_s, u"--yes"_s}), (Ended{0, u"3\n"_s, {}}));
     EXPECT_EQ(Sql(u"SELECT DISTINCT Age,Price FROM T"_s), u"Age,Price\n-7,-0.5\n"_s);
-    EXPECT_EQ(Run({u"eval"_s, u"-5*2"_s}), (Ended{0, u"-10\n"_s, {}}));
+    EXPECT_EQ(Run({u"eval"_s, u"-5+3"_s}), (Ended{0, u"-2\n"_s, {}}));
     EXPECT_EQ(Run({u"eval"_s, u"--"_s, u"-ROUND(2.5,0)"_s}), (Ended{0, u"-3\n"_s, {}}));
 }
 
