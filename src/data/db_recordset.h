@@ -15,13 +15,13 @@ namespace mirel {
 bool OnlyReads(const QString& statement);
 
 // One open result: the rows of a table or of a SELECT, and a current position in them. Every statement of the
-// system runs through Open, those without rows as well.
+// system runs through Open, even those that return no rows.
 //
-// Positions count from 0. After Open the recordset stands on the first record, or at the end when there is
-// none. Field indexes count from 0 in the order of the result's columns.
+// Positions count from 0. After Open the first record is current, or the recordset is at its end if it has no
+// records. Field indexes count from 0 in the order of the result's columns.
 //
 // Owns its cursor and closes it when destroyed; the connection must outlive it. A call that fails returns false
-// and leaves the position where it was; LastResult() says why. Missing fields give neutral values.
+// and keeps the position; LastResult() says why. Missing fields give neutral values.
 class DbRecordset {
 public:
     explicit DbRecordset(DbConnection& connection);
@@ -50,7 +50,7 @@ public:
     int FieldSize(int index) const;         // -1: no such column, or no limit
     std::span<const ResultField> Fields() const;
 
-    // Moves past either end stop there and are no failure.
+    // A move past either end stops there and succeeds.
     [[nodiscard]] bool MoveFirst();
     [[nodiscard]] bool MoveLast();
     [[nodiscard]] bool MoveNext();
@@ -60,7 +60,8 @@ public:
     bool IsBof() const;
     qint64 Position() const; // -1 at either end
 
-    // See ProviderRecordset: a record's number in its table, and the way back to it. False when it is not there.
+    // See ProviderRecordset: a record's number in its table, and the way back to it. False when the record is
+    // gone.
     std::optional<qint64> RecordId() const;
     [[nodiscard]] bool MoveToRecord(qint64 id);
 
@@ -68,7 +69,7 @@ public:
     bool CountStep(int budgetMs); // true once the count is known
     quint64 Generation() const;   // grows when records may have changed or moved
 
-    // The current record's value; integer 0 when there is no such column, null at either end.
+    // The current record's value; integer 0 for a missing column, null at either end.
     Value FieldValue(int index) const;
     Value FieldValue(QStringView name) const;
     // The value as text: VariantText of it, with empty text for NULL.
@@ -84,12 +85,12 @@ public:
     [[nodiscard]] bool DeleteAll(const BulkProgress& progress);
 
 private:
-    bool Keep(Hr result) const; // remembers the result; true when it is no failure
+    bool Keep(Hr result) const; // remembers the result; true for success
 
     std::unique_ptr<ProviderRecordset> cursor_;
     bool open_ = false;
-    mutable Hr lastResult_ = Hr::Ok;
     bool isNoSource_ = false; // OpenSource refused the statement
+    mutable Hr lastResult_ = Hr::Ok;
 };
 
 } // namespace mirel

@@ -5,28 +5,29 @@
 
 namespace mirel {
 
-// Filters and sorts are rewrites of a SELECT's text, run again afterwards. These work on the text alone: what
-// they make of a statement that has clauses in another order, or none that they know, is for the provider to
-// judge.
+// Filters and sorts rewrite the text of a SELECT, which then runs again. These functions only see the text: if the
+// clauses of a statement are unknown or in another order, the provider judges what they make of
+// it.
 
-// Where `keyword` first stands as a whole word, case ignored: at the start or after a blank or tab, and followed
-// by the end, "(", a blank or a tab. Quoted text and names in brackets are skipped. -1: nowhere.
+// The first position of `keyword` as a whole word, ignoring case: at the start or after a blank or tab, and before
+// the end, "(", a blank or a tab. Skips quoted text and names in brackets. -1: not found.
 qsizetype KeywordPosition(QStringView statement, QStringView keyword);
 
-// The statement with one more condition: ANDed with the WHERE clause that is there, in front of GROUP BY and
-// ORDER BY. The text around the pieces stays as it is, blanks included.
+// The statement with one more condition: ANDed with an existing WHERE clause, before GROUP BY and ORDER BY. The
+// rest of the text stays unchanged, blanks included.
 QString WithCondition(const QString& statement, const QString& condition);
 
-// The statement ordered by `terms` ("[Name] ASC"), whatever its order was before.
+// The statement ordered by `terms` ("[Name] ASC") in place of its previous order.
 QString WithOrder(const QString& statement, const QString& terms);
 
-// What stands between SELECT and FROM, a text a column, without DISTINCT. Empty when one of the two is missing.
+// The columns between SELECT and FROM, one text each, without DISTINCT. Empty when either keyword is missing.
 QStringList SelectList(QStringView statement);
 
-// The statement from its FROM on, with these columns as its select list, written as they are. DISTINCT stays.
+// The statement with these columns as its select list, written unchanged. DISTINCT stays.
 QString WithSelectList(const QString& statement, const QStringList& columns);
 
-// Whether parentheses, square brackets and quotes are closed in order. A doubled quote ends a text and begins one.
+// Whether parentheses, square brackets and quotes are closed in order. A doubled quote ends one text and begins
+// another.
 bool IsBalanced(QStringView statement);
 
 } // namespace mirel

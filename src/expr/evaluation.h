@@ -10,8 +10,8 @@ namespace mirel {
 
 // One run over a tree; for the operators and functions of the language only.
 //
-// The texts that a run makes are limited all together, so that no expression, however it nests REPLACE, can use
-// up the memory: what goes beyond is null.
+// The texts that one run makes share a limit, so that no expression can use up the memory, however it nests
+// REPLACE. Beyond the limit the result is null.
 struct Evaluation {
     EvalContext& context;
     qint64 unitsLeft = qint64(1) << 26; // UTF-16 units
@@ -31,7 +31,7 @@ inline void Evaluate(ExprNode& node, Evaluation& evaluation)
         node.evaluate(node, evaluation);
 }
 
-// Whether an evaluated node holds where a condition is wanted: a number other than 0.
+// Whether an evaluated node holds as a condition: a number other than 0 does.
 inline bool Holds(const ExprNode& node)
 {
     if (node.null || node.isText)
@@ -46,7 +46,7 @@ inline void SetNull(ExprNode& node)
     node.fieldType = FieldType::None;
 }
 
-// What is no number, or beyond all numbers, is null.
+// Null for infinity and for what is not a number.
 inline void SetNumber(ExprNode& node, double number)
 {
     node.null = !std::isfinite(number);
@@ -66,17 +66,17 @@ inline void SetText(ExprNode& node, QStringView text)
     node.valueText = text;
 }
 
-// Null for days outside of the calendar.
+// Null for days outside the calendar.
 void SetDate(ExprNode& node, std::optional<double> oleDays);
 
-// Makes what stands in the node's buffer its value.
+// Makes the text in the node's buffer its value.
 inline void KeepBuffer(ExprNode& node)
 {
     SetText(node, node.buffer.View());
 }
 
-// Moves the text of an evaluated child into the node's buffer where the child computed it itself: it has no more
-// use for it. False, and the buffer as it was, for a text that stands elsewhere.
+// Moves the text of an evaluated child into the node's buffer if the child computed it itself and so no longer
+// needs it. False, with the buffer unchanged, for a text that lives elsewhere.
 inline bool TakeBuffer(ExprNode& node, ExprNode& child)
 {
     const QStringView text = TextOf(child);
