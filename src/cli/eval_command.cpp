@@ -176,7 +176,7 @@ private:
             if (tree_->isText) {
                 out.WriteText(TextOf(*tree_));
             } else {
-                const ExprNumberChars number(tree_->valueNumber);
+                const ExprNumberChars number = NumberChars(*tree_);
                 const QLatin1StringView text = number.Text();
                 out.Write({text.data(), size_t(text.size())});
             }

@@ -53,6 +53,16 @@ inline void SetNumber(ExprNode& node, double number)
     node.isText = false;
     node.fieldType = FieldType::None;
     node.valueNumber = number + 0.0; // -0 becomes 0
+    node.wholeNumber = 0;
+}
+
+// An integer with all of its digits, for the text that shows it; expressions calculate with the rounded number.
+inline void SetWholeNumber(ExprNode& node, qint64 number)
+{
+    constexpr qint64 kExact = qint64(1) << 53;
+    SetNumber(node, double(number));
+    if (number < -kExact || number > kExact)
+        node.wholeNumber = number;
 }
 
 // `text` must outlive the evaluation.

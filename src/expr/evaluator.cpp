@@ -90,7 +90,7 @@ void ReadCell(ExprNode& node, const Cell& cell, EvalContext& context)
     if (cell.kind == Cell::Kind::Null) {
         SetNull(node);
     } else if (cell.kind == Cell::Kind::Integer && takesNumber) {
-        SetNumber(node, double(cell.integer));
+        SetWholeNumber(node, cell.integer);
     } else if (cell.kind == Cell::Kind::Real && takesNumber) {
         SetNumber(node, cell.real);
     } else if (cell.kind == Cell::Kind::Text && node.columnType != FieldType::Date) {
@@ -180,11 +180,16 @@ void WriteDateText(ExprNode& node)
     node.dateTextDue = false;
 }
 
+ExprNumberChars NumberChars(const ExprNode& node)
+{
+    return node.wholeNumber != 0 ? ExprNumberChars(node.wholeNumber) : ExprNumberChars(node.valueNumber);
+}
+
 QString ShownText(ExprNode& node)
 {
     if (node.null || node.suppressed)
         return {};
-    return node.isText ? TextOf(node).toString() : ExprNumberText(node.valueNumber);
+    return node.isText ? TextOf(node).toString() : QString(NumberChars(node).Text());
 }
 
 void SetDate(ExprNode& node, std::optional<double> oleDays)

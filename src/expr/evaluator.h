@@ -1,6 +1,7 @@
 #pragma once
 
 #include "expr/expr_node.h"
+#include "expr/expr_number.h"
 #include "platform/cell.h"
 #include "platform/value.h"
 
@@ -64,7 +65,10 @@ inline QStringView TextOf(ExprNode& node)
     return node.valueText;
 }
 
-// The value as a form shows it: empty for null and for a value whose WHERE did not hold; numbers as ExprNumberText
+// The digits of a node whose value is a number.
+ExprNumberChars NumberChars(const ExprNode& node);
+
+// The value as a form shows it: empty for null and for a value whose WHERE did not hold; numbers as NumberChars
 // writes them.
 QString ShownText(ExprNode& node);
 

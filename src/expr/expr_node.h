@@ -83,6 +83,9 @@ struct ExprNode {
     OpCode code = OpCode::None;
     FieldType fieldType = FieldType::None; // of a field; Date for dates
     double valueNumber = 0;
+    // The digits of a number that `valueNumber` rounds: an integer field's beyond 53 bits. 0 for every other
+    // value.
+    qint64 wholeNumber = 0;
 
     // Points into this node, into a child or into what the context lends: valid until the next evaluation.
     QStringView valueText;

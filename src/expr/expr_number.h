@@ -12,14 +12,16 @@ namespace mirel {
 class ExprNumberChars {
 public:
     explicit ExprNumberChars(double number);
+    explicit ExprNumberChars(qint64 number);
 
     QLatin1StringView Text() const { return {characters_.data(), length_}; }
 
 private:
+    void Write(qint64 number);
+
     std::array<char, 320> characters_; // the largest double has 309 digits before the point
     qsizetype length_;
 };
-QString ExprNumberText(double number);
 
 // The decimal number at the start of a text, after white space; 0 when there is none. Infinite when it is too
 // large.

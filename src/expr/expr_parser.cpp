@@ -46,12 +46,6 @@ bool TakesManyArguments(const ExprNode& node)
     return node.kind == NodeKind::ThreeArguments || node.kind == NodeKind::FourArguments;
 }
 
-QString WithoutBrackets(QString name)
-{
-    name.remove(u'[').remove(u']');
-    return name;
-}
-
 void MakeNumber(ExprNode& node, double number)
 {
     node.code = OpCode::Number;
@@ -65,7 +59,7 @@ void MakeOperand(ExprNode& node, const QString& token)
     if (token.startsWith(u'&')) {
         node.code = OpCode::Control;
         node.evaluate = EvaluateControl;
-        node.text = TrimmedSpaces(WithoutBrackets(token.sliced(1))).toString();
+        node.text = TrimmedSpaces(BareName(token.sliced(1))).toString();
     } else if (token.startsWith(u'\'') || token.startsWith(u'"')) {
         node.code = OpCode::Text;
         node.text = token.sliced(1).chopped(token.size() > 1 ? 1 : 0);

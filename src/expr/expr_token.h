@@ -23,6 +23,9 @@ std::optional<ExprToken> NextExpressionToken(QStringView text, qsizetype& positi
 // The position of the first character at or after `position` that is no tab, space or comma.
 qsizetype SkipExpressionBlanks(QStringView text, qsizetype position);
 
+// A name without its brackets. Between brackets "]]" stands for "]", and a "[" is part of the name.
+QString BareName(QStringView written);
+
 // Both start after an opening parenthesis and skip inner parentheses and quoted text; a quote of either kind ends
 // a text that a quote of either kind began. -1: not found.
 qsizetype FindClosingParenthesis(QStringView text, qsizetype from);

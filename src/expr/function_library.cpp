@@ -210,7 +210,7 @@ void FnToChar(ExprNode& node, Evaluation&)
         return;
     }
     node.buffer.Resize(0);
-    node.buffer.Append(ExprNumberChars(argument.valueNumber).Text());
+    node.buffer.Append(NumberChars(argument).Text());
     KeepBuffer(node);
 }
 

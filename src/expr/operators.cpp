@@ -75,7 +75,7 @@ void AppendValue(TextBuffer& buffer, ExprNode& node)
     if (node.isText)
         buffer.Append(TextOf(node));
     else
-        buffer.Append(ExprNumberChars(node.valueNumber).Text());
+        buffer.Append(NumberChars(node).Text());
 }
 
 void Concatenate(ExprNode& node, ExprNode& left, ExprNode& right, Evaluation& evaluation)
@@ -258,6 +258,7 @@ void EvaluateWhere(ExprNode& node, Evaluation& evaluation)
     node.isText = value->isText;
     node.fieldType = value->fieldType;
     node.valueNumber = value->valueNumber;
+    node.wholeNumber = value->wholeNumber;
 }
 
 constexpr auto kOperator = NodeKind::TwoArguments;

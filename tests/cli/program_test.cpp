@@ -1,5 +1,6 @@
 // The program as a script meets it: its words, what it prints where, and how it ends.
 #include "cli/program_fixture.h"
+#include "support/sqlite_file.h"
 
 #include <QDir>
 #include <QJsonArray>
@@ -290,6 +291,16 @@ TEST_F(Program, EvaluatesExpressions)
     EXPECT_EQ(eval({u"1"_s, u"--all"_s}).status, 2);
     EXPECT_EQ(eval({u"1"_s, u"--control"_s, u"a"_s}).status, 2);
     EXPECT_EQ(eval({u"1"_s, u"--format"_s, u"csv"_s}).status, 2);
+}
+
+TEST_F(Program, ShowsEveryDigitOfAWholeNumber)
+{
+    NewDatabase();
+    Sql(u"CREATE TABLE T (A Integer)"_s);
+    SqliteFile(Path(u"a.cdb"_s)).Run("INSERT INTO T VALUES (9007199254740993), (-9223372036854775807)");
+    EXPECT_EQ(
+        Run({u"eval"_s, u"[A]+'/'+TO_CHAR([A])"_s, u"--all"_s, u"--db"_s, u"a.cdb"_s, u"--source"_s, u"T"_s}),
+        (Ended{0, u"9007199254740993/9007199254740993\n-9223372036854775807/-9223372036854775807\n"_s, {}}));
 }
 
 TEST_F(Program, TellsOfExpressionsAsJson)

@@ -50,6 +50,17 @@ TEST_F(RecordContextTest, FindsColumnsByEveryWayToWriteThem)
         EXPECT_EQ(Shown(row.name), QString::fromUtf16(row.shown)) << QString::fromUtf16(row.name).toStdString();
 }
 
+TEST_F(RecordContextTest, FindsNamesThatHoldBrackets)
+{
+    SqliteFile(path_).Run("CREATE TABLE Odd (\"a]b\" INTEGER, \"[c\" INTEGER, \"d].[e\" INTEGER);"
+                          "INSERT INTO Odd VALUES (1, 2, 3)");
+    ASSERT_TRUE(Open(records, u"SELECT * FROM Odd"_s));
+    context.ResultChanged();
+    EXPECT_EQ(Shown(u"[a]]b]"), u"1"_s);
+    EXPECT_EQ(Shown(u"Odd.[a]]b]+[[c]"), u"3"_s);
+    EXPECT_EQ(Shown(u"[d]].[e]"), u"3"_s);
+}
+
 TEST_F(RecordContextTest, FollowsTheCurrentRecord)
 {
     ASSERT_TRUE(Open(records, u"SELECT * FROM [Birds]"_s));
@@ -87,7 +98,7 @@ TEST_F(RecordContextTest, GivesAWalkTheValuesOfTheCurrentRecord)
         "'2001-07-04 09:05:00')"_s);
     Run(u"INSERT INTO [All] ([I]) VALUES (NULL)"_s);
     // As another program fills columns, whatever their types.
-    SqliteFile(path_).Run("INSERT INTO [All] VALUES (9007199254740993, 3, x'41FF', 12, 'perhaps', 'next Tuesday', "
+    SqliteFile(path_).Run("INSERT INTO [All] VALUES (3000000000, 3, x'41FF', 12, 'perhaps', 'next Tuesday', "
                           "x'00'), ('seven', 'x', 5, '', 0, 37076.5, 4)");
 
     FormContext current(records, {u"ja"_s, u"nein"_s}, {}, [] { return QDateTime(); });
