@@ -51,7 +51,7 @@ QStringList KeysOf(std::span<const ResultField> fields)
         QString key = field.name;
         if (keys.contains(key) && !field.table.isEmpty())
             key = field.table + u'.' + field.column;
-        // What still stands twice gets a number: a reader would keep one of two equal keys only.
+        // Duplicates that remain get a number: a reader would keep only one of two equal keys.
         for (int number = 2; keys.contains(key); ++number)
             key = field.name + u' ' + QString::number(number);
         keys += key;

@@ -101,7 +101,7 @@ void WriteMessage(const QString& text)
     QString lines = text;
     lines.replace(u"\r\n"_s, u"\n"_s);
     lines += u'\n';
-    // Where standard error is closed as well there is nobody left to tell.
+    // If standard error is closed too, nobody is left to tell.
     const QByteArray utf8 = lines.toUtf8();
     WriteAll(STDERR_FILENO, {utf8.constData(), size_t(utf8.size())});
 }

@@ -34,7 +34,7 @@ QString FullPath(const QString& file)
     return QDir::cleanPath(QFileInfo(file).absoluteFilePath());
 }
 
-// A command that wrote into nowhere has failed; where the reader went away there is nobody to be told.
+// A command whose output was lost has failed; if the reader is gone, it needs no message.
 ExitStatus EndOutput(Output& output, ExitStatus status)
 {
     if (output.Flush())

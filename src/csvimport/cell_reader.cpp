@@ -142,7 +142,7 @@ Hr CellReader::ReadDouble(std::string_view text, Cell& cell)
     const char* const end = text.data() + text.size();
     const char* const start = NumberStart(text);
     const char* const digits = start != end && *start == '-' ? start + 1 : start;
-    // The words "inf" and "nan" are numbers to std::from_chars, but to nobody who writes a file.
+    // std::from_chars reads the words "inf" and "nan" as numbers, but no file means them.
     if (digits == end || !(IsDigit(*digits) || *digits == '.'))
         return Hr::BadLiteral;
     double number = 0;

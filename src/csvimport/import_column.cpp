@@ -41,7 +41,7 @@ bool ReadType(const QString& name, FieldType& type, UserMessage& fault)
     return Refuse(fault, Str::ImportUnknownType, {name, known.join(u", "_s)});
 }
 
-// Cuts the next item off the front of a column list: up to the next "," that stands outside of brackets.
+// Cuts the next item off the front of a column list: up to the next "," outside brackets.
 QString CutItem(QStringView& rest)
 {
     qsizetype end = 0;

@@ -8,7 +8,7 @@
 namespace mirel {
 namespace {
 
-// Where year, month and day stand among the three date fields, by the number of the order.
+// The places of year, month and day among the three date fields, by the number of the order.
 struct FieldPlaces {
     int year;
     int month;
@@ -87,7 +87,7 @@ qint64 FullYear(qint64 year)
     return year >= 0 && year <= 29 ? 2000 + year : 1900 + year;
 }
 
-// No date or time field is longer than a year; -1 makes what is no number, or none of that size, no date.
+// No date or time field is longer than a year. -1, for anything else, is not part of any date.
 int FieldOrNone(std::optional<qint64> number)
 {
     return number && *number >= 0 && *number <= 9999 ? int(*number) : -1;

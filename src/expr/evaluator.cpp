@@ -18,8 +18,8 @@ void ResolveColumn(ExprNode& node, EvalContext& context)
     node.columnsId = context.ColumnsId();
 }
 
-// A column of no type takes the type of what it holds. A text in a column of another type is one that does not
-// read as such: it comes as it stands.
+// A column of no type takes the type of what it holds. A text in a column of another type does not
+// convert to that type, so it stays a text.
 FieldType TypeToRead(FieldType columnType, const Value& value)
 {
     if (columnType != FieldType::None && value.Tag() != ValueTag::Text)

@@ -72,7 +72,7 @@ private:
         return token;
     }
 
-    // What was collected with the comparison character that stands here, and the one that may follow after blanks.
+    // The token so far with the comparison character at this place, and the one that may follow after blanks.
     QString WithComparison()
     {
         const bool onlyEqual = mode_ == ExprMode::Condition && text_[position_] == u'!';
