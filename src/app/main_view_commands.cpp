@@ -3,6 +3,7 @@
 #include "app/shell_commands.h"
 #include "forms/default_form.h"
 #include "resources/string_table.h"
+#include "tableview/saved_queries.h"
 
 #include <QFileInfo>
 
@@ -230,6 +231,13 @@ std::optional<TableRequest> MainViewCommands::RequestOfSelected() const
         break;
     }
     return std::nullopt;
+}
+
+std::optional<TableRequest> MainViewCommands::RequestToOpen()
+{
+    std::optional<TableRequest> request = RequestOfSelected();
+    SavedQueries queries(session_.Store(), session_.Prompt());
+    return request && queries.AskIfItChanges(request->title, request->statement) ? request : std::nullopt;
 }
 
 std::optional<FormCall> MainViewCommands::CallOfSelected() const

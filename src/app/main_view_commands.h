@@ -57,6 +57,8 @@ public:
 
     // What the table view is to show for the selected entry; empty for a form, or when there is nothing to show.
     std::optional<TableRequest> RequestOfSelected() const;
+    // The same, once the user has agreed to run a query that does more than show records.
+    std::optional<TableRequest> RequestToOpen();
     // The selected form, to be run from its start; empty for anything else.
     std::optional<FormCall> CallOfSelected() const;
     std::optional<FormCall> CallOfForm(const QString& name) const;

@@ -10,6 +10,9 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+constexpr qsizetype kOptionWidth = 26;
+constexpr qsizetype kCommandWidth = 34;
+
 QString FromAscii(const char* text)
 {
     return QString::fromLatin1(text);
@@ -30,10 +33,26 @@ bool IsTakenBy(const CommandDef* command, Opt option)
                    : option == Opt::Version;
 }
 
-// Takes words apart one after the other.
+// The commands of a group are two words: "forms list" belongs to "forms".
+bool IsOfGroup(const CommandDef& command, const QString& group)
+{
+    return FromAscii(command.name).startsWith(group + u' ');
+}
+
+bool IsGroup(const QString& word)
+{
+    return std::ranges::any_of(Commands(), [&word](const CommandDef& each) { return IsOfGroup(each, word); });
+}
+
+// "-7" and "-.5" are values, and so is a lone "-".
+bool LooksLikeOption(const QString& word)
+{
+    return word.size() > 1 && word[0] == u'-' && word[1] != u'.' && !(word[1] >= u'0' && word[1] <= u'9');
+}
+
 class Parser {
 public:
-    Parser(const QStringList& words, QString& fault)
+    Parser(const QStringList& words, ArgumentFault& fault)
         : words_(words)
         , fault_(fault)
     {
@@ -45,19 +64,17 @@ public:
             const QString word = words_[at_++];
             if (word == u"--"_s && !onlyArguments_)
                 onlyArguments_ = true;
-            else if (!onlyArguments_ && word.size() > 1 && word.startsWith(u'-') ? !TakeOption(word)
-                                                                                 : !TakeArgument(word))
+            else if (!onlyArguments_ && LooksLikeOption(word) ? !TakeOption(word) : !TakeArgument(word))
                 return {};
         }
         return IsComplete() ? std::optional(arguments_) : std::nullopt;
     }
 
-    const CommandDef* Command() const { return arguments_.command; }
-
 private:
     bool Refuse(Str message, const QStringList& arguments = {})
     {
-        fault_ = StringText(message, arguments);
+        fault_ = {StringText(message, arguments),
+                  arguments_.command ? FromAscii(arguments_.command->name) : arguments_.group};
         return false;
     }
 
@@ -91,15 +108,13 @@ private:
             arguments_.positional += word;
             return true;
         }
-        // The commands of a group are two words.
-        const QString two = at_ < words_.size() ? word + u' ' + words_[at_] : word;
-        if (const CommandDef* ofGroup = FindCommand(two); ofGroup && two != word) {
-            ++at_;
-            arguments_.command = ofGroup;
+        if (arguments_.group.isEmpty() && IsGroup(word)) {
+            arguments_.group = word;
             return true;
         }
-        arguments_.command = FindCommand(word);
-        return arguments_.command ? true : Refuse(Str::CliUnknownCommand, {word});
+        const QString name = arguments_.group.isEmpty() ? word : arguments_.group + u' ' + word;
+        arguments_.command = FindCommand(name);
+        return arguments_.command ? true : Refuse(Str::CliUnknownCommand, {name});
     }
 
     bool IsFormatHere(const Arguments::Given& given)
@@ -123,7 +138,8 @@ private:
         if (arguments_.Has(Opt::Help) || arguments_.Has(Opt::Version))
             return true;
         if (!arguments_.command)
-            return Refuse(Str::CliCommandMissing);
+            return Refuse(arguments_.group.isEmpty() ? Str::CliCommandMissing : Str::CliGroupCommandMissing,
+                          {arguments_.group});
         const ArgumentCount allowed = ArgumentCountOf(*arguments_.command);
         const qsizetype given = arguments_.positional.size();
         if (given < allowed.least)
@@ -138,22 +154,62 @@ private:
     }
 
     const QStringList& words_;
-    QString& fault_;
+    ArgumentFault& fault_;
     qsizetype at_ = 0;
     bool onlyArguments_ = false;
     Arguments arguments_;
 };
 
+QString HelpLine(const QString& left, qsizetype width, const QString& right)
+{
+    return u"  "_s + left.leftJustified(width) + u"  "_s + right + u'\n';
+}
+
 QString OptionLine(Opt id, const CommandDef* command = nullptr)
 {
     const OptionDef& option = DefinitionOf(id);
     const QString left = (FromAscii(option.name) + u' ' + ValueOf(option, command)).trimmed();
-    return u"  "_s + left.leftJustified(26) + u"  "_s + FromAscii(option.help) + u'\n';
+    return HelpLine(left, kOptionWidth, FromAscii(option.help));
 }
 
 QString CommandLine(const CommandDef& command)
 {
     return (FromAscii(command.name) + u' ' + FromAscii(command.arguments)).trimmed();
+}
+
+QString OptionLines(std::initializer_list<Opt> options)
+{
+    QString lines;
+    for (const Opt option : options)
+        lines += OptionLine(option);
+    return lines + HelpLine(u"--"_s, kOptionWidth, u"ends the options: the words after it are values"_s);
+}
+
+// Of the program, or of one group.
+QString CommandsHelp(const QString& group)
+{
+    QString help = group.isEmpty() ? StringText(Str::CliUsage) : StringText(Str::CliGroupUsage, {group});
+    help += u"\n\n"_s;
+    for (const CommandDef& command : Commands()) {
+        if (group.isEmpty() || IsOfGroup(command, group))
+            help += HelpLine(CommandLine(command), kCommandWidth, FromAscii(command.help));
+    }
+    help += u'\n';
+    return help + (group.isEmpty() ? OptionLines({Opt::Home, Opt::Timing, Opt::Help, Opt::Version})
+                                   : OptionLines({Opt::Home, Opt::Timing, Opt::Help}));
+}
+
+QString CommandHelp(const CommandDef& command)
+{
+    QString help = u"mirel-cli "_s + CommandLine(command);
+    for (const Opt needed : command.needed) {
+        const OptionDef& option = DefinitionOf(needed);
+        help += u' ' + (FromAscii(option.name) + u' ' + FromAscii(option.value)).trimmed();
+    }
+    help += u"\n\n"_s + FromAscii(command.help) + u"\n\n"_s;
+    for (const Opt option : command.options)
+        help += OptionLine(option, &command);
+    return help + OptionLines({Opt::Home, Opt::Timing, Opt::Help});
 }
 
 } // namespace
@@ -180,38 +236,14 @@ char16_t Arguments::Character(Opt option, char16_t otherwise) const
     return Has(option) ? CharacterOf(DefinitionOf(option).kind, Text(option)).value_or(otherwise) : otherwise;
 }
 
-std::optional<Arguments> ParseArguments(const QStringList& words, QString& fault, const CommandDef*& command)
+std::optional<Arguments> ParseArguments(const QStringList& words, ArgumentFault& fault)
 {
-    Parser parser(words, fault);
-    std::optional<Arguments> arguments = parser.Parse();
-    command = parser.Command();
-    return arguments;
+    return Parser(words, fault).Parse();
 }
 
-QString ProgramHelp()
+QString HelpFor(const Arguments& arguments)
 {
-    QString help = StringText(Str::CliUsage) + u"\n\n"_s;
-    for (const CommandDef& command : Commands())
-        help += u"  "_s + CommandLine(command).leftJustified(34) + u"  "_s + FromAscii(command.help) + u'\n';
-    help += u'\n';
-    for (const Opt option : {Opt::Home, Opt::Timing, Opt::Help, Opt::Version})
-        help += OptionLine(option);
-    return help;
-}
-
-QString CommandHelp(const CommandDef& command)
-{
-    QString help = u"mirel-cli "_s + CommandLine(command);
-    for (const Opt needed : command.needed) {
-        const OptionDef& option = DefinitionOf(needed);
-        help += u' ' + (FromAscii(option.name) + u' ' + FromAscii(option.value)).trimmed();
-    }
-    help += u"\n\n"_s + FromAscii(command.help) + u"\n\n"_s;
-    for (const Opt option : command.options)
-        help += OptionLine(option, &command);
-    for (const Opt option : {Opt::Home, Opt::Timing, Opt::Help})
-        help += OptionLine(option);
-    return help;
+    return arguments.command ? CommandHelp(*arguments.command) : CommandsHelp(arguments.group);
 }
 
 } // namespace mirel::cli

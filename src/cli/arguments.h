@@ -11,7 +11,7 @@ namespace mirel::cli {
 
 struct CommandDef;
 
-// One call of the program, taken apart and checked: a command with its arguments and options.
+// One call of the program, parsed and checked: a command with its arguments and options.
 class Arguments {
 public:
     struct Given {
@@ -19,9 +19,10 @@ public:
         QString value; // empty for a flag
     };
 
-    const CommandDef* command = nullptr; // null: the program itself (--help, --version)
+    const CommandDef* command = nullptr; // null: the program itself (--help, --version), or a group's help
+    QString group;                       // "forms" where only the first word of a command was given
     QStringList positional;
-    std::vector<Given> options; // in the order in which they stand
+    std::vector<Given> options; // in the order given
 
     bool Has(Opt option) const;
     // The last one given; else `otherwise`.
@@ -30,12 +31,18 @@ public:
     char16_t Character(Opt option, char16_t otherwise) const;
 };
 
-// Reads what stands behind the program's name. Options may stand anywhere; "--name=value" is taken as well, and
-// behind "--" nothing is an option. Empty when something is wrong: `fault` says in one line what it is, and
-// `command` is set as far as it was understood.
-std::optional<Arguments> ParseArguments(const QStringList& words, QString& fault, const CommandDef*& command);
+// Why the words were refused, in one line, and which help says more: a command or a group, or neither.
+struct ArgumentFault {
+    QString text;
+    QString helpOn;
+};
 
-QString ProgramHelp();
-QString CommandHelp(const CommandDef& command);
+// Parses the words after the program's name. Options may come anywhere, also as "--name=value". A minus followed
+// by a digit or a point begins a value, and after "--" every word is one. On failure the result is empty and
+// `fault` says why.
+std::optional<Arguments> ParseArguments(const QStringList& words, ArgumentFault& fault);
+
+// The help that these arguments ask for: on their command, on its group, or on the program.
+QString HelpFor(const Arguments& arguments);
 
 } // namespace mirel::cli

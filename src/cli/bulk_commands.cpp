@@ -36,7 +36,7 @@ public:
     {
         if (!run_.OpenDatabase())
             return false;
-        if (records_.Open(run_.SourceOf(run_.Argument(1)), run_.Session().Path(), CursorType::Static, lock))
+        if (records_.OpenSource(run_.SourceOf(run_.Argument(1)), run_.Session().Path(), CursorType::Static, lock))
             return true;
         ReportProviderError(run_.Prompt(), &records_, records_.LastResult());
         return false;
@@ -69,7 +69,7 @@ std::optional<Value> ValueOf(Run& run, const QString& given, FieldType type)
 {
     if (type != FieldType::YesNo)
         return TypedValue(given, type);
-    const YesNoWords words = Settings(Profile(run.Folder().ProfileFile())).Words();
+    const YesNoWords words = run.Words();
     const auto is = [&given](const QString& word) { return given.compare(word, Qt::CaseInsensitive) == 0; };
     if (given == u"1" || is(words.yes))
         return Value::Bool(true);

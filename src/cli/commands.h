@@ -4,7 +4,7 @@
 
 namespace mirel::cli {
 
-// The functions behind the rows of the command table, by the file that holds them.
+// The functions of the command table, by file.
 
 // database_commands.cpp
 ExitStatus RunNew(Run& run);

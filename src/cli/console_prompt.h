@@ -4,8 +4,8 @@
 
 namespace mirel::cli {
 
-// Speaks to standard error and asks nothing: every question has the answer that the command line gave (--yes),
-// No without it. Progress shows where standard error is a terminal, and ends when the program is interrupted.
+// Writes to standard error and asks nothing: the answer to every question is Yes with --yes, else No. Shows
+// progress if standard error is a terminal; an interrupt ends the work in progress.
 class ConsolePrompt : public UserPrompt {
 public:
     explicit ConsolePrompt(bool answerYes)
@@ -24,8 +24,8 @@ private:
     bool answerYes_;
 };
 
-// From here on an interrupt (or a request to end) is only remembered, so that a command ends where everything
-// done so far is whole; a second one ends the program at once. A broken pipe shows as a failed write.
+// From here on an interrupt (or a request to terminate) is only remembered, so that a command can end in a
+// consistent state; a second one ends the program at once. A broken pipe shows as a failed write.
 void CatchInterrupts();
 bool WasInterrupted();
 

@@ -4,6 +4,7 @@
 #include "cli/run.h"
 #include "data/provider_error.h"
 #include "expr/explain.h"
+#include "expr/expr_number.h"
 #include "expr/expr_parser.h"
 #include "expr/function_library.h"
 #include "forms/form_context.h"
@@ -62,6 +63,10 @@ public:
         , records_(run.Connection())
         , controls_(std::move(controls))
         , mode_(run.Args().Has(Opt::Condition) ? ExprMode::Condition : ExprMode::Value)
+        , isMeasured_(run.Args().Has(Opt::Timing))
+        , isExplained_(run.Args().Has(Opt::Explain))
+        , asJson_(run.Args().Text(Opt::Format) == u"json")
+        , onAll_(run.Args().Has(Opt::All))
         , tree_(ParseExpression(run.Argument(0), mode_))
     {
     }
@@ -78,50 +83,52 @@ public:
         if (run_.Args().Has(Opt::Database) && !OpenSource())
             return false;
         FormContext context(
-            records_, Settings(Profile(run_.Folder().ProfileFile())).Words(),
-            [this](QStringView name) { return controls_.value(name.toString()); }, &QDateTime::currentDateTime);
-        if (!run_.Args().Has(Opt::All))
-            WriteValue(context);
-        else if (!records_.IsEof() && !WriteAll(context))
+            records_, run_.Words(), [this](QStringView name) { return controls_.value(name.toString()); },
+            [] { return QDateTime::currentDateTime(); });
+        if (onAll_ && !EvaluateAll(context))
             return false;
-        if (run_.Args().Has(Opt::Timing) && evaluations_ > 0)
+        if (!onAll_)
+            WriteValue(context);
+        if (evaluations_ > 0)
             run_.Times().nsPerEval = double(evaluationNs_) / double(evaluations_);
         return true;
     }
 
 private:
-    bool WriteAll(FormContext& whole)
-    {
-        RowContext context(whole, tree_ && AsksForCount(*tree_) ? records_.RecordCount() : -1);
-        if (tree_)
-            context.Collect(*tree_);
-        ReadRange range{.fields = context.Columns()};
-        if (range.fields.empty())
-            range.fields = {0}; // none would be all of them
-        qint64 position = 0;
-        const bool read = records_.Read(range, [&](std::span<const Cell> cells) {
-            context.Lend(position++, cells);
-            WriteValue(context);
-            return !run_.Out().HasFailed() && !WasInterrupted();
-        });
-        return read ? !run_.Out().HasFailed() && !WasInterrupted() : Report();
-    }
-
-    // Counting takes a walk of its own.
-    static bool AsksForCount(const ExprNode& node)
-    {
-        constexpr std::array<QStringView, 3> kCounts = {u"RECCOUNT", u"COUNT", u"SEEKTOTAL"};
-        const bool isCount = std::ranges::any_of(
-            kCounts, [&node](QStringView name) { return int(node.code) == FindFunction(name)->code; });
-        return isCount || std::ranges::any_of(node.args, [](const ExprTree& argument) {
-                   return argument && AsksForCount(*argument);
-               });
-    }
-
     bool Report()
     {
         ReportProviderError(run_.Prompt(), &records_, records_.LastResult());
         return false;
+    }
+
+    // Only a static cursor counts and moves. On a whole table it also reads no more columns than are asked for;
+    // of a SELECT the other one hands over the records sooner.
+    CursorType CursorToUse(const QString& source)
+    {
+        return onAll_ && !AsksForCount() && !run_.IsTable(source) ? CursorType::ForwardOnly : CursorType::Static;
+    }
+
+    bool AsksForCount() const { return tree_ && AsksForRecordCount(*tree_); }
+
+    // All records in one pass, without moving from one to the next.
+    bool EvaluateAll(FormContext& context)
+    {
+        RowContext rows(context, AsksForCount() ? records_.RecordCount() : 0);
+        if (tree_)
+            rows.Collect(*tree_);
+        ReadRange range;
+        range.fields = rows.Columns();
+        if (range.fields.empty())
+            range.fields = {0}; // none would be all of them
+        qint64 done = 0;
+        bool isStopped = false;
+        const bool read = records_.Read(range, [&](std::span<const Cell> cells) {
+            rows.Lend(done++, cells);
+            WriteValue(rows);
+            isStopped = run_.Out().HasFailed() || WasInterrupted();
+            return !isStopped;
+        });
+        return read ? !isStopped : Report();
     }
 
     // The first record is current unless --record names another. A result without records has none to name.
@@ -130,7 +137,8 @@ private:
         if (!run_.OpenDatabase(run_.Args().Text(Opt::Database)))
             return false;
         const QString source = run_.Args().Text(Opt::Source);
-        if (!records_.Open(source, run_.Session().Path(), CursorType::Static, LockType::ReadOnly))
+        const CursorType cursor = CursorToUse(source);
+        if (!records_.OpenSource(run_.SourceOf(source), run_.Session().Path(), cursor, LockType::ReadOnly))
             return Report();
         if (!run_.Args().Has(Opt::Record))
             return true;
@@ -147,18 +155,34 @@ private:
     {
         ++run_.Times().rows;
         const bool holds = tree_ && EvaluateExpression(context, *tree_);
-        if (tree_ && run_.Args().Has(Opt::Timing))
+        if (tree_ && isMeasured_)
             Measure(context);
         std::vector<ExprSlip> slips;
-        if (run_.Args().Has(Opt::Explain))
+        if (isExplained_)
             slips = ExplainExpression(run_.Argument(0), mode_, context);
-        if (run_.Args().Text(Opt::Format) == u"json") {
+        if (asJson_) {
             WriteJson(holds, slips);
             return;
         }
-        run_.Out().WriteLine(tree_ ? ShownText(*tree_) : QString());
+        WriteShownText();
         for (const ExprSlip& slip : slips)
             run_.Out().WriteLine(slip.Text());
+    }
+
+    // ShownText without a QString: this is what a million records spend their time on.
+    void WriteShownText()
+    {
+        Output& out = run_.Out();
+        if (tree_ && !tree_->null && !tree_->suppressed) {
+            if (tree_->isText) {
+                out.WriteText(TextOf(*tree_));
+            } else {
+                const ExprNumberChars number = NumberChars(*tree_);
+                const QLatin1StringView text = number.Text();
+                out.Write({text.data(), size_t(text.size())});
+            }
+        }
+        out.Write('\n');
     }
 
     // The evaluation alone: the record's values were fetched by the one before.
@@ -192,7 +216,7 @@ private:
         out.Write(View(QByteArray::number(tree_ ? int(tree_->fieldType) : 0)));
         if (tree_ && tree_->kind == NodeKind::Condition)
             out.Write(holds && !isNull ? ",\"holds\":1" : ",\"holds\":0");
-        if (run_.Args().Has(Opt::Explain))
+        if (isExplained_)
             WriteSlips(slips);
         out.Write("}\n");
     }
@@ -212,6 +236,10 @@ private:
     DbRecordset records_; // stays closed without a database: then every field name is unknown
     QHash<QString, QString> controls_;
     ExprMode mode_;
+    bool isMeasured_;
+    bool isExplained_;
+    bool asJson_;
+    bool onAll_;
     ExprTree tree_;
     qint64 evaluationNs_ = 0;
     qint64 evaluations_ = 0;

@@ -98,7 +98,7 @@ ExitStatus RunExport(Run& run)
     if (!source)
         return ExitStatus::Failed;
     DbRecordset records(run.Connection());
-    if (!records.Open(*source, run.Session().Path(), CursorType::Static, LockType::ReadOnly)) {
+    if (!records.OpenSource(*source, run.Session().Path(), CursorType::Static, LockType::ReadOnly)) {
         ReportProviderError(run.Prompt(), &records, records.LastResult());
         return ExitStatus::Failed;
     }

@@ -152,6 +152,10 @@ ExitStatus RunFormsImport(Run& run)
     }
     if (run.Args().Has(Opt::Name))
         form->SetName(run.Args().Text(Opt::Name));
+    if (form->name.Text().trimmed().isEmpty()) {
+        run.Prompt().Show({Str::CliFormWithoutName, {}});
+        return ExitStatus::Failed;
+    }
     const bool stored = Apply(run, *store, [&](FormStore& forms) {
         const bool isFree = !forms.FindForm(form->name.Text());
         if (isFree)

@@ -7,7 +7,7 @@
 namespace mirel::cli {
 
 // Every form, control and saved query of a store as one JSON object, with all fields that the file keeps. Colours
-// are numbers, -1 for the default one; a text that a record does not have is null.
+// are numbers, -1 for the default one; a missing text is null.
 void WriteStoreJson(Output& output, const FormStore& store);
 
 // What a running form shows.

@@ -59,7 +59,7 @@ public:
 private:
     void Push(const FormCall& call)
     {
-        const Settings settings(Profile(run_.Folder().ProfileFile()));
+        const Settings settings(run_.Folder().OpenProfile());
         forms_.push_back(std::make_unique<RunningForm>(call, FormEnvironment{run_.Connection(),
                                                                              run_.Session().Path(),
                                                                              run_.Session().Store(),
@@ -183,10 +183,8 @@ bool RunForms(Run& run, FormRun& forms, const FormDef& form)
 
 ExitStatus RunFormsShow(Run& run)
 {
-    if (const QString fault = FaultOf(run.Args()); !fault.isEmpty()) {
-        WriteMessage(fault + u'\n' + StringText(Str::CliSeeHelp, {u" forms show"_s}));
-        return ExitStatus::BadArguments;
-    }
+    if (const QString fault = FaultOf(run.Args()); !fault.isEmpty())
+        return run.Refuse(fault);
     if (!run.OpenDatabase())
         return ExitStatus::Failed;
     const FormDef* form = run.Session().Store().FindForm(run.Argument(1));

@@ -68,7 +68,7 @@ private:
         return false;
     }
 
-    // The file is opened anew for each time that it is read from its beginning.
+    // Each pass over the file opens it again.
     bool OpenFile(QFile& file)
     {
         file.setFileName(path_);

@@ -1,6 +1,7 @@
 #include "cli/json_writer.h"
 
 #include "cli/cell_text.h"
+#include "platform/ole_date.h"
 
 #include <QStringList>
 
@@ -50,7 +51,7 @@ QStringList KeysOf(std::span<const ResultField> fields)
         QString key = field.name;
         if (keys.contains(key) && !field.table.isEmpty())
             key = field.table + u'.' + field.column;
-        // What still stands twice gets a number: a reader would keep one of two equal keys only.
+        // Duplicates that remain get a number: a reader would keep only one of two equal keys.
         for (int number = 2; keys.contains(key); ++number)
             key = field.name + u' ' + QString::number(number);
         keys += key;
@@ -77,6 +78,10 @@ void WriteReal(Output& output, double number)
 void WriteDate(Output& output, std::string_view stored)
 {
     constexpr size_t kDateLength = 10; // "2001-07-04"
+    if (!HasStoredDateForm(stored)) {  // another program's text that is not a date
+        WriteJsonText(output, stored);
+        return;
+    }
     output.Write('"');
     output.Write(stored.substr(0, kDateLength));
     output.Write(stored.size() > kDateLength ? "T" : "T00:00:00");

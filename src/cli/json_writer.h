@@ -12,7 +12,7 @@ namespace mirel::cli {
 // as base64, NULL as null. A second column of one name has the key "Table.Field".
 class JsonWriter : public RecordWriter {
 public:
-    enum class Shape { Array, Lines }; // one array of objects, or an object a line
+    enum class Shape { Array, Lines }; // one array of objects, or one object per line
 
     JsonWriter(Output& output, Shape shape)
         : output_(output)
@@ -34,7 +34,7 @@ private:
     bool first_ = true;
 };
 
-// A text in quotes, as JSON writes it. What is no UTF-8 becomes the replacement character.
+// A text in quotes, as JSON writes it. Bytes that are not UTF-8 become the replacement character.
 void WriteJsonText(Output& output, std::string_view utf8);
 QByteArray JsonText(const QString& text);
 

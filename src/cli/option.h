@@ -7,7 +7,7 @@
 
 namespace mirel::cli {
 
-// Every option of the program by name. Which command takes which one stands in the table of commands.
+// Every option of the program. The table of commands says which command takes which.
 enum class Opt {
     Home,
     Help,
@@ -44,23 +44,23 @@ enum class Opt {
     Replace,
 };
 
-// What an option's value has to be; a value that is not is refused before the command runs.
+// What an option's value must be; any other value is refused before the command runs.
 enum class ValueKind { Flag, Text, Count, Format, Separator, Quote, Character, DateOrder };
 
 struct OptionDef {
     Opt id;
     const char* name; // with its dashes
     ValueKind kind;
-    const char* value; // how the help calls the value; empty for a flag
+    const char* value; // the value's name in the help; empty for a flag
     const char* help;
 };
 
 std::span<const OptionDef> Options();
 const OptionDef& DefinitionOf(Opt id);
-const OptionDef* FindOption(QStringView name); // null: there is none of that name
+const OptionDef* FindOption(QStringView name); // null: unknown
 
-// The value as the character that a file is written with: "comma", "tab" or the character itself; "none" is 0.
-// Empty when the text is none of these.
+// The character that the value means: "comma", "tab" or the character itself; 0 for "none". Empty for any other
+// text.
 std::optional<char16_t> CharacterOf(ValueKind kind, QStringView text);
 bool IsValidValue(ValueKind kind, const QString& text);
 

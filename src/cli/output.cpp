@@ -38,15 +38,35 @@ Output::~Output()
     Flush();
 }
 
-void Output::WriteText(const QString& text)
+void Output::WriteText(QStringView text)
 {
+    if (WriteAscii(text))
+        return;
     const QByteArray utf8 = text.toUtf8();
     Write({utf8.constData(), size_t(utf8.size())});
 }
 
-void Output::WriteLine(const QString& text)
+// False, and nothing written, for other characters and for texts that the buffer has no room for.
+bool Output::WriteAscii(QStringView text)
 {
-    WriteText(text + u'\n');
+    if (size_t(text.size()) > kBufferBytes - used_)
+        return false;
+    char16_t bits = 0;
+    for (qsizetype i = 0; i < text.size(); ++i) {
+        const char16_t unit = text.utf16()[i];
+        buffer_[used_ + size_t(i)] = char(unit);
+        bits |= unit;
+    }
+    if (bits >= 0x80)
+        return false;
+    used_ += size_t(text.size());
+    return true;
+}
+
+void Output::WriteLine(QStringView text)
+{
+    WriteText(text);
+    Write('\n');
 }
 
 bool Output::Flush()
@@ -81,7 +101,7 @@ void WriteMessage(const QString& text)
     QString lines = text;
     lines.replace(u"\r\n"_s, u"\n"_s);
     lines += u'\n';
-    // Where standard error is closed as well there is nobody left to tell.
+    // If standard error is closed too, nobody is left to tell.
     const QByteArray utf8 = lines.toUtf8();
     WriteAll(STDERR_FILENO, {utf8.constData(), size_t(utf8.size())});
 }

@@ -8,8 +8,8 @@
 
 namespace mirel::cli {
 
-// What a command writes to standard output, collected into large writes. Once a write has failed (the reader of
-// a pipe went away, the disk is full) it takes nothing more, and the command ends at its next record.
+// The standard output of a command, collected into large writes. Once a write has failed (the reader of a pipe is
+// gone, the disk is full) it accepts nothing more, and the command ends at its next record.
 class Output {
 public:
     explicit Output(int fileDescriptor);
@@ -31,16 +31,17 @@ public:
             Flush();
         buffer_[used_++] = byte;
     }
-    void WriteText(const QString& text);
-    void WriteLine(const QString& text);
+    void WriteText(QStringView text);
+    void WriteLine(QStringView text);
 
     bool Flush(); // false once a write has failed
     bool HasFailed() const { return failed_ != 0; }
-    // Whether nobody reads any more, which is no failure to speak of.
+    // Whether the reader is gone, which needs no message.
     bool IsBrokenPipe() const;
     QString Reason() const;
 
 private:
+    bool WriteAscii(QStringView text);
     void WriteThrough(std::string_view bytes);
 
     static constexpr size_t kBufferBytes = 256 * 1024;

@@ -6,7 +6,7 @@
 
 namespace mirel::cli {
 
-// The program's output for what writes to devices. The output must outlive it.
+// The program's output as a QIODevice. The output must outlive it.
 class OutputDevice : public QIODevice {
 public:
     explicit OutputDevice(Output& output)

@@ -3,6 +3,7 @@
 #include "cli/commands.h"
 #include "cli/run.h"
 #include "cli/sql_command.h"
+#include "data/db_recordset.h"
 #include "resources/string_table.h"
 #include "tableview/saved_queries.h"
 
@@ -55,6 +56,10 @@ ExitStatus RunQueriesSave(Run& run)
     SavedQueries queries(run.Session().Store(), run.Prompt());
     const QString name = run.Argument(1);
     const QString statement = run.Argument(2);
+    if (name.trimmed().isEmpty()) {
+        run.Prompt().Show({Str::CliQueryWithoutName, {}});
+        return ExitStatus::Failed;
+    }
     // --yes answers for an unbalanced statement; what replaces a query is --replace alone.
     if (!run.Args().Has(Opt::Replace) && queries.Knows(name)) {
         run.Prompt().Show({Str::CliQueryExists, {name}});
@@ -75,6 +80,10 @@ ExitStatus RunQueriesRun(Run& run)
     if (!statement) {
         run.Prompt().Show({Str::NoSuchQuery, {name}});
         return ExitStatus::Failed;
+    }
+    if (!OnlyReads(*statement) && !run.Args().Has(Opt::Yes)) {
+        run.Prompt().Show({Str::CliQueryChanges, {name}});
+        return ExitStatus::BadArguments;
     }
     return RunStatement(run, *statement) ? ExitStatus::Done : ExitStatus::Failed;
 }

@@ -12,7 +12,7 @@
 namespace mirel::cli {
 namespace {
 
-// Up to four bytes that a text of a line cannot hold as they are, and so asks for marks around it or for escapes.
+// Up to four bytes that a line cannot contain unchanged: a text with one of them needs quotes or escapes.
 class SpecialBytes {
 public:
     constexpr explicit SpecialBytes(std::string_view bytes)
@@ -21,7 +21,7 @@ public:
             bytes_[i] = bytes[std::min(i, bytes.size() - 1)];
     }
 
-    // Most texts hold none, so they are looked for sixteen bytes at a time.
+    // Most texts contain none, so the search takes sixteen bytes at a time.
     bool StandIn(std::string_view text) const
     {
         constexpr size_t kWidth = sizeof(Block);
@@ -51,7 +51,7 @@ private:
     std::array<char, 4> bytes_{};
 };
 
-// RFC 4180's quotation: a text with a separator, a mark or a line end stands in marks, inner ones doubled.
+// Quoting as in RFC 4180: a text with a separator, a quote or a line end is quoted, its own quotes are doubled.
 void WriteCsvText(Output& output, std::string_view text)
 {
     static constexpr SpecialBytes kNeedMarks(",\"\r\n");
@@ -68,7 +68,7 @@ void WriteCsvText(Output& output, std::string_view text)
     output.Write('"');
 }
 
-// What a line of tab-separated texts cannot hold is written as \t, \n, \r and \\.
+// Characters that a line of tab-separated texts cannot contain are written as \t, \n, \r and \\.
 void WriteTsvText(Output& output, std::string_view text)
 {
     static constexpr std::string_view kEscaped = "\t\n\r\\";
@@ -86,7 +86,7 @@ void WriteTsvText(Output& output, std::string_view text)
     }
 }
 
-// A header line and a line a record, with a separator between the texts.
+// A header line, then one line per record, with a separator between the texts.
 class DelimitedWriter : public RecordWriter {
 public:
     using WriteText = void (*)(Output& output, std::string_view text);

@@ -16,16 +16,16 @@ namespace mirel::cli {
 enum class OutputFormat { Table, Csv, Tsv, Json, JsonLines };
 std::optional<OutputFormat> FormatOfName(QStringView name);
 
-// Writes records one after the other in one of the formats of the program. Memory does not grow with their
-// number: columns of a table are as wide as its first records need them.
+// Writes records one by one in one of the program's formats. Memory does not grow with their number: the first
+// records determine the widths of a table's columns.
 //
-// Begin, any number of Records, End; the fields must live until then.
+// Call Begin, then Record any number of times, then End; the fields must live until then.
 class RecordWriter {
 public:
     virtual ~RecordWriter() = default;
 
     virtual void Begin(std::span<const ResultField> fields) = 0;
-    // False once the output takes no more.
+    // False once the output accepts no more.
     virtual bool Record(std::span<const Cell> cells) = 0;
     virtual void End() = 0;
 };

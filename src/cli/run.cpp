@@ -1,5 +1,6 @@
 #include "cli/run.h"
 
+#include "provider/dialect/parser.h"
 #include "resources/string_table.h"
 #include "tableview/record_browser.h"
 
@@ -13,10 +14,10 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-ExitStatus RefuseArguments(const QString& fault, const CommandDef* command)
+ExitStatus RefuseArguments(const ArgumentFault& fault)
 {
-    const QString name = command ? u' ' + QString::fromLatin1(command->name) : QString();
-    WriteMessage(fault + u'\n' + StringText(Str::CliSeeHelp, {name}));
+    const QString words = fault.helpOn.isEmpty() ? QString() : u' ' + fault.helpOn;
+    WriteMessage(fault.text + u'\n' + StringText(Str::CliSeeHelp, {words}));
     return ExitStatus::BadArguments;
 }
 
@@ -33,7 +34,7 @@ QString FullPath(const QString& file)
     return QDir::cleanPath(QFileInfo(file).absoluteFilePath());
 }
 
-// A command that wrote into nowhere has failed; where the reader went away there is nobody to be told.
+// A command whose output was lost has failed; if the reader is gone, it needs no message.
 ExitStatus EndOutput(Output& output, ExitStatus status)
 {
     if (output.Flush())
@@ -70,7 +71,7 @@ bool Run::OpenDatabase(const QString& file)
 std::unique_ptr<RecordWriter> Run::MakeWriter()
 {
     const OutputFormat format = FormatOfName(arguments_.Text(Opt::Format)).value_or(OutputFormat::Table);
-    return MakeRecordWriter(format, output_, Settings(Profile(folder_.ProfileFile())).Words());
+    return MakeRecordWriter(format, output_, Words());
 }
 
 void Run::WriteTiming() const
@@ -87,25 +88,32 @@ void Run::WriteTiming() const
 
 ExitStatus Run::Refuse(const QString& fault) const
 {
-    return RefuseArguments(fault, arguments_.command);
+    return RefuseArguments({fault, QString::fromLatin1(arguments_.command->name)});
+}
+
+bool Run::IsTable(const QString& name)
+{
+    QStringList tables;
+    session_.ListTables(tables);
+    return tables.contains(name, Qt::CaseInsensitive);
 }
 
 QString Run::SourceOf(const QString& given)
 {
-    QStringList tables;
-    session_.ListTables(tables);
-    return tables.contains(given, Qt::CaseInsensitive) ? RecordBrowser::StatementOfTable(given) : given;
+    if (IsTable(given))
+        return RecordBrowser::StatementOfTable(given);
+    const QueryDef* query = dialect::BeginsAsStatement(given) ? nullptr : session_.Store().FindQuery(given);
+    return query ? query->text.Text() : given;
 }
 
 ExitStatus RunProgram(const QStringList& words, Output& output)
 {
-    QString fault;
-    const CommandDef* command = nullptr;
-    std::optional<Arguments> arguments = ParseArguments(words, fault, command);
+    ArgumentFault fault;
+    std::optional<Arguments> arguments = ParseArguments(words, fault);
     if (!arguments)
-        return RefuseArguments(fault, command);
+        return RefuseArguments(fault);
     if (arguments->Has(Opt::Help)) {
-        output.WriteText(command ? CommandHelp(*command) : ProgramHelp());
+        output.WriteText(HelpFor(*arguments));
         return EndOutput(output, ExitStatus::Done);
     }
     if (arguments->Has(Opt::Version)) {

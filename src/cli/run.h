@@ -17,7 +17,7 @@
 
 namespace mirel::cli {
 
-// What --timing tells; what does not apply stays empty.
+// The figures of --timing; those that do not apply stay empty.
 struct Timing {
     qint64 openMs = 0;
     qint64 rows = 0;
@@ -25,7 +25,7 @@ struct Timing {
     std::optional<double> nsPerEval;
 };
 
-// One run of one command: its arguments and all that it works with. Made for the run and gone with it.
+// One run of one command: its arguments and everything it works with.
 class Run {
 public:
     Run(Arguments arguments, Output& output);
@@ -36,8 +36,8 @@ public:
     // A file named on the command line, by its full path.
     QString PathArgument(int index) const;
 
-    // Opens the database that the first argument names, or `file`, as the window does. On false the reason was
-    // told.
+    // Opens the database that the first argument names, or `file`, as the window does. On false the reason has
+    // been reported.
     [[nodiscard]] bool OpenDatabase() { return OpenDatabase(Argument(0)); }
     [[nodiscard]] bool OpenDatabase(const QString& file);
     DatabaseSession& Session() { return session_; }
@@ -47,12 +47,17 @@ public:
     Output& Out() { return output_; }
     Timing& Times() { return timing_; }
 
+    // The user's words for Yes and No.
+    YesNoWords Words() const { return Settings(folder_.OpenProfile()).Words(); }
     // In the format that --format names, with the user's words for Yes and No.
     std::unique_ptr<RecordWriter> MakeWriter();
     void WriteTiming() const;
-    // What is wrong with the arguments, and how to get help.
+    // Reports what is wrong with the arguments, and how to get help.
     ExitStatus Refuse(const QString& fault) const;
-    // A table's name or a statement, as a recordset takes it; the name may stand there without its brackets.
+    // Whether that is the name of one of the user's tables.
+    bool IsTable(const QString& name);
+    // The statement for a source: the name of a table, which needs no brackets here, the name of a saved query, or
+    // the statement itself.
     QString SourceOf(const QString& given);
 
 private:
@@ -66,7 +71,7 @@ private:
     Timing timing_;
 };
 
-// The whole program: `words` is what stands behind its name.
+// The whole program; `words` are its arguments.
 ExitStatus RunProgram(const QStringList& words, Output& output);
 
 } // namespace mirel::cli

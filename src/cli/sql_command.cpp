@@ -46,8 +46,8 @@ bool RunScript(Run& run, QIODevice& script)
             line.chop(1);
         if (WasInterrupted())
             return false;
-        if (!QByteArrayView(line).isValidUtf8()) {
-            run.Prompt().ShowError(StringText(Str::LineIsNoUtf8, {QString::number(number)}));
+        if (!line.isValidUtf8()) { // stored as U+FFFD it could never be told from what was meant
+            run.Prompt().Show({Str::CliNotUtf8Line, {QString::number(number)}});
             return false;
         }
         const std::optional<QString> statement = splitter.AddLine(QString::fromUtf8(line));
@@ -69,7 +69,7 @@ bool RunStatement(Run& run, const QString& statement)
                       (records.Fields().empty() || WriteRecords(run, records));
     if (!done)
         ReportProviderError(run.Prompt(), &records, records.LastResult());
-    // Whoever feeds a script may wait for the records before going on.
+    // The program that feeds a script may wait for the records before it goes on.
     return done && run.Out().Flush() && !WasInterrupted();
 }
 

@@ -8,9 +8,9 @@
 
 namespace mirel::cli {
 
-// Records in aligned columns under a header, numbers to the right. The widths are those of the first
-// kMeasuredRecords; a wider text further down pushes its line aside. Control characters, line ends too, are
-// written as blanks: what a database holds must not command the terminal.
+// Records in aligned columns under a header, numbers to the right. The first
+// kMeasuredRecords determine the widths; a wider text further down shifts the rest of its line. Control
+// characters, line ends included, are written as blanks: the contents of a database must not control the terminal.
 class TableWriter : public RecordWriter {
 public:
     static constexpr size_t kMeasuredRecords = 500;

@@ -142,7 +142,7 @@ Hr CellReader::ReadDouble(std::string_view text, Cell& cell)
     const char* const end = text.data() + text.size();
     const char* const start = NumberStart(text);
     const char* const digits = start != end && *start == '-' ? start + 1 : start;
-    // The words "inf" and "nan" are numbers to std::from_chars, but to nobody who writes a file.
+    // std::from_chars reads the words "inf" and "nan" as numbers, but no file means them.
     if (digits == end || !(IsDigit(*digits) || *digits == '.'))
         return Hr::BadLiteral;
     double number = 0;
@@ -170,9 +170,11 @@ Hr CellReader::ReadDate(std::string_view text, Cell& cell)
         return Hr::Ok;
     }
     // Every locale takes ISO; most files have it, and the locale's own reader is slow.
-    const std::optional<double> date = dates_.order == DateOrder::Locale && IsIsoDate(text)
-                                           ? OleDateFromStored(text)
-                                           : ParseDateFields(dates_, text);
+    std::optional<double> date = dates_.order == DateOrder::Locale && IsIsoDate(text)
+                                     ? OleDateFromStored(text)
+                                     : ParseDateFields(dates_, text);
+    if (!date)
+        date = ParseTimeFields(dates_, text); // an export writes no date for a time on the base date
     const std::optional<StoredDate> stored = date ? StoredDateOf(*date) : std::nullopt;
     if (!stored)
         return Hr::BadLiteral;

@@ -14,8 +14,9 @@ namespace mirel {
 // empty text is NULL.
 //
 // A number is what stands at a text's beginning; a text that does not begin with one is BadLiteral, a number
-// beyond 64 bits Overflow. A text is a Yes when it begins with an integer other than 0. A text that is no date
-// of the format is BadLiteral. All other types take the text, cut after kMaxTextUnits unless it is to stay whole.
+// beyond 64 bits Overflow. A text is a Yes when it begins with an integer other than 0. A text that is neither a
+// date of the format nor a time alone is BadLiteral. All other types take the text, cut after kMaxTextUnits unless
+// it is to stay whole.
 class CellReader {
 public:
     static constexpr int kMaxTextUnits = 8192; // of UTF-16

@@ -6,14 +6,14 @@
 
 namespace mirel {
 
-// How a delimited text file is written: what the user tells before an import. Characters are single UTF-16
+// How a delimited text file is written: the user's settings for an import. Characters are single UTF-16
 // units of the basic plane, 0 is none.
 struct CsvFormat {
     char16_t separator = u',';
     char16_t quote = u'"'; // a text that starts and ends with it loses both
-    // A quotation mark inside a quoted text is doubled, and a quoted text may hold line ends: how most other
+    // A quotation mark inside a quoted text is doubled, and a quoted text may hold line ends: as most other
     // programs write. Without it a quoted text ends at the first mark before a separator or the line's end, and
-    // marks inside stand as they are.
+    // marks inside are kept.
     bool doubledQuotes = false;
     bool namesInFirstLine = false;
     DateFormat dates;

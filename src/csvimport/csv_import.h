@@ -14,7 +14,7 @@
 
 namespace mirel {
 
-// Everything that one import does.
+// Everything that defines one import.
 struct ImportPlan {
     CsvFormat format;
     QString table;         // its bare name
@@ -22,14 +22,14 @@ struct ImportPlan {
     CellReader::LongTexts longTexts = CellReader::LongTexts::Cut;
 };
 
-// What came of it. Nothing that was left out goes unsaid.
+// The outcome. Everything that was left out is reported.
 struct ImportReport {
-    qint64 records = 0;    // that are in the table now
+    qint64 records = 0;    // added to the table
     qint64 cutTexts = 0;   // longer than CellReader::kMaxTextUnits
     qint64 cutNumbers = 0; // texts that held more than a number
     bool stopped = false;  // the user stopped it
 
-    // What to tell: the number of records when there are any, and what was left out.
+    // The messages: the number of records, and what was left out.
     UserMessage Count() const { return {Str::RecordsImported, {QString::number(records)}}; }
     std::vector<UserMessage> Warnings() const;
 };
@@ -42,9 +42,9 @@ struct ImportReport {
 [[nodiscard]] bool GuessColumns(QIODevice& file, const CsvFormat& format, ImportColumns& columns,
                                 UserPrompt& prompt);
 
-// Appends one record per line of the file to the plan's table, as one transaction. At the first line that fails
-// it ends: the failure is told with line and column, the records before it stay, the line's own does not. So
-// it is when the user stops it, without a word. False when a line failed or nothing could be written at all.
+// Appends one record per line of the file to the plan's table, as one transaction. It ends at the
+// first line that fails: the failure is reported with line and column, and the records before that line stay. It
+// ends the same way, without a message, when the user stops it. False when a line failed or nothing was written.
 [[nodiscard]] bool ImportCsv(DbConnection& connection, const QString& database, QIODevice& file,
                              const ImportPlan& plan, UserPrompt& prompt, ImportReport& report);
 

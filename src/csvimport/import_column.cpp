@@ -41,7 +41,7 @@ bool ReadType(const QString& name, FieldType& type, UserMessage& fault)
     return Refuse(fault, Str::ImportUnknownType, {name, known.join(u", "_s)});
 }
 
-// Cuts the next item off the front of a column list: up to the next "," that stands outside of brackets.
+// Cuts the next item off the front of a column list: up to the next "," outside brackets.
 QString CutItem(QStringView& rest)
 {
     qsizetype end = 0;
@@ -187,7 +187,7 @@ bool MatchInOrder(const QString& table, std::span<const ResultField> fields, int
         return Refuse(fault, Str::ImportMoreColumnsThanFields,
                       {QString::number(count), table, QString::number(fields.size())});
     columns.clear();
-    for (const ResultField& field : fields.first(size_t(count))) {
+    for (const ResultField& field : fields) {
         ImportColumn column;
         column.field = field.name;
         column.type = field.type;

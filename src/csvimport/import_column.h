@@ -28,14 +28,14 @@ struct ImportColumn {
 
 using ImportColumns = std::vector<ImportColumn>;
 
-// The functions below are false, with the reason in `fault` and `columns` as they were, when what they are given
-// does not fit.
+// The functions below return false when their input does not fit, with the reason in `fault` and `columns`
+// unchanged.
 
-// "Name:Type[:Size],…", the file's columns in order; "-" ignores one. The name may stand in brackets, then it may
-// hold "," and ":". A column without a type is a Text of 255.
+// "Name:Type[:Size],…", the file's columns in order; "-" ignores one. A name in brackets may
+// contain "," and ":". A column without a type is a Text of 255.
 [[nodiscard]] bool ParseColumnList(const QString& list, ImportColumns& columns, UserMessage& fault);
 
-// Columns of a new table: the names that the file's first line gives, made fit for fields where they are not.
+// Columns of a new table, named by the file's first line; unusable names are adapted.
 ImportColumns ColumnsNamed(const QStringList& names);
 // "Field1", "Field2", … of Text 255.
 ImportColumns NumberedColumns(int count);
@@ -44,14 +44,15 @@ ImportColumns NumberedColumns(int count);
 // their spelling and types.
 [[nodiscard]] bool MatchByName(const QString& table, std::span<const ResultField> fields, ImportColumns& columns,
                                UserMessage& fault);
-// The first of the file's `count` columns goes to the first field, and so on.
+// The file's columns go to the table's fields in order, one for each field, although the first line has only
+// `count` texts: later lines may have more. More texts than fields are refused.
 [[nodiscard]] bool MatchInOrder(const QString& table, std::span<const ResultField> fields, int count,
                                 ImportColumns& columns, UserMessage& fault);
 
-// Whether a table can be made of them: at least one is not ignored, sizes are 1 to 255, names are there once.
+// Whether they can make a table: at least one is not ignored, sizes are 1 to 255, no name occurs twice.
 [[nodiscard]] bool CheckNewColumns(const ImportColumns& columns, UserMessage& fault);
 
-// The statement that makes the table.
+// The statement that creates the table.
 QString CreateTableStatement(const QString& table, const ImportColumns& columns);
 
 } // namespace mirel

@@ -7,8 +7,8 @@
 
 namespace mirel {
 
-// Finds the type that takes every text of a file's column and loses nothing of it: Integer, Double, DateTime,
-// Text or Memo. Numbers written with leading zeros or a plus sign are codes, and so texts; so is a number with
+// Finds the type that can hold every text of a file's column without loss: Integer, Double, DateTime, Text or
+// Memo. Numbers written with leading zeros or a plus sign are codes, and so texts; so is a number with
 // more digits than a Double keeps. Dates are those of the file's format, or all of them ISO dates.
 class TypeGuess {
 public:

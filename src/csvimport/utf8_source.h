@@ -8,9 +8,9 @@
 
 namespace mirel {
 
-// The bytes of a text file as UTF-8, block by block, whatever its encoding. A byte-order mark is left out; one
-// of UTF-16 or UTF-32 chooses that encoding over UTF-8. UTF-8 itself passes through unchecked: whoever cuts it
-// up also checks it, piece by piece.
+// The bytes of a text file as UTF-8, block by block, whatever its encoding. A byte-order mark is dropped; one
+// of UTF-16 or UTF-32 chooses that encoding over UTF-8. UTF-8 passes through unchecked: the code that cuts
+// it up also checks it, piece by piece.
 //
 // The device is open for reading and outlives the source.
 class Utf8Source {

@@ -24,16 +24,16 @@ public:
 
     // The user's tables by name; the catalog's own tables and the stamp table are left out.
     bool ListTables(const QString& database, QStringList& tables);
-    // The stamp, empty when the database bears none. False when the statement failed.
+    // The stamp, empty when the database has none. False when the statement failed.
     bool FindDatabaseStamp(const QString& database, QString& stamp);
-    // Whether that database bears the stamp. Says nothing when it cannot be read; it then bears none.
+    // Whether that database has the stamp. Reports nothing: a database that cannot be read has none.
     bool BearsStamp(const QString& database, const QString& stamp);
-    // Gives the database a stamp that no file in `folderOfSideFiles` bears yet. Says nothing when it fails:
-    // a database that cannot be written is opened without a stamp.
+    // Gives the database a stamp that no file in `folderOfSideFiles` has yet. Reports no failure: a database that
+    // cannot be written is opened without a stamp.
     bool EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp);
     bool ListFields(const QString& table, const QString& database, QStringList& fields);
-    // The index on a field: its name and flags (bit 0 descending, bit 1 unique). True, with an empty name and
-    // flags 0, also when there is none.
+    // The index on a field: its name and flags (bit 0 descending, bit 1 unique). Without an
+    // index the call succeeds too, with an empty name and flags 0.
     bool FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
                         int& flags);
     // Runs a statement that yields no rows.
@@ -44,7 +44,7 @@ private:
     UserPrompt& prompt_;
 };
 
-// The side file of a database: where its forms and saved queries lie, "<folder>/Mirel_<stamp>.RAF".
+// The side file of a database, which holds its forms and saved queries: "<folder>/Mirel_<stamp>.RAF".
 QString SideFilePath(const QString& folder, const QString& stamp);
 
 // A name in brackets, whatever it holds: "]" is written doubled.

@@ -8,15 +8,15 @@
 
 namespace mirel {
 
-// The application's one connection to its data provider. Databases are not opened on it: every result names
-// its database file. Must outlive every DbRecordset made with it.
+// The application's single connection to its data provider. It opens no database by itself: every result names its
+// database file. Must outlive every DbRecordset made with it.
 class DbConnection {
 public:
     explicit DbConnection(const QString& provider = QStringLiteral("cedb"));
     ~DbConnection();
     Q_DISABLE_COPY_MOVE(DbConnection)
 
-    // Null when there is no provider of that name; every Open then fails.
+    // Null when no provider has that name; every Open then fails.
     ProviderConnection* Provider() const { return provider_.get(); }
 
 private:

@@ -1,10 +1,20 @@
 #include "data/db_recordset.h"
 
 #include "platform/user_locale.h"
+#include "provider/dialect/parser.h"
+#include "resources/string_table.h"
 
 #include <algorithm>
 
 namespace mirel {
+
+bool OnlyReads(const QString& statement)
+{
+    const dialect::ParseResult parsed = dialect::ParseStatement(statement);
+    const auto* tree = std::get_if<dialect::Statement>(&parsed);
+    return !tree || std::holds_alternative<dialect::Select>(*tree) ||
+           std::holds_alternative<dialect::WholeTable>(*tree);
+}
 
 DbRecordset::DbRecordset(DbConnection& connection)
     : cursor_(connection.Provider() ? connection.Provider()->CreateRecordset() : nullptr)
@@ -31,15 +41,27 @@ bool DbRecordset::Open(const QString& source, const QString& database, CursorTyp
     return open_;
 }
 
+bool DbRecordset::OpenSource(const QString& source, const QString& database, CursorType cursor, LockType lock)
+{
+    if (OnlyReads(source))
+        return Open(source, database, cursor, lock);
+    Close();
+    isNoSource_ = true;
+    return Keep(Hr::SyntaxError);
+}
+
 void DbRecordset::Close()
 {
     if (open_)
         cursor_->Close();
     open_ = false;
+    isNoSource_ = false;
 }
 
 QString DbRecordset::ErrorContext() const
 {
+    if (isNoSource_)
+        return StringText(Str::OnlySelectIsRead);
     return cursor_ ? cursor_->ErrorContext() : QString();
 }
 

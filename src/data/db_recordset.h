@@ -10,14 +10,18 @@
 
 namespace mirel {
 
+// Whether the statement yields records and does nothing else: a SELECT, or the bare name of a table. True also
+// for a text that does not parse: the provider then says what is wrong with it.
+bool OnlyReads(const QString& statement);
+
 // One open result: the rows of a table or of a SELECT, and a current position in them. Every statement of the
-// system runs through Open, those without rows as well.
+// system runs through Open, even those that return no rows.
 //
-// Positions count from 0. After Open the recordset stands on the first record, or at the end when there is
-// none. Field indexes count from 0 in the order of the result's columns.
+// Positions count from 0. After Open the first record is current, or the recordset is at its end if it has no
+// records. Field indexes count from 0 in the order of the result's columns.
 //
 // Owns its cursor and closes it when destroyed; the connection must outlive it. A call that fails returns false
-// and leaves the position where it was; LastResult() says why. Missing fields give neutral values.
+// and keeps the position; LastResult() says why. Missing fields give neutral values.
 class DbRecordset {
 public:
     explicit DbRecordset(DbConnection& connection);
@@ -27,6 +31,10 @@ public:
     // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
     // with the full path `database`. CREATE and DROP DATABASE take an empty path.
     [[nodiscard]] bool Open(const QString& source, const QString& database, CursorType cursor, LockType lock);
+    // The same for a source: what is shown, exported, summed up or changed as a whole. That is a table or a
+    // SELECT; any other statement is refused before it runs (SyntaxError, with the reason as context).
+    [[nodiscard]] bool OpenSource(const QString& source, const QString& database, CursorType cursor,
+                                  LockType lock);
     void Close();
     bool IsOpen() const { return open_; }
 
@@ -42,7 +50,7 @@ public:
     int FieldSize(int index) const;         // -1: no such column, or no limit
     std::span<const ResultField> Fields() const;
 
-    // Moves past either end stop there and are no failure.
+    // A move past either end stops there and succeeds.
     [[nodiscard]] bool MoveFirst();
     [[nodiscard]] bool MoveLast();
     [[nodiscard]] bool MoveNext();
@@ -83,10 +91,11 @@ public:
     [[nodiscard]] bool DeleteAll(qint64 confirmed, const BulkProgress& progress);
 
 private:
-    bool Keep(Hr result) const; // remembers the result; true when it is no failure
+    bool Keep(Hr result) const; // remembers the result; true for success
 
     std::unique_ptr<ProviderRecordset> cursor_;
     bool open_ = false;
+    bool isNoSource_ = false; // OpenSource refused the statement
     mutable Hr lastResult_ = Hr::Ok;
 };
 

@@ -6,12 +6,12 @@
 
 namespace mirel {
 
-// The names under which people see the storage types ("Text", "Memo", "Yes/No", …). False, and `name` as it
-// was, for a type that has none.
+// The names that people see for the storage types ("Text", "Memo", "Yes/No", …). False, with `name` unchanged,
+// for a type without a name.
 bool TypeNameOfField(FieldType type, QString& name);
 
-// The type clause of CREATE TABLE for such a name: exact, case counts; "Boolean" is taken beside "Yes/No"; any
-// other name gives "Text", the long text. `size` counts for "Text" alone, which becomes Varchar(size).
+// The type clause of CREATE TABLE for such a name: exact, case counts; "Boolean" is accepted for "Yes/No"; any
+// other name gives "Text", the long text. `size` matters only for "Text", which becomes Varchar(size).
 QString DdlTypeOfName(QStringView name, int size);
 
 } // namespace mirel

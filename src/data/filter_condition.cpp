@@ -20,7 +20,7 @@ struct TextOperator {
     std::u16string_view name;
     std::u16string_view pattern; // %1 the field, %2 the value with its quotes doubled
 };
-// A "%" of the pattern is a wildcard of LIKE: it stands doubled nowhere, only %1 and %2 are places.
+// A "%" in the pattern is a wildcard of LIKE and never doubled; only %1 and %2 are placeholders.
 constexpr std::array kTextOperators = {
     TextOperator{u"contains", u"%1 LIKE '%%2%'"},           TextOperator{u"begins with", u"%1 LIKE '%2%'"},
     TextOperator{u"ends with", u"%1 LIKE '%%2'"},           TextOperator{u"not contains", u"%1 NOT LIKE '%%2%'"},

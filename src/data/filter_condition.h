@@ -13,17 +13,17 @@ namespace mirel {
 
 enum class CellFilter { BySelection, ExcludingSelection };
 
-// The condition that keeps, or leaves out, the records whose field equals this cell. `reference` is the field as
-// it stands in a statement, `displayText` what the cell shows, uncut.
+// The condition that keeps or excludes the records whose field equals this cell. `reference` is the field as a
+// statement writes it, `displayText` the full text of the cell.
 QString ConditionFromCell(CellFilter filter, const QString& reference, FieldType type, const Value& value,
                           const QString& displayText, const YesNoWords& words);
 
-// The operators that a filter offers for a type, in the order in which it offers them; none for a type that
-// cannot be compared. `range`: those of a From-To filter.
+// The operators that a filter offers for a type, in order; none for a type that cannot be compared. `range`: those
+// of a From-To filter.
 enum class FilterKind { Single, Range };
 std::span<const std::u16string_view> FilterOperators(FieldType type, FilterKind kind = FilterKind::Single);
 
-// What a person puts together in the filter dialog: a field, an operator and a value, or two of them.
+// The contents of the filter dialog: a field, an operator and a value, or two of each.
 struct FilterDraft {
     QString table;
     QString field;
@@ -34,15 +34,15 @@ struct FilterDraft {
     QString toOperatorText;
     QString toValueText;
 
-    // The operator that a Yes/No filter begins with for a cell that shows `displayText`.
+    // The operator with which a Yes/No filter starts on a cell that shows `displayText`.
     static QString PresetYesNo(QStringView displayText);
 
-    // Empty when no table or field is chosen, or the operator fits no condition: the dialog then acts as Cancel.
+    // Empty when no table or field is chosen or the operator makes no condition: the dialog then acts as Cancel.
     QString Condition() const;
 };
 
-// What is typed into a sort box when a person picks a field or a direction there: the text in front of it
-// decides about the comma and the blank.
+// The text that a sort box receives when a person picks a field or a direction; the text before it decides about
+// the comma and the blank.
 QString SortFieldInsertion(const QString& box, const QString& table, const QString& field);
 QString WordInsertion(const QString& box, const QString& word);
 

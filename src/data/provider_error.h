@@ -10,8 +10,8 @@ namespace mirel {
 // be null) tells a read-only join from a faulty command.
 QString ProviderErrorText(const DbRecordset* recordset, Hr hr, const QString& context);
 
-// The single place where a failure of the provider becomes a message to the user. Nothing happens when `hr` is
-// no failure, or says that the user stopped it.
+// The single place where a failure of the provider becomes a message to the user. Does nothing when `hr` is a
+// success, or when the user stopped the work.
 void ReportProviderError(UserPrompt& prompt, const DbRecordset* recordset, Hr hr);
 
 } // namespace mirel

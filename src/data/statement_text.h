@@ -9,9 +9,9 @@
 
 namespace mirel {
 
-// Filters and sorts are rewrites of a SELECT's text, run again afterwards. These work on the text alone: what
-// they make of a statement that has clauses in another order, or none that they know, is for the provider to
-// judge.
+// Filters and sorts rewrite the text of a SELECT, which then runs again. These functions only see the text: if the
+// clauses of a statement are unknown or in another order, the provider judges what they make of
+// it.
 
 // Where `keyword` first stands as a whole word, case ignored: at the start or after a blank, and followed by the
 // end, "(" or a blank; tabs and line ends are blanks. Quoted text and names in brackets are skipped. -1: nowhere.
@@ -30,13 +30,14 @@ QString FieldReferenceIn(std::span<const ResultField> result, int field);
 // The statement ordered by `terms` ("[Name] ASC"), whatever its order was before.
 QString WithOrder(const QString& statement, const QString& terms);
 
-// What stands between SELECT and FROM, a text a column, without DISTINCT. Empty when one of the two is missing.
+// The columns between SELECT and FROM, one text each, without DISTINCT. Empty when either keyword is missing.
 QStringList SelectList(QStringView statement);
 
-// The statement from its FROM on, with these columns as its select list, written as they are. DISTINCT stays.
+// The statement with these columns as its select list, written unchanged. DISTINCT stays.
 QString WithSelectList(const QString& statement, const QStringList& columns);
 
-// Whether parentheses, square brackets and quotes are closed in order. A doubled quote ends a text and begins one.
+// Whether parentheses, square brackets and quotes are closed in order. A doubled quote ends one text and begins
+// another.
 bool IsBalanced(QStringView statement);
 
 } // namespace mirel

@@ -8,7 +8,7 @@
 namespace mirel {
 namespace {
 
-// Where year, month and day stand among the three date fields, by the number of the order.
+// The places of year, month and day among the three date fields, by the number of the order.
 struct FieldPlaces {
     int year;
     int month;
@@ -87,7 +87,7 @@ qint64 FullYear(qint64 year)
     return year >= 0 && year <= 29 ? 2000 + year : 1900 + year;
 }
 
-// No date or time field is longer than a year; -1 makes what is no number, or none of that size, no date.
+// No date or time field is longer than a year. -1, for anything else, is not part of any date.
 int FieldOrNone(std::optional<qint64> number)
 {
     return number && *number >= 0 && *number <= 9999 ? int(*number) : -1;
@@ -263,6 +263,26 @@ std::optional<double> ParseDateFields(const DateFormat& format, std::string_view
         !ReadTime(Separator(format.timeSeparator), rest.substr(blank + 1), parts)) {
         return {};
     }
+    return OleDate(parts);
+}
+
+std::optional<double> ParseTimeFields(const DateFormat& format, std::string_view utf8)
+{
+    const auto isNumber = [](std::string_view field) {
+        return field.size() >= 1 && field.size() <= 2 &&
+               std::ranges::all_of(field, [](char byte) { return byte >= '0' && byte <= '9'; });
+    };
+    const Separator separator(format.timeSeparator);
+    std::string_view second = utf8;
+    const std::optional<std::string_view> hour = separator.CutField(second);
+    const std::optional<std::string_view> minute = hour ? separator.CutField(second) : std::nullopt;
+    if (format.order == DateOrder::Locale || !minute || !isNumber(*hour) || !isNumber(*minute) ||
+        !isNumber(second))
+        return {};
+    DateParts parts; // of the base date
+    parts.hour = FieldOrNone(LeadingNumber(*hour));
+    parts.minute = FieldOrNone(LeadingNumber(*minute));
+    parts.second = FieldOrNone(LeadingNumber(second));
     return OleDate(parts);
 }
 

@@ -10,8 +10,8 @@ namespace mirel {
 
 // One run over a tree; for the operators and functions of the language only.
 //
-// The texts that a run makes are limited all together, so that no expression, however it nests REPLACE, can use
-// up the memory: what goes beyond is null.
+// The texts that one run makes share a limit, so that no expression can use up the memory, however it nests
+// REPLACE. Beyond the limit the result is null.
 struct Evaluation {
     EvalContext& context;
     qint64 unitsLeft = qint64(1) << 26; // UTF-16 units
@@ -31,7 +31,7 @@ inline void Evaluate(ExprNode& node, Evaluation& evaluation)
         node.evaluate(node, evaluation);
 }
 
-// Whether an evaluated node holds where a condition is wanted: a number other than 0.
+// Whether an evaluated node holds as a condition: a number other than 0 does.
 inline bool Holds(const ExprNode& node)
 {
     if (node.null || node.isText)
@@ -46,22 +46,23 @@ inline void SetNull(ExprNode& node)
     node.fieldType = FieldType::None;
 }
 
-// What is no number, or beyond all numbers, is null.
+// Null for infinity and for what is not a number.
 inline void SetNumber(ExprNode& node, double number)
 {
     node.null = !std::isfinite(number);
     node.isText = false;
     node.fieldType = FieldType::None;
     node.valueNumber = number + 0.0; // -0 becomes 0
+    node.wholeNumber = 0;
 }
 
-// From here on a double has no number of its own for each whole one: a field's stands in its node's buffer, to the
-// last digit.
-inline constexpr double kBeyondDoubles = 9007199254740992.0;
-
-inline bool HasDigitsInBuffer(const ExprNode& node)
+// An integer with all of its digits, for the text that shows it; expressions calculate with the rounded number.
+inline void SetWholeNumber(ExprNode& node, qint64 number)
 {
-    return node.code == OpCode::Field && std::abs(node.valueNumber) >= kBeyondDoubles && !node.buffer.View().isEmpty();
+    constexpr qint64 kExact = qint64(1) << 53;
+    SetNumber(node, double(number));
+    if (number < -kExact || number > kExact)
+        node.wholeNumber = number;
 }
 
 // `text` must outlive the evaluation.
@@ -75,17 +76,17 @@ inline void SetText(ExprNode& node, QStringView text)
     node.valueText = text;
 }
 
-// Null for days outside of the calendar.
+// Null for days outside the calendar.
 void SetDate(ExprNode& node, std::optional<double> oleDays);
 
-// Makes what stands in the node's buffer its value.
+// Makes the text in the node's buffer its value.
 inline void KeepBuffer(ExprNode& node)
 {
     SetText(node, node.buffer.View());
 }
 
-// Moves the text of an evaluated child into the node's buffer where the child computed it itself: it has no more
-// use for it. False, and the buffer as it was, for a text that stands elsewhere.
+// Moves the text of an evaluated child into the node's buffer if the child computed it itself and so no longer
+// needs it. False, with the buffer unchanged, for a text that lives elsewhere.
 inline bool TakeBuffer(ExprNode& node, ExprNode& child)
 {
     const QStringView text = TextOf(child);

@@ -18,10 +18,11 @@ void ResolveColumn(ExprNode& node, EvalContext& context)
     node.columnsId = context.ColumnsId();
 }
 
-// A column whose type nobody knows takes the type of what it holds.
+// A column of no type takes the type of what it holds. A text in a column of another type does not
+// convert to that type, so it stays a text.
 FieldType TypeToRead(FieldType columnType, const Value& value)
 {
-    if (columnType != FieldType::None)
+    if (columnType != FieldType::None && value.Tag() != ValueTag::Text)
         return columnType;
     switch (value.Tag()) {
     case ValueTag::SmallInt:
@@ -43,15 +44,20 @@ FieldType TypeToRead(FieldType columnType, const Value& value)
     return FieldType::None;
 }
 
-void ReadField(ExprNode& node, const Value& value, EvalContext& context)
+void ReadValue(ExprNode& node, const Value& value, EvalContext& context)
 {
+    if (value.IsNull()) {
+        SetNull(node);
+        return;
+    }
     switch (TypeToRead(node.columnType, value)) {
     case FieldType::SmallInt:
     case FieldType::Integer:
     case FieldType::Double:
-        SetNumber(node, value.Number());
-        if (std::abs(node.valueNumber) >= kBeyondDoubles)
-            node.buffer.Assign(value.WholeNumber() ? VariantText(value) : QString());
+        if (const std::optional<qint64> whole = value.WholeNumber())
+            SetWholeNumber(node, *whole);
+        else
+            SetNumber(node, value.Number());
         return;
     case FieldType::Date:
         SetDate(node, value.Number());
@@ -72,6 +78,31 @@ void ReadField(ExprNode& node, const Value& value, EvalContext& context)
         node.buffer.Assign(VariantText(value));
         KeepBuffer(node);
         return;
+    }
+}
+
+bool IsNumeric(FieldType type)
+{
+    return type == FieldType::SmallInt || type == FieldType::Integer || type == FieldType::Double;
+}
+
+// Numbers and texts, which walks mostly meet, are read off the cell; a Value tells the rest.
+void ReadCell(ExprNode& node, const Cell& cell, EvalContext& context)
+{
+    const bool takesNumber = IsNumeric(node.columnType) || node.columnType == FieldType::None;
+    if (cell.kind == Cell::Kind::Null) {
+        SetNull(node);
+    } else if (cell.kind == Cell::Kind::Integer && takesNumber) {
+        SetWholeNumber(node, cell.integer);
+    } else if (cell.kind == Cell::Kind::Real && takesNumber) {
+        SetNumber(node, cell.real);
+    } else if (cell.kind == Cell::Kind::Text && node.columnType != FieldType::Date) {
+        node.buffer.AssignUtf8(cell.bytes);
+        KeepBuffer(node);
+    } else if (cell.kind == Cell::Kind::Binary) {
+        SetText(node, {});
+    } else {
+        ReadValue(node, context.FieldValue(node.column), context);
     }
 }
 
@@ -115,12 +146,13 @@ void EvaluateField(ExprNode& node, Evaluation& evaluation)
         node.null = context.Position() < 0 && context.RecordCount() == 0;
         return;
     }
-    const Value& value = context.FieldValue(node.column);
-    if (value.IsNull())
-        SetNull(node);
+    if (const Cell* cell = context.FieldCell(node.column))
+        ReadCell(node, *cell, context);
     else
-        ReadField(node, value, context);
-    node.fieldType = node.columnType;
+        ReadValue(node, context.FieldValue(node.column), context);
+    // Only what reads as a date is one.
+    if (node.columnType != FieldType::Date || node.null)
+        node.fieldType = node.columnType;
 }
 
 void EvaluateControl(ExprNode& node, Evaluation& evaluation)
@@ -151,13 +183,16 @@ void WriteDateText(ExprNode& node)
     node.dateTextDue = false;
 }
 
+ExprNumberChars NumberChars(const ExprNode& node)
+{
+    return node.wholeNumber != 0 ? ExprNumberChars(node.wholeNumber) : ExprNumberChars(node.valueNumber);
+}
+
 QString ShownText(ExprNode& node)
 {
     if (node.null || node.suppressed)
         return {};
-    if (node.isText)
-        return TextOf(node).toString();
-    return HasDigitsInBuffer(node) ? node.buffer.View().toString() : ExprNumberText(node.valueNumber);
+    return node.isText ? TextOf(node).toString() : QString(NumberChars(node).Text());
 }
 
 void SetDate(ExprNode& node, std::optional<double> oleDays)

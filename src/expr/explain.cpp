@@ -23,7 +23,7 @@ bool IsComparison(const ExprNode& node)
            node.code != OpCode::Where;
 }
 
-// A minus that stands before what it negates.
+// A minus in front of what it negates.
 bool IsLeadingMinus(const ExprNode& node)
 {
     return node.code == OpCode::Subtract && (!node.args[0] || node.args[0]->position > node.position);

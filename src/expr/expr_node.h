@@ -50,7 +50,7 @@ enum class OpCode : int {
     Less = 59,
     Not = 60,
     Null = 61,
-    Sum = 109, // functions stand from 101 on; only those are named here that more than their table row knows
+    Sum = 109, // functions start at 101; only those used outside their table row have names here
     Avg = 110,
     Max = 111,
     Min = 112,
@@ -65,33 +65,36 @@ enum class OpCode : int {
 
 using ExprTree = std::unique_ptr<ExprNode>;
 
-// One node of a parsed expression; it owns its children, and the tree goes when its root goes. Made by
-// ParseExpression, evaluated in place by EvaluateExpression, again and again.
+// One node of a parsed expression; it owns its children, so destroying the root destroys the tree. Made by
+// ParseExpression, evaluated in place by EvaluateExpression as often as needed.
 struct ExprNode {
     // The value that the last evaluation left. A number has isText false. A text has isText true and
     // valueNumber 0. A date has isText true, fieldType Date and its day number in valueNumber; a Yes/No field
-    // is a text too, with 0 or 1 in valueNumber. With `null` set the rest says nothing.
+    // is a text too, with 0 or 1 in valueNumber. With `null` set the rest is meaningless.
     bool isText = false;
     bool null = false;
     bool suppressed = false; // the condition of WHERE did not hold
 
-    bool parenthesised = false; // stood in parentheses: no later operator takes it apart
+    bool parenthesised = false; // in parentheses: no later operator takes it apart
     bool negated = false;       // NOT
-    bool constant = false;      // a number that stays what it is
-    bool dateTextDue = false;   // valueText of a date is written when first asked for, see TextOf
+    bool constant = false;      // a number that never changes
+    bool dateTextDue = false;   // valueText of a date is made on demand, see TextOf
     NodeKind kind = NodeKind::Operand;
     OpCode code = OpCode::None;
     FieldType fieldType = FieldType::None; // of a field; Date for dates
     double valueNumber = 0;
+    // The digits of a number that `valueNumber` rounds: an integer field's beyond 53 bits. 0 for every other
+    // value.
+    qint64 wholeNumber = 0;
 
-    // Points into this node, into a child or into what the context lends: good until the next evaluation.
+    // Points into this node, into a child or into what the context lends: valid until the next evaluation.
     QStringView valueText;
 
-    // How the value comes about; null where it stands as it is (literals, aggregates).
+    // Computes the value; null where the value is fixed (literals, aggregates).
     void (*evaluate)(ExprNode& node, Evaluation& evaluation) = nullptr;
     const FunctionDef* function = nullptr;
 
-    // The column of a field name, resolved once for each set of columns; -1: no field bears the name.
+    // The column of a field name, resolved once for each set of columns; -1: no such field.
     int column = -1;
     FieldType columnType = FieldType::None;
     quint64 columnsId = 0;
@@ -108,7 +111,7 @@ inline bool IsArithmetic(const ExprNode& node)
     return node.kind == NodeKind::TwoArguments && int(node.code) < 101;
 }
 
-// The places where a function's arguments hang, in their order. Empty for other nodes.
+// The slots of a function's arguments, in order. Empty for other nodes.
 std::span<ExprTree> ArgumentSlots(ExprNode& node);
 std::span<const ExprTree> ArgumentSlots(const ExprNode& node);
 

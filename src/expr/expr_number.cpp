@@ -82,20 +82,30 @@ private:
 
 } // namespace
 
+ExprNumberChars::ExprNumberChars(qint64 number)
+{
+    Write(number);
+}
+
+void ExprNumberChars::Write(qint64 number)
+{
+    length_ = std::to_chars(characters_.begin(), characters_.end(), number).ptr - characters_.data();
+}
+
 ExprNumberChars::ExprNumberChars(double number)
 {
+    constexpr double kBeyondIntegers = 9.2e18;
     const bool whole = number == std::trunc(number);
+    if (whole && std::abs(number) < kBeyondIntegers) { // most are, and integers are quick to write
+        Write(qint64(number));
+        return;
+    }
     const auto written = std::to_chars(characters_.begin(), characters_.end(), number + 0.0,
                                        std::chars_format::fixed, whole ? 0 : 6);
     const char* end = written.ptr;
     while (!whole && end[-1] == '0')
         --end;
     length_ = end - characters_.data();
-}
-
-QString ExprNumberText(double number)
-{
-    return ExprNumberChars(number).Text();
 }
 
 double LeadingDecimal(QStringView text)

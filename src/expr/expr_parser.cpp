@@ -20,7 +20,7 @@ enum class LevelStart {
     Text,        // the whole expression or one argument: its end, or a ")" that closes nothing
     Parenthesis, // its ")"
     Condition,   // one side of AND and OR: the next of them
-    Where,       // the condition of WHERE: the end of what it stands in
+    Where,       // the condition of WHERE: the end of the enclosing level
 };
 
 // A stretch of tokens with the tree built from it so far.
@@ -28,7 +28,7 @@ struct Level {
     LevelStart start;
     ExprTree root;
     ExprNode* last = nullptr;            // the last node hung; null behind a group, a NOT and what was left out
-    std::optional<qsizetype> pendingNot; // where it stands
+    std::optional<qsizetype> pendingNot; // its position
 };
 
 bool IsHigher(const ExprNode& node) // binds more tightly than + and -
@@ -46,12 +46,6 @@ bool TakesManyArguments(const ExprNode& node)
     return node.kind == NodeKind::ThreeArguments || node.kind == NodeKind::FourArguments;
 }
 
-QString WithoutBrackets(QString name)
-{
-    name.remove(u'[').remove(u']');
-    return name;
-}
-
 void MakeNumber(ExprNode& node, double number)
 {
     node.code = OpCode::Number;
@@ -65,7 +59,7 @@ void MakeOperand(ExprNode& node, const QString& token)
     if (token.startsWith(u'&')) {
         node.code = OpCode::Control;
         node.evaluate = EvaluateControl;
-        node.text = TrimmedSpaces(WithoutBrackets(token.sliced(1))).toString();
+        node.text = TrimmedSpaces(BareName(token.sliced(1))).toString();
     } else if (token.startsWith(u'\'') || token.startsWith(u'"')) {
         node.code = OpCode::Text;
         node.text = token.sliced(1).chopped(token.size() > 1 ? 1 : 0);

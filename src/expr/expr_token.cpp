@@ -40,7 +40,7 @@ public:
         if (IsQuote(first))
             return RunTo(first, start_ + 1);
         if (first == u'[' || text_.sliced(start_).startsWith(u"&["))
-            return RunTo(u']', start_);
+            return RunToBracket(start_);
         if (StandsAlone(first)) {
             ++position_;
             return Collected();
@@ -63,7 +63,16 @@ private:
         return Collected();
     }
 
-    // What was collected with the comparison character that stands here, and the one that may follow after blanks.
+    // Between brackets "]]" is a "]" of the name.
+    QString RunToBracket(qsizetype from)
+    {
+        QString token = RunTo(u']', from);
+        while (position_ < text_.size() && text_[position_] == u']' && text_.indexOf(u']', position_ + 1) > 0)
+            token = RunTo(u']', position_ + 1);
+        return token;
+    }
+
+    // The token so far with the comparison character at this place, and the one that may follow after blanks.
     QString WithComparison()
     {
         const bool onlyEqual = mode_ == ExprMode::Condition && text_[position_] == u'!';
@@ -81,7 +90,7 @@ private:
         for (; position_ < text_.size(); ++position_) {
             const QChar c = text_[position_];
             if (c == u'[')
-                return RunTo(u']', position_);
+                return RunToBracket(position_);
             if (IsBlank(c) || StandsAlone(c))
                 break;
             if (!IsComparison(c))
@@ -140,6 +149,23 @@ std::optional<ExprToken> NextExpressionToken(QStringView text, qsizetype& positi
     ExprToken token{reader.Read(), position};
     position = reader.Position();
     return token;
+}
+
+QString BareName(QStringView written)
+{
+    QString name;
+    bool inside = false;
+    for (qsizetype i = 0; i < written.size(); ++i) {
+        const QChar c = written[i];
+        const bool isDoubled = inside && c == u']' && i + 1 < written.size() && written[i + 1] == u']';
+        if (isDoubled)
+            ++i;
+        if (isDoubled || (c != u']' && (inside || c != u'[')))
+            name += c;
+        else
+            inside = c == u'[';
+    }
+    return name;
 }
 
 qsizetype FindClosingParenthesis(QStringView text, qsizetype from)

@@ -210,10 +210,7 @@ void FnToChar(ExprNode& node, Evaluation&)
         return;
     }
     node.buffer.Resize(0);
-    if (HasDigitsInBuffer(argument))
-        node.buffer.Append(argument.buffer.View());
-    else
-        node.buffer.Append(ExprNumberChars(argument.valueNumber).Text());
+    node.buffer.Append(NumberChars(argument).Text());
     KeepBuffer(node);
 }
 
@@ -367,22 +364,22 @@ constexpr auto kDate = ResultKind::Date;
 constexpr std::array kFunctions = {
     FunctionDef{u"SUM", kOne, 109, nullptr, "a", kNumber, u"SUM(expression): the sum over all records of a form's result"},
     FunctionDef{u"AVG", kOne, 110, nullptr, "a", kNumber, u"AVG(expression): the average over all records of a form's result"},
-    FunctionDef{u"MAX", kOne, 111, nullptr, "a", kNumber, u"MAX(expression): the greatest value in all records of a form's result"},
-    FunctionDef{u"MIN", kOne, 112, nullptr, "a", kNumber, u"MIN(expression): the least value in all records of a form's result"},
+    FunctionDef{u"MAX", kOne, 111, nullptr, "a", kNumber, u"MAX(expression): the greatest value over all records of a form's result"},
+    FunctionDef{u"MIN", kOne, 112, nullptr, "a", kNumber, u"MIN(expression): the smallest value over all records of a form's result"},
     FunctionDef{u"SYSTIME", kOne, 118, FnSysTime, "", kText, u"SYSTIME(): the time of day, as text"},
     FunctionDef{u"SYSDATE", kOne, 128, FnSysDate, "", kDate, u"SYSDATE(): today"},
     FunctionDef{u"SYSDATETIME", kOne, 139, FnSysDateTime, "", kDate, u"SYSDATETIME(): today and the time of day"},
     FunctionDef{u"UPPER", kOne, 119, FnUpper, "t", kText, u"UPPER(text): the text in upper case"},
     FunctionDef{u"LOWER", kOne, 137, FnLower, "t", kText, u"LOWER(text): the text in lower case"},
-    FunctionDef{u"RTRIM", kOne, 122, FnRTrim, "t", kText, u"RTRIM(text): the text without the spaces at its end"},
-    FunctionDef{u"LTRIM", kOne, 123, FnLTrim, "t", kText, u"LTRIM(text): the text without the spaces at its start"},
+    FunctionDef{u"RTRIM", kOne, 122, FnRTrim, "t", kText, u"RTRIM(text): the text without trailing spaces"},
+    FunctionDef{u"LTRIM", kOne, 123, FnLTrim, "t", kText, u"LTRIM(text): the text without leading spaces"},
     FunctionDef{u"TO_CHAR", kOne, 116, FnToChar, "a", kText, u"TO_CHAR(value): the value as text; the empty text for NULL"},
-    FunctionDef{u"TO_NUMBER", kOne, 135, FnToNumber, "t", kNumber, u"TO_NUMBER(text): the number that the text begins with, or 0"},
+    FunctionDef{u"TO_NUMBER", kOne, 135, FnToNumber, "t", kNumber, u"TO_NUMBER(text): the number at the start of the text, or 0"},
     FunctionDef{u"YEAR", kOne, 131, FnYear, "d", kNumber, u"YEAR(date): the year"},
     FunctionDef{u"MONTH", kOne, 130, FnMonth, "d", kNumber, u"MONTH(date): the month, 1 to 12"},
     FunctionDef{u"DAY", kOne, 129, FnDay, "d", kNumber, u"DAY(date): the day of the month"},
     FunctionDef{u"RECNO", kOne, 134, FnRecNo, "", kNumber, u"RECNO(): the number of the current record, from 1"},
-    FunctionDef{u"RECCOUNT", kOne, 133, FnRecCount, "", kNumber, u"RECCOUNT(): how many records the result has"},
+    FunctionDef{u"RECCOUNT", kOne, 133, FnRecCount, "", kNumber, u"RECCOUNT(): the number of records in the result"},
     FunctionDef{u"COUNT", kOne, 140, FnRecCount, "", kNumber, u"COUNT(): the same as RECCOUNT()"},
     FunctionDef{u"SEEKTOTAL", kOne, 114, FnRecCount, "", kNumber, u"SEEKTOTAL(): the same as RECCOUNT()"},
     FunctionDef{u"SIN", kOne, 141, FnMath<std::sin>, "n", kNumber, u"SIN(x): the sine, x in radians"},
@@ -396,27 +393,27 @@ constexpr std::array kFunctions = {
     FunctionDef{u"TANH", kOne, 146, FnMath<std::tanh>, "n", kNumber, u"TANH(x): the hyperbolic tangent"},
     FunctionDef{u"EXP", kOne, 147, FnMath<std::exp>, "n", kNumber, u"EXP(x): e to the power x"},
     FunctionDef{u"SQRT", kOne, 149, FnMath<std::sqrt>, "n", kNumber, u"SQRT(x): the square root"},
-    FunctionDef{u"FLOOR", kOne, 151, FnMath<std::floor>, "n", kNumber, u"FLOOR(x): the greatest whole number not above x"},
-    FunctionDef{u"CEIL", kOne, 152, FnMath<std::ceil>, "n", kNumber, u"CEIL(x): the least whole number not below x"},
-    FunctionDef{u"TO_NUMBER", kOne, 153, FnToNumber, "t", kNumber, u"TO_NUMBER(text): the number that the text begins with, or 0"},
+    FunctionDef{u"FLOOR", kOne, 151, FnMath<std::floor>, "n", kNumber, u"FLOOR(x): the largest whole number up to x"},
+    FunctionDef{u"CEIL", kOne, 152, FnMath<std::ceil>, "n", kNumber, u"CEIL(x): the smallest whole number from x on"},
+    FunctionDef{u"TO_NUMBER", kOne, 153, FnToNumber, "t", kNumber, u"TO_NUMBER(text): the number at the start of the text, or 0"},
     FunctionDef{u"TO_TIMESTR", kOne, 169, FnToTimeStr, "i", kText, u"TO_TIMESTR(seconds): a duration as hours, minutes and seconds"},
     FunctionDef{u"LN", kOne, 156, FnMath<std::log>, "n", kNumber, u"LN(x): the natural logarithm"},
-    FunctionDef{u"INITCAP", kOne, 157, FnInitCap, "t", kText, u"INITCAP(text): the text with the first letter of each word in upper case"},
+    FunctionDef{u"INITCAP", kOne, 157, FnInitCap, "t", kText, u"INITCAP(text): the text with each word capitalized"},
     FunctionDef{u"LENGTH", kOne, 158, FnLength, "t", kNumber, u"LENGTH(text): the number of characters"},
-    FunctionDef{u"LAST_DAY", kOne, 161, FnLastDay, "|d", kNumber, u"LAST_DAY(date): how many days its month has; without a date, the current month"},
-    FunctionDef{u"TO_DATE", kOne, 162, FnToDate, "d", kDate, u"TO_DATE(text): the date that the text shows"},
+    FunctionDef{u"LAST_DAY", kOne, 161, FnLastDay, "|d", kNumber, u"LAST_DAY(date): the number of days in its month; without a date, in the current month"},
+    FunctionDef{u"TO_DATE", kOne, 162, FnToDate, "d", kDate, u"TO_DATE(text): the date in the text"},
     FunctionDef{u"ABS", kOne, 163, FnAbs, "i", kNumber, u"ABS(x): the whole part of x without its sign"},
     FunctionDef{u"LEFT", kTwo, 124, FnLeft, "ti", kText, u"LEFT(text, n): the first n characters"},
     FunctionDef{u"RIGHT", kTwo, 138, FnRight, "ti", kText, u"RIGHT(text, n): the last n characters"},
-    FunctionDef{u"LOG", kTwo, 148, FnLog, "nn", kNumber, u"LOG(base, x): the logarithm of x to that base"},
+    FunctionDef{u"LOG", kTwo, 148, FnLog, "nn", kNumber, u"LOG(base, x): the logarithm of x to the base"},
     FunctionDef{u"POWER", kTwo, 150, FnPower, "nn", kNumber, u"POWER(x, y): x to the power y"},
-    FunctionDef{u"ROUND", kTwo, 154, FnRound<Rounding::Up>, "n|i", kNumber, u"ROUND(x, digits): x rounded to so many decimals, 0 unless given; what is cut off from 5 on always counts upward"},
-    FunctionDef{u"TRUNC", kTwo, 155, FnRound<Rounding::Truncate>, "n|i", kNumber, u"TRUNC(x, digits): x cut to so many decimals, 0 unless given"},
-    FunctionDef{u"ADD_MONTH", kTwo, 160, FnAddMonth, "di", kDate, u"ADD_MONTH(date, n): the date n months later; years count by 13 months, so twelve months from a December give no date"},
+    FunctionDef{u"ROUND", kTwo, 154, FnRound<Rounding::Up>, "n|i", kNumber, u"ROUND(x, digits): x rounded to that many decimals (default 0); a digit of 5 or more always rounds upward"},
+    FunctionDef{u"TRUNC", kTwo, 155, FnRound<Rounding::Truncate>, "n|i", kNumber, u"TRUNC(x, digits): x cut to that many decimals (default 0)"},
+    FunctionDef{u"ADD_MONTH", kTwo, 160, FnAddMonth, "di", kDate, u"ADD_MONTH(date, n): the date n months later; a year counts 13 months, so twelve months after a December is not a date"},
     FunctionDef{u"DIFF_TIME", kTwo, 168, FnDiffTime, "dd", kNumber, u"DIFF_TIME(date2, date1): the seconds from date1 to date2"},
-    FunctionDef{u"SUBSTR", kThree, 117, FnSubstr, "ti|i", kText, u"SUBSTR(text, start, count): count characters from the start-th on; a negative start counts from the end"},
-    FunctionDef{u"REPLACE", kThree, 167, FnReplace, "ttt", kText, u"REPLACE(text, from, to): the text with every from replaced by to"},
-    FunctionDef{u"INSTR", kFour, 159, FnInstr, "tt|ii", kNumber, u"INSTR(text, search, start, occurrence): where search stands in text, or 0; a negative start searches backward"},
+    FunctionDef{u"SUBSTR", kThree, 117, FnSubstr, "ti|i", kText, u"SUBSTR(text, start, count): count characters from position start; a negative start counts from the end"},
+    FunctionDef{u"REPLACE", kThree, 167, FnReplace, "ttt", kText, u"REPLACE(text, from, to): the text with each occurrence of from replaced by to"},
+    FunctionDef{u"INSTR", kFour, 159, FnInstr, "tt|ii", kNumber, u"INSTR(text, search, start, occurrence): the position of search in text, or 0; a negative start searches backward"},
 };
 // clang-format on
 
@@ -460,6 +457,14 @@ void EvaluateFunction(ExprNode& node, Evaluation& evaluation)
         }
     }
     function.evaluate(node, evaluation);
+}
+
+bool AsksForRecordCount(const ExprNode& tree)
+{
+    const bool asks = tree.function && tree.function->evaluate == FnRecCount;
+    return asks || std::ranges::any_of(tree.args, [](const ExprTree& argument) {
+               return argument && AsksForRecordCount(*argument);
+           });
 }
 
 } // namespace mirel

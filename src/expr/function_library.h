@@ -12,13 +12,13 @@ enum class ResultKind { Number, Text, Date };
 // One function of the language. A new one is one row in function_library.cpp and one small function above it.
 struct FunctionDef {
     std::u16string_view name; // in upper case; the first row that fits wins
-    NodeKind kind;            // how many arguments the parser gives it places for
+    NodeKind kind;            // how many argument slots the parser gives it
     int code;                 // never renumber
-    Evaluator evaluate;       // null: the value comes from outside, the evaluator leaves it alone
+    Evaluator evaluate;       // null: the value comes from outside; the evaluator leaves it alone
 
-    // The arguments that count, a letter each: "t" text, "n" number, "i" integer, "d" text of a date, "a"
-    // anything. Those behind "|" may be left out. A null argument makes the result null without a call of
-    // `evaluate`, except for "a".
+    // The arguments, one letter each: "t" text, "n" number, "i" integer, "d" text of a date, "a" anything. Those
+    // after "|" are optional. A null argument makes the result null without a call of `evaluate`, except for
+    // "a".
     std::string_view parameters;
     ResultKind result;
     std::u16string_view help; // "UPPER(text): the text in upper case"
@@ -36,6 +36,9 @@ private:
 };
 
 std::span<const FunctionDef> Functions();
-const FunctionDef* FindFunction(QStringView name); // in any case; null: there is none
+const FunctionDef* FindFunction(QStringView name); // in any case; null: unknown
+
+// Whether the tree asks how many records there are. Counting takes time, so it is left out where nothing asks.
+bool AsksForRecordCount(const ExprNode& tree);
 
 } // namespace mirel

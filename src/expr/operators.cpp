@@ -74,10 +74,8 @@ void AppendValue(TextBuffer& buffer, ExprNode& node)
 {
     if (node.isText)
         buffer.Append(TextOf(node));
-    else if (HasDigitsInBuffer(node))
-        buffer.Append(node.buffer.View());
     else
-        buffer.Append(ExprNumberChars(node.valueNumber).Text());
+        buffer.Append(NumberChars(node).Text());
 }
 
 void Concatenate(ExprNode& node, ExprNode& left, ExprNode& right, Evaluation& evaluation)
@@ -260,6 +258,7 @@ void EvaluateWhere(ExprNode& node, Evaluation& evaluation)
     node.isText = value->isText;
     node.fieldType = value->fieldType;
     node.valueNumber = value->valueNumber;
+    node.wholeNumber = value->wholeNumber;
 }
 
 constexpr auto kOperator = NodeKind::TwoArguments;

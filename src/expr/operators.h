@@ -17,7 +17,7 @@ struct OperatorDef {
 std::span<const OperatorDef> ArithmeticOperators(); // with both parentheses
 std::span<const OperatorDef> ConditionWords();
 
-// By the spelling in any case; null: there is none.
+// By the spelling, in any case; null: unknown.
 const OperatorDef* FindArithmeticOperator(QStringView token);
 const OperatorDef* FindConditionWord(QStringView token);
 
@@ -29,7 +29,7 @@ void EvaluateFunction(ExprNode& node, Evaluation& evaluation);
 // Whether `token` is `word`, which is in upper case, without regard to the case of ASCII letters.
 bool IsWord(QStringView token, std::u16string_view word);
 
-// Without the spaces at both ends; of all white space only they count as blanks in names and control texts.
+// Without spaces at both ends. In names and control texts no other white space counts as a blank.
 QStringView TrimmedSpaces(QStringView text);
 
 } // namespace mirel

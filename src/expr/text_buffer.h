@@ -6,12 +6,13 @@
 #include <algorithm>
 #include <cstring>
 #include <memory>
+#include <string_view>
 #include <utility>
 
 namespace mirel {
 
-// The text that a node computes, made anew on every record: it keeps its room, and everything that happens on
-// every record is inline, which is most of what short texts cost.
+// The text that a node computes for each record. It keeps its memory, and everything done per record is inline,
+// because calls are most of the cost of short texts.
 class TextBuffer {
 public:
     QStringView View() const { return {units_.get(), size_}; }
@@ -22,7 +23,7 @@ public:
         std::swap(room_, other.room_);
     }
 
-    // Makes the text so long and lends its units; what they hold is kept up to the shorter of both lengths.
+    // Sets the length of the text and lends its units; those within both lengths keep their contents.
     char16_t* Resize(qsizetype size)
     {
         if (size > room_)
@@ -45,6 +46,18 @@ public:
     {
         size_ = 0;
         Append(text);
+    }
+    void AssignUtf8(std::string_view utf8)
+    {
+        char16_t* const units = Resize(qsizetype(utf8.size()));
+        unsigned char bits = 0;
+        for (size_t i = 0; i < utf8.size(); ++i) {
+            const auto byte = static_cast<unsigned char>(utf8[i]);
+            units[i] = byte;
+            bits |= byte;
+        }
+        if (bits >= 0x80) // not ASCII alone
+            Assign(QString::fromUtf8(utf8.data(), qsizetype(utf8.size())));
     }
 
 private:

@@ -4,8 +4,8 @@
 
 namespace mirel {
 
-// The position of the first `wanted` at or after `from`, -1 when there is none. The time grows with the length of
-// the text alone, whatever the two hold.
+// The position of the first `wanted` at or after `from`, or -1. The time depends only on the length of the text,
+// not on what the two contain.
 qsizetype FindText(QStringView text, QStringView wanted, qsizetype from);
 
 // The position of the `occurrence`-th match, counted from 1, or 0. Matches do not overlap. A negative start

@@ -100,8 +100,13 @@ void RowContext::Collect(const ExprNode& tree)
 void RowContext::Lend(qint64 position, std::span<const Cell> cells)
 {
     position_ = position;
-    for (size_t i = 0; i < std::min(cells.size(), values_.size()); ++i)
-        values_[i] = ValueOfCell(cells[i], types_[i]);
+    cells_ = cells;
+}
+
+const Value& RowContext::FieldValue(int column)
+{
+    const auto at = size_t(column);
+    return values_[at] = ValueOfCell(cells_[at], types_[at]);
 }
 
 } // namespace mirel

@@ -42,13 +42,15 @@ public:
     void Collect(const ExprNode& tree);
     const std::vector<int>& Columns() const { return columns_; } // to be read, in this order
 
+    // The record that is evaluated next; the cells in the order of Columns(), borrowed as long as it is.
     void Lend(qint64 position, std::span<const Cell> cells);
 
     qint64 Position() override { return position_; }
     qint64 RecordCount() override { return recordCount_; }
     int FindColumn(QStringView name) override { return names_.value(name.toString(), -1); }
     FieldType TypeOfColumn(int column) override { return types_[size_t(column)]; }
-    const Value& FieldValue(int column) override { return values_[size_t(column)]; }
+    const Value& FieldValue(int column) override;
+    const Cell* FieldCell(int column) override { return &cells_[size_t(column)]; }
     QStringView YesNoWord(bool truth) override { return form_.YesNoWord(truth); }
     QString ControlText(QStringView name) override { return form_.ControlText(name); }
     QDateTime Now() override { return form_.Now(); }
@@ -60,7 +62,8 @@ private:
     QHash<QString, int> names_; // to the place in the vectors below
     std::vector<int> columns_;  // of the result
     std::vector<FieldType> types_;
-    std::vector<Value> values_;
+    std::vector<Value> values_; // of the cells that were asked for as such
+    std::span<const Cell> cells_;
 };
 
 } // namespace mirel

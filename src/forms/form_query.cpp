@@ -121,12 +121,4 @@ QString CompleteQuery(const QString& query, const QString& table, const ControlT
     return u"%1 FROM %2%3"_s.arg(head, FieldReference(table), tail);
 }
 
-bool OnlyReads(const QString& statement)
-{
-    const dialect::ParseResult parsed = dialect::ParseStatement(statement);
-    const auto* tree = std::get_if<dialect::Statement>(&parsed);
-    return !tree || std::holds_alternative<dialect::Select>(*tree) ||
-           std::holds_alternative<dialect::WholeTable>(*tree);
-}
-
 } // namespace mirel

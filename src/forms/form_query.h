@@ -16,8 +16,4 @@ using ControlTextOf = std::function<std::optional<QString>(QStringView name)>;
 // change what the statement says. A name that no control bears stays as it is, for the provider to judge.
 QString CompleteQuery(const QString& query, const QString& table, const ControlTextOf& controlText);
 
-// Whether the statement yields records and does nothing else: a SELECT, or the bare name of a table. True also
-// for a text that does not parse: the provider then says what is wrong with it.
-bool OnlyReads(const QString& statement);
-
 } // namespace mirel

@@ -1,5 +1,7 @@
 #include "forms/record_context.h"
 
+#include "expr/expr_token.h"
+
 namespace mirel {
 namespace {
 
@@ -15,22 +17,22 @@ struct WrittenName {
     QString field;
 
     explicit WrittenName(QStringView written)
-        : whole(Bare(written))
+        : whole(BareName(written))
     {
         const qsizetype dot = LastDotOutsideBrackets(written);
-        table = Bare(written.first(std::max<qsizetype>(dot, 0)));
-        field = Bare(written.sliced(dot + 1));
+        table = BareName(written.first(std::max<qsizetype>(dot, 0)));
+        field = BareName(written.sliced(dot + 1));
     }
 
 private:
-    static QString Bare(QStringView name) { return name.toString().remove(u'[').remove(u']'); }
-
     static qsizetype LastDotOutsideBrackets(QStringView name)
     {
         qsizetype dot = -1;
         bool inside = false;
         for (qsizetype i = 0; i < name.size(); ++i) {
-            if (name[i] == u'[' || name[i] == u']')
+            if (inside && name[i] == u']' && i + 1 < name.size() && name[i + 1] == u']')
+                ++i;
+            else if (name[i] == u']' || (name[i] == u'[' && !inside))
                 inside = name[i] == u'[';
             else if (name[i] == u'.' && !inside)
                 dot = i;

@@ -6,13 +6,13 @@
 
 namespace mirel {
 
-// One value of a record as the store holds it, borrowed: what bulk work (import, export, page fills, sums)
-// passes along without making a QString or a Value of it.
+// One value of a record as the store holds it, borrowed. Bulk work (import, export, page fills, sums) passes it
+// along without turning it into a QString or a Value.
 //
-// A text is UTF-8. A date is the text of its stored form ("2001-07-04", "2001-07-04 09:05:00", with a fraction
-// of a second where there is one), whatever form the file itself uses. A Yes/No is the integer 0 or 1.
+// A text is UTF-8. A date is a text in its stored form ("2001-07-04", "2001-07-04 09:05:00", with the fraction of
+// the second if it has one), whatever form the file itself uses. A Yes/No is the integer 0 or 1.
 //
-// `bytes` points into what handed the cell over, and is good until that call returns or the record is left.
+// `bytes` belongs to the source of the cell and is valid until that call returns or the record is left.
 struct Cell {
     enum class Kind : quint8 { Null, Integer, Real, Text, Binary };
 

@@ -7,12 +7,12 @@
 
 namespace mirel {
 
-// Reads what people type for a date and a time: the reverse of UserLocale's texts, and more forgiving. Any of
-// "/", "-", "." and a blank does between the parts of a date, ":" always does between those of a time; seconds
-// may be missing; digits of every script count. `dateFormat` and `timeFormat` (in the letters of
+// Reads dates and times as people type them: the reverse of UserLocale's texts, but more forgiving. The parts of a
+// date may be separated by "/", "-", "." or a blank, those of a time always by ":"; seconds may be missing; digits
+// of any script are accepted. `dateFormat` and `timeFormat` (in the letters of
 // QLocale::toString) give the order of the parts and the locale's own separators.
 //
-// Empty when the text does not read as a whole, or names no day or time that exists.
+// Empty when part of the text cannot be read, or when there is no such day or time.
 std::optional<double> ReadDateText(const QLocale& locale, QStringView dateFormat, QStringView timeFormat,
                                    QStringView text);
 

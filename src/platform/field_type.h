@@ -5,7 +5,7 @@ namespace mirel {
 // The storage types of a column. The numbers are the domain's: results report them, forms and the expression
 // language compare them. Never renumber.
 enum class FieldType : int {
-    None = 0,     // a column of a result whose type nobody knows
+    None = 0,     // a column of a result whose type is unknown
     SmallInt = 2, // 16 bits
     Integer = 3,  // 32 bits
     Double = 5,

@@ -7,7 +7,7 @@
 
 namespace mirel {
 
-// A walk through folders in search of a file: what the file dialog of a small screen shows.
+// Walks through folders to choose a file: the model of the file dialog for small screens.
 class FolderChoice {
 public:
     struct Entry {
@@ -17,17 +17,17 @@ public:
         friend bool operator==(const Entry&, const Entry&) = default;
     };
 
-    // Files are listed whose name ends in one of `endings` (".cdb"), in any case. A folder that is not there gives
-    // the nearest one above it.
+    // Lists the files whose names end in one of `endings` (".cdb"), in any case. If the folder does not exist, the
+    // nearest existing one above it is used.
     FolderChoice(const QString& folder, QStringList endings);
 
     QString Folder() const { return folder_; }
-    std::vector<Entry> Entries() const; // folders first, each by name; hidden ones are left out
+    std::vector<Entry> Entries() const; // folders first, each by name, without hidden ones
     bool CanGoUp() const;
     void GoUp();
-    // Enters the folder of that name; false when there is none, or it may not be read.
+    // Enters the folder of that name; false when it does not exist or may not be read.
     bool Enter(const QString& name);
-    // The full path of a file in this folder, or of one that is written with its folder.
+    // The full path of a file in this folder, or of one given with its own path.
     QString PathOf(const QString& name) const;
 
 private:

@@ -4,15 +4,15 @@
 
 namespace mirel {
 
-// What a call of the data provider ended with. The numbers are the domain's own: messages, scripts and
-// people know them, so they never change. Ok is zero; every failure has the top bit set.
+// The result of a call to the data provider. The numbers belong to the domain: messages, scripts and people rely
+// on them, so they never change. Ok is zero; every failure has the top bit set.
 enum class Hr : quint32 {
     Ok = 0,
     Unexpected = 0x8000FFFF,
     NotImplemented = 0x80004001,
     AccessDenied = 0x80070005, // busy, read-only, no permission: the context says which
     OutOfMemory = 0x8007000E,
-    BadLiteral = 0x80040E07,  // a text that does not read as the column's type
+    BadLiteral = 0x80040E07,  // a text that does not convert to the column's type
     SyntaxError = 0x80040E14, // the context names the place
     NoSuchColumn = 0x80040E11,
     RecordChanged = 0x80040E38,      // another window or program was faster: nothing was written
@@ -29,7 +29,7 @@ enum class Hr : quint32 {
     DiskFull = 0x80040E65,
     NotADatabase = 0x80040E73,
     CannotOpen = 0x80040E4D, // no such file, a folder: the context names path and reason
-    NotOpen = 0x800A0E78,    // a call that needs an open result
+    NotOpen = 0x800A0E78,    // the call needs an open result
     NoCurrentRecord = 0x800A0BCD,
     ReadOnly = 0x800A0CB3, // the result cannot be updated
 };

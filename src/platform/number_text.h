@@ -8,7 +8,7 @@
 
 namespace mirel {
 
-// A number as text in its own small buffer, for bulk work that makes no QString a field: integers in decimal, a
+// A number as text in its own small buffer, for bulk work without a QString per field: integers in decimal, a
 // double as NumberText writes it (up to 15 significant digits, "." as the point, no trailing zeros).
 class NumberBuffer {
 public:
@@ -18,7 +18,7 @@ public:
     std::string_view Text() const { return {characters_.data(), length_}; }
 
 private:
-    std::array<char, 32> characters_; // left unset: the text alone is read
+    std::array<char, 32> characters_; // uninitialised: only the text is ever read
     size_t length_;
 };
 

@@ -10,7 +10,7 @@ namespace mirel {
 
 // Dates in memory are OLE day numbers: whole days since 1899-12-30, and the time of day as the fraction. Before
 // that day the fraction still counts forward: -1.25 is 1899-12-29 at 06:00. The calendar is the proleptic
-// Gregorian one, years 1 to 9999; a time is kept to the millisecond. There is no zone.
+// Gregorian one, years 1 to 9999; a time is kept to the millisecond. There is no time zone.
 struct DateParts {
     int year = 1899;
     int month = 12;
@@ -23,14 +23,14 @@ struct DateParts {
     friend bool operator==(const DateParts&, const DateParts&) = default;
 };
 
-// Empty when there is no such day or time.
+// Empty when no such day or time exists.
 std::optional<double> OleDate(const DateParts& parts);
-// Empty when the day number lies outside the years 1 to 9999 or is no number.
+// Empty when the day number is not a number or lies outside the years 1 to 9999.
 std::optional<DateParts> PartsOfOleDate(double oleDays);
 
 std::optional<double> OleDate(const QDateTime& local);
 
-// The date's form in the file: "2001-07-04", "2001-07-04 09:05:00", "2001-07-04 09:05:00.250". Sorts and
+// The form of a date in the file: "2001-07-04", "2001-07-04 09:05:00", "2001-07-04 09:05:00.250". Sorts and
 // compares as text.
 struct StoredDate {
     std::array<char, 24> characters{};
@@ -39,13 +39,13 @@ struct StoredDate {
     std::string_view Text() const { return {characters.data(), size_t(length)}; }
 };
 std::optional<StoredDate> StoredDateOf(double oleDays);
-// Whether a text has that form, whether or not there is such a day or time.
+// Whether a text has that form, even if no such day or time exists.
 bool HasStoredDateForm(std::string_view text);
-// Whether a text is that form to the letter, and its day and time exist: bulk work stores it as it stands.
+// Whether a text has exactly that form and its day and time exist: bulk work stores it unchanged.
 bool IsStoredDate(std::string_view text);
 
-// Reads the stored form, and what others write for it: a "T" between date and time, a missing second, a
-// fraction of any length; a zone ("Z", "+02:00") moves the value to UTC. Empty when it does not read as such.
+// Reads the stored form and the variants of other programs: a "T" between date and time, a missing second, a
+// fraction of any length; a time zone ("Z", "+02:00") moves the value to UTC. Empty for anything else.
 std::optional<double> OleDateFromStored(std::string_view text);
 
 } // namespace mirel

@@ -7,8 +7,9 @@
 
 namespace mirel {
 
-Profile::Profile(QString path)
+Profile::Profile(QString path, Access access)
     : path_(std::move(path))
+    , access_(access)
 {
 }
 
@@ -27,6 +28,8 @@ int Profile::ReadInt(const QString& section, const QString& key, int fallback) c
 
 bool Profile::WriteText(const QString& section, const QString& key, const QString& value)
 {
+    if (access_ == Access::ReadOnly)
+        return false;
     bool named = false;
     const bool written = ChangeFile(path_, [&](const QByteArray& old) {
         ProfileText text(old);

@@ -14,7 +14,7 @@ ProgramFolder ProgramFolder::Find(const QString& home)
         path = qEnvironmentVariable("MIREL_HOME");
     if (path.isEmpty())
         path = QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + u"/Mirel"_s;
-    return {QDir::cleanPath(QDir(path).absolutePath())};
+    return {.path = QDir::cleanPath(QDir(path).absolutePath())};
 }
 
 QString ProgramFolder::FormsFolder() const
@@ -30,6 +30,11 @@ QString ProgramFolder::FavoritesFile() const
 QString ProgramFolder::ProfileFile() const
 {
     return path + u"/Mirel.ini"_s;
+}
+
+Profile ProgramFolder::OpenProfile() const
+{
+    return Profile(ProfileFile(), profileAccess);
 }
 
 } // namespace mirel

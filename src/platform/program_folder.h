@@ -1,12 +1,15 @@
 #pragma once
 
+#include "platform/profile.h"
+
 #include <QString>
 
 namespace mirel {
 
-// Where the program keeps what is its own.
+// The folder with the program's own files.
 struct ProgramFolder {
     QString path;
+    Profile::Access profileAccess = Profile::Access::ReadWrite; // of every profile opened through this folder
 
     // `home` (from --home), else the environment variable MIREL_HOME, else the desktop's data folder for
     // "Mirel". Nothing is created.
@@ -15,6 +18,7 @@ struct ProgramFolder {
     QString FormsFolder() const;   // the side files of the databases
     QString FavoritesFile() const; // Mirel.fvs
     QString ProfileFile() const;   // Mirel.ini
+    Profile OpenProfile() const;
 };
 
 } // namespace mirel

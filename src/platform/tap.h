@@ -2,7 +2,7 @@
 
 namespace mirel {
 
-// How often the stylus, or the mouse, touched the same place.
+// How many times the stylus or the mouse touched the same place.
 enum class Tap { Single, Double };
 
 } // namespace mirel

@@ -9,7 +9,7 @@
 
 namespace mirel {
 
-// How this user writes dates and times; the one place that formats and parses them for people. Files and
+// How this user writes dates and times: the only place that formats and parses them for people. Files and
 // statements use the C locale and ISO dates instead.
 //
 // The date text is the locale's short date with a four-digit year, the time text the locale's time with
@@ -18,17 +18,17 @@ class UserLocale {
 public:
     explicit UserLocale(const QLocale& locale);
 
-    // The locale of this process: the system's, unless a test set another.
+    // The locale of this process: the system's, unless a test has set another.
     static const UserLocale& Current();
     static void SetCurrent(const QLocale& locale);
 
-    // Midnight is left out, and so is the base date 1899-12-30 (a value that is both shows its time). Empty for
-    // what is no date.
+    // Omits midnight, and the base date 1899-12-30 (a value that is both shows its time). Empty for a value that
+    // is not a date.
     QString DateTimeText(double oleDays) const;
     QString DateText(double oleDays) const;
     QString TimeText(double oleDays) const;
-    // Takes the locale's form and always ISO "2001-07-04", each with an optional time after a blank or "T", and
-    // a time alone (on the base date). A year of two digits is one of 1930 to 2029.
+    // Reads the locale's form and always ISO "2001-07-04", each with an optional time after a blank or "T", and a
+    // time alone (on the base date). A two-digit year lies between 1930 and 2029.
     std::optional<double> ParseDateTime(QStringView text) const;
 
     const QLocale& Locale() const { return locale_; }
@@ -42,10 +42,10 @@ private:
     QString timeFormat_;
 };
 
-// A value as text where nobody says otherwise: integers in decimal, a double with up to 15 significant digits
+// The default text of a value: integers in decimal, a double with up to 15 significant digits
 // and "." as its point, a date as the user's date-time text, a bool as "-1" or "0"; the empty text for NULL
 // and for binary values.
 QString VariantText(const Value& value);
-QString NumberText(double number); // the double's rule alone
+QString NumberText(double number); // the rule for a double
 
 } // namespace mirel

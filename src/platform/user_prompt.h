@@ -19,27 +19,28 @@ struct UserMessage {
     QString Text() const { return StringText(id, arguments); }
 };
 
-// Long work in progress. Destroying it takes the display away.
+// Long work in progress. Destroying it removes the display.
 class Progress {
 public:
     virtual ~Progress() = default;
 
     // `done` counts from 0 to the total that StartProgress was given. Returns false once the user has asked to
-    // stop: the work then ends at the next point where everything done so far is whole. Cheap enough to call
-    // for every thousand records, not for every one.
+    // stop: the work then ends at the next point where everything done so far is consistent. Cheap enough to call
+    // every thousand records, but not for each one.
     [[nodiscard]] virtual bool Advance(qint64 done) = 0;
 };
 
 inline constexpr qint64 kUnknownTotal = -1;
 
-// How core asks and tells: the window shows message boxes, the command line answers from its options, a test
-// answers from a script. Core never waits for the user in any other way.
+// How the core asks and informs the user: the window shows message boxes, the command line answers from its
+// options, a test answers from a script. The core never waits for the user in any other way.
 class UserPrompt {
 public:
     virtual ~UserPrompt() = default;
 
     virtual bool AskYesNo(const UserMessage& question) = 0;
-    // A yes/no question that offers one more answer, in the words of `third`. Who cannot offer it asks yes or no.
+    // A yes/no question with one more answer, in the words of `third`. A prompt that cannot offer it asks yes or
+    // no.
     enum class Answer { No, Yes, Third };
     virtual Answer AskYesNoOr(const UserMessage& question, const UserMessage& third)
     {
@@ -47,7 +48,7 @@ public:
         return AskYesNo(question) ? Answer::Yes : Answer::No;
     }
     virtual void Show(const UserMessage& message) = 0;
-    // A text whose words are not one row of the string table: a failure of the provider, with its context.
+    // A text that is not a row of the string table: a failure of the provider, with its context.
     virtual void ShowError(const QString& text) = 0;
     // Empty optional: the user cancelled.
     virtual std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,

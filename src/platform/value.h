@@ -24,7 +24,7 @@ enum class ValueTag : int {
 // One value of a record: a small value type, copied freely.
 //
 // A date is an OLE day number: days since 1899-12-30, the fraction is the time of day (see ole_date.h).
-// Empty is "nothing was ever read", Null is the database's NULL; both show as an empty text.
+// Empty means that nothing was read yet, Null is the database's NULL; both show as an empty text.
 class Value {
 public:
     Value() = default; // Empty
@@ -48,7 +48,7 @@ public:
         return std::holds_alternative<std::monostate>(content_) || std::holds_alternative<NullContent>(content_);
     }
 
-    // Each reads a value of its own tag; of any other tag it gives 0, false or empty. Number() reads both
+    // Each reads a value of its own tag; any other tag gives 0, false or an empty result. Number() reads both
     // integer tags, Double, Date (the day number) and Bool (1 or 0).
     double Number() const;
     qint32 ToInt() const; // SmallInt, Integer and Bool
@@ -56,7 +56,7 @@ public:
     std::optional<qint64> WholeNumber() const;
     bool ToBool() const;
     QString ToText() const;
-    // The text without taking a share in it; good as long as the value stays what it is.
+    // The text without sharing it; valid until the value changes.
     QStringView TextView() const
     {
         const auto* text = std::get_if<QString>(&content_);

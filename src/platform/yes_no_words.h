@@ -4,15 +4,15 @@
 
 namespace mirel {
 
-// The words of the two values of a Yes/No field, as the user set them. One pair for the whole program: grid and
-// forms show the same words.
+// The user's words for the two values of a Yes/No field. The whole program uses one pair: grid and forms show the
+// same words.
 struct YesNoWords {
     QString yes = QStringLiteral("Yes");
     QString no = QStringLiteral("No");
 
     const QString& Of(bool truth) const { return truth ? yes : no; }
 
-    // The pair that "Yes/No" names, split at its first "/"; a text without "/" leaves `otherwise`.
+    // The pair in a text such as "Yes/No", split at its first "/"; `otherwise` for a text without "/".
     static YesNoWords FromSetting(QStringView setting, const YesNoWords& otherwise)
     {
         const qsizetype slash = setting.indexOf(u'/');

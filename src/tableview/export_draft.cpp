@@ -21,7 +21,7 @@ ExportDraft::ExportDraft(DbConnection& connection, QString database, UserPrompt&
 bool ExportDraft::SetSource(const QString& statement)
 {
     statement_ = statement;
-    if (records_.Open(statement, database_, CursorType::Static, LockType::ReadOnly))
+    if (records_.OpenSource(statement, database_, CursorType::Static, LockType::ReadOnly))
         return true;
     ReportProviderError(prompt_, &records_, records_.LastResult());
     records_.Close();

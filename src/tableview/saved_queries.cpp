@@ -1,6 +1,7 @@
 #include "tableview/saved_queries.h"
 
 #include "data/catalog.h"
+#include "data/db_recordset.h"
 #include "data/statement_text.h"
 #include "resources/string_table.h"
 #include "tableview/record_browser.h"
@@ -35,6 +36,15 @@ bool SavedQueries::AskIfUnbalanced(const QString& statement)
     return IsBalanced(statement) ||
            prompt_.AskYesNo({Str::UnbalancedQuestion,
                              {StringText(Str::StatementUnbalanced), StringText(Str::ContinueQuestion)}});
+}
+
+bool SavedQueries::AskIfItChanges(const QString& name, const QString& statement)
+{
+    if (OnlyReads(statement))
+        return true;
+    constexpr qsizetype kMaxShown = 400; // of a small window; what a statement does stands at its beginning
+    const QString shown = statement.size() > kMaxShown ? statement.first(kMaxShown) + u'…' : statement;
+    return prompt_.AskYesNo({Str::RunQueryThatChanges, {name, shown}});
 }
 
 bool SavedQueries::Save(const QString& name, const QString& table, const QString& statement, OnExisting existing)

@@ -32,6 +32,9 @@ public:
 
     // Asks before a statement is taken whose brackets or quotes are not closed; false: the user takes it back.
     bool AskIfUnbalanced(const QString& statement);
+    // Asks before a query is opened that does more than show records, and shows its statement; false: it is not
+    // run.
+    bool AskIfItChanges(const QString& name, const QString& statement);
     // Names have up to 40 characters, those of tables up to 31; what is longer is cut. An empty name is none.
     bool Save(const QString& name, const QString& table, const QString& statement,
               OnExisting existing = OnExisting::Ask);

@@ -56,6 +56,7 @@ TEST_F(ProgramTest, TakesPicturesWithoutADisplay)
         pictures += picture;
     }
     EXPECT_LT(pictures[0].pixelColor(470, 200).lightness(), 100) << "it is to be dark";
+    EXPECT_FALSE(QFileInfo::exists(PathOf(u"Mirel.ini"_s))) << "the user's next window opens what it had open";
 }
 
 TEST_F(ProgramTest, FailsWithAWordAndAStatus)

@@ -1,5 +1,6 @@
 // The program as a script meets it: its words, what it prints where, and how it ends.
 #include "cli/program_fixture.h"
+#include "support/sqlite_file.h"
 
 #include <QDir>
 #include <QJsonArray>
@@ -34,6 +35,9 @@ TEST_F(Program, RefusesWrongWordsWithTwoLines)
          "\"xml\" is no value for --format: table|csv|tsv|json|jsonl."},
         {{u"drop"_s, u"a"_s}, "This command needs the option --yes."},
         {{u"import"_s, u"a"_s, u"b"_s}, "This command needs the option --table."},
+        {{u"forms"_s}, "Which command of \"forms\"?"},
+        {{u"forms"_s, u"frob"_s, u"a"_s}, "There is no command \"forms frob\"."},
+        {{u"eval"_s, u"-[a]"_s}, "There is no option -[a]."},
     };
     for (const Row& row : rows) {
         const Ended ended = Run(row.words);
@@ -53,6 +57,14 @@ TEST_F(Program, HelpsOnItselfAndOnEveryCommand)
         const Ended own = Run(command.split(u' ') + QStringList{u"--help"_s});
         EXPECT_EQ(own.status, 0);
         EXPECT_TRUE(own.out.startsWith(u"mirel-cli "_s + command)) << own.out.toStdString();
+    }
+    for (const QString& group : {u"forms"_s, u"queries"_s, u"config"_s}) {
+        const Ended own = Run({group, u"--help"_s});
+        EXPECT_EQ(own.status, 0) << own.err.toStdString();
+        const QStringList lines = own.out.split(u'\n');
+        EXPECT_GE(lines.filter(u"  "_s + group + u' ').size(), 2) << own.out.toStdString();
+        EXPECT_TRUE(lines.filter(u"  import "_s).empty()) << "of this group alone";
+        EXPECT_FALSE(lines.filter(u"  -- "_s).empty());
     }
     EXPECT_TRUE(Run({u"--version"_s}).out.startsWith(u"mirel-cli "_s));
 }
@@ -95,6 +107,38 @@ TEST_F(Program, ReadsStatementsFromItsInputUpToTheFirstFailure)
     EXPECT_EQ(Sql(u"SELECT A FROM T"_s), u"A\n;\n"_s);
 }
 
+TEST_F(Program, RefusesBytesThatAreNotUtf8)
+{
+    NewDatabase();
+    const Ended ended = Run({u"sql"_s, u"a.cdb"_s, u"-"_s}, "CREATE TABLE T (A Varchar(9));\n"
+                                                            "INSERT INTO T (A)\nVALUES ('caf\xE9');\n");
+    EXPECT_EQ(ended, (Ended{1, {}, u"Line 3 is not UTF-8: the script ends before it.\n"_s}));
+    EXPECT_EQ(Sql(u"SELECT A FROM T"_s), u"A\n"_s);
+    QProcess shell; // a shell alone can hand over such an argument
+    StartProgram(shell, u"/bin/sh"_s,
+                 {u"-c"_s, u"\"$0\" sql a.cdb \"INSERT INTO T (A) VALUES ('$(printf '\\351')')\""_s,
+                  QStringLiteral(MIREL_CLI)});
+    ASSERT_TRUE(shell.waitForFinished());
+    EXPECT_EQ(shell.exitCode(), 2);
+    EXPECT_EQ(shell.readAllStandardError(), "Argument 3 is not UTF-8.\n");
+    EXPECT_EQ(Sql(u"SELECT A FROM T"_s), u"A\n"_s);
+}
+
+TEST_F(Program, SaysWhatASettingTakes)
+{
+    const auto set = [this](const QStringList& words) {
+        return Run(QStringList{u"config"_s, u"set"_s, u"TableView"_s} + words);
+    };
+    EXPECT_EQ(set({u"font"_s, u"Serif 12"_s}),
+              (Ended{1,
+                     {},
+                     u"\"Serif 12\" is no value for the setting TableView font: it takes a font: (italic,bold,"
+                     "strikeout,underline,size,\"face\"), such as (0,1,0,0,9,\"Tahoma\").\n"_s}));
+    EXPECT_EQ(set({u"Font"_s, u"(0,1,0,0,9,\"Tahoma\")"_s}), (Ended{0, {}, {}})); // the example itself is one
+    EXPECT_EQ(set({u"BkColor"_s, u"(0),(16777215),(0),(0),(12632256)"_s}), (Ended{0, {}, {}}));
+    EXPECT_EQ(set({u"confirmDelete"_s, u"maybe"_s}).status, 1);
+}
+
 TEST_F(Program, TakesAPartOfTheRecordsAndTellsTheTime)
 {
     NewDatabase();
@@ -126,9 +170,9 @@ TEST_F(Program, ImportsIntoAnExistingTable)
     NewDatabase();
     Sql(u"CREATE TABLE T (A Varchar(9), B Integer)"_s);
     EXPECT_EQ(Import("B,a\n1,x\n", {u"--header"_s}).out, u"1 record(s) imported.\n"_s);
-    EXPECT_EQ(Import("y,2\n\nz\n", {}).out, u"2 record(s) imported.\n"_s);
+    EXPECT_EQ(Import("z\n\ny,2\n", {}).out, u"2 record(s) imported.\n"_s) << "the first line is short";
     EXPECT_EQ(Import("3;-;w,v\n", {u"--columns"_s, u"B,-,A"_s, u"--separator"_s, u"semicolon"_s}).status, 0);
-    EXPECT_EQ(Sql(u"SELECT * FROM T"_s), u"A,B\nx,1\ny,2\nz,\n\"w,v\",3\n"_s);
+    EXPECT_EQ(Sql(u"SELECT * FROM T"_s), u"A,B\nx,1\nz,\ny,2\n\"w,v\",3\n"_s);
 }
 
 TEST_F(Program, ImportsNothingForNamesThatAreNotThere)
@@ -239,12 +283,24 @@ TEST_F(Program, EvaluatesExpressions)
     EXPECT_EQ(eval({u"&a*2"_s, u"--control"_s, u"a=5"_s}), (Ended{0, u"10\n"_s, {}}));
     EXPECT_EQ(eval({u"2+3*4"_s, u"--tree"_s}), (Ended{0, u"{ { 2 }+{ { 3 }*{ 4 } } }\n"_s, {}}));
     EXPECT_EQ(eval(QStringList{counter, u"--record"_s, u"2"_s} + onTable), (Ended{0, u"2/2\n"_s, {}}));
+    EXPECT_EQ(eval(QStringList{counter, u"--all"_s} + onTable), (Ended{0, u"1/2\n2/2\n"_s, {}}));
+    EXPECT_EQ(eval(QStringList{u""_s, u"--all"_s} + onTable), (Ended{0, u"\n\n"_s, {}}));
     EXPECT_EQ(eval(QStringList{u"[Name]+[Price]"_s, u"--all"_s} + onTable), (Ended{0, u"Gull2.5\n\n"_s, {}}));
     EXPECT_EQ(eval(QStringList{counter, u"--record"_s, u"3"_s} + onTable),
               (Ended{1, {}, u"There is no record 3.\n"_s}));
     EXPECT_EQ(eval({u"1"_s, u"--all"_s}).status, 2);
     EXPECT_EQ(eval({u"1"_s, u"--control"_s, u"a"_s}).status, 2);
     EXPECT_EQ(eval({u"1"_s, u"--format"_s, u"csv"_s}).status, 2);
+}
+
+TEST_F(Program, ShowsEveryDigitOfAWholeNumber)
+{
+    NewDatabase();
+    Sql(u"CREATE TABLE T (A Integer)"_s);
+    SqliteFile(Path(u"a.cdb"_s)).Run("INSERT INTO T VALUES (9007199254740993), (-9223372036854775807)");
+    EXPECT_EQ(
+        Run({u"eval"_s, u"[A]+'/'+TO_CHAR([A])"_s, u"--all"_s, u"--db"_s, u"a.cdb"_s, u"--source"_s, u"T"_s}),
+        (Ended{0, u"9007199254740993/9007199254740993\n-9223372036854775807/-9223372036854775807\n"_s, {}}));
 }
 
 TEST_F(Program, TellsOfExpressionsAsJson)

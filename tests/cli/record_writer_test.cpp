@@ -79,6 +79,18 @@ TEST(RecordWriter, MakesOneArrayOfJson)
               u"[{\"Name\":\"a\"},\n{\"Name\":\"\\u0001\\u007f\uFFFD\"}]\n"_s);
 }
 
+TEST(RecordWriter, MakesJsonOfDatesThatAreNone)
+{
+    const std::span<const ResultField> seen(&kFields[3], 1);
+    EXPECT_EQ(Written(OutputFormat::JsonLines, seen,
+                      {{Cell::OfText("next Tuesday")},
+                       {Cell::OfText("\"July\"\n2001")},
+                       {Cell::OfText("4")},
+                       {Cell::OfText("2001-07-04 09:05:00.250")}}),
+              u"{\"Seen\":\"next Tuesday\"}\n{\"Seen\":\"\\\"July\\\"\\n2001\"}\n{\"Seen\":\"4\"}\n"
+              "{\"Seen\":\"2001-07-04T09:05:00.250\"}\n"_s);
+}
+
 TEST(RecordWriter, GivesEveryColumnItsOwnKey)
 {
     const std::vector<ResultField> fields = {{u"Name"_s, FieldType::Text, 9, u"A"_s, u"Name"_s},

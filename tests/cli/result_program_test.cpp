@@ -150,6 +150,8 @@ TEST_F(ResultProgram, KeepsSavedQueries)
         return queries(QStringList{u"save"_s, u"a.cdb"_s, u"Q"_s, statement, u"--table"_s, u"T"_s} + options);
     };
     EXPECT_EQ(save(u"SELECT Name FROM T ORDER BY Age"_s, {}), (Ended{0, {}, {}}));
+    EXPECT_EQ(queries({u"save"_s, u"a.cdb"_s, u" "_s, u"SELECT 1"_s, u"--table"_s, u"T"_s}),
+              (Ended{1, {}, u"A query needs a name.\n"_s}));
     EXPECT_EQ(save(u"SELECT 1"_s, {u"--yes"_s}),
               (Ended{1, {}, u"The query \"Q\" exists; --replace replaces it.\n"_s}));
     const Ended unbalanced = save(u"SELECT (Name FROM T"_s, {u"--replace"_s});
@@ -173,6 +175,48 @@ TEST_F(ResultProgram, NeedsTheRightNumberOfArgumentsToExport)
     EXPECT_EQ(Run({u"export"_s, u"a.cdb"_s, u"T"_s}).status, 2);
     EXPECT_EQ(Run({u"export"_s, u"a.cdb"_s, u"T"_s, u"x.csv"_s, u"--query"_s, u"Q"_s}).status, 2);
     EXPECT_EQ(FilesOf(u"x.csv"_s), QStringList());
+}
+
+TEST_F(ResultProgram, ReadsSourcesAndRunsNothingElse)
+{
+    const QString refused = u"Error: (80040E14) only a SELECT can be read here\n"
+                            "The command contained one or more errors\n"_s;
+    const auto save = [this](const QString& name, const QString& statement) {
+        Run({u"queries"_s, u"save"_s, u"a.cdb"_s, name, statement, u"--table"_s, u"T"_s});
+    };
+    save(u"Wipe"_s, u"DELETE FROM T"_s);
+    const QString before = Sql(u"SELECT * FROM T"_s);
+    for (const QString& source : {u"DELETE FROM T"_s, u"DROP TABLE T"_s, u"UPDATE T SET Age=1"_s, u"Wipe"_s}) {
+        const std::vector<QStringList> rows = {
+            {u"export"_s, u"a.cdb"_s, source, u"x.csv"_s},
+            {u"eval"_s, u"1"_s, u"--db"_s, u"a.cdb"_s, u"--source"_s, source},
+            {u"eval"_s, u"1"_s, u"--db"_s, u"a.cdb"_s, u"--source"_s, source, u"--all"_s},
+            {u"aggregate"_s, u"a.cdb"_s, source, u"Age"_s, u"sum"_s},
+            {u"update-all"_s, u"a.cdb"_s, source, u"Age"_s, u"1"_s, u"--yes"_s},
+            {u"delete-all"_s, u"a.cdb"_s, source, u"--yes"_s},
+        };
+        for (const QStringList& words : rows)
+            EXPECT_EQ(Run(words), (Ended{1, {}, refused})) << words.join(u' ').toStdString();
+    }
+    EXPECT_EQ(Run({u"export"_s, u"a.cdb"_s, u"x.csv"_s, u"--query"_s, u"Wipe"_s}), (Ended{1, {}, refused}));
+    EXPECT_EQ(Run({u"queries"_s, u"run"_s, u"a.cdb"_s, u"Wipe"_s}),
+              (Ended{2, {}, u"The query \"Wipe\" is not a SELECT; --yes runs it.\n"_s}));
+    EXPECT_EQ(FilesOf(u"x.csv*"_s), QStringList());
+    EXPECT_EQ(Sql(u"SELECT * FROM T"_s), before);
+
+    save(u"Old ones"_s, u"SELECT * FROM T WHERE Age > 8"_s);
+    EXPECT_EQ(Run({u"aggregate"_s, u"a.cdb"_s, u"Old ones"_s, u"Age"_s, u"sum"_s}), (Ended{0, u"30\n"_s, {}}));
+    EXPECT_EQ(Run({u"queries"_s, u"run"_s, u"a.cdb"_s, u"Wipe"_s, u"--yes"_s}), (Ended{0, {}, {}}));
+    EXPECT_EQ(OnTable(u"export"_s, {u"-"_s}).err, u"0 record(s) exported.\n"_s);
+}
+
+TEST_F(ResultProgram, TakesANegativeNumberForAValue)
+{
+    EXPECT_EQ(OnTable(u"update-all"_s, {u"Age"_s, u"-7"_s, u"--yes"_s}), (Ended{0, u"3\n"_s, {}}));
+    EXPECT_EQ(OnTable(u"update-all"_s, {u"Price"_s, u"-.5"_s, u"--yes"_s}), (Ended{0, u"3\n"_s, {}}));
+    EXPECT_EQ(Sql(u"SELECT DISTINCT Age,Price FROM T"_s), u"Age,Price\n-7,-0.5\n"_s);
+    EXPECT_EQ(Run({u"eval"_s, u"-5+3"_s}), (Ended{0, u"-2\n"_s, {}}));
+    EXPECT_EQ(Run({u"eval"_s, u"--"_s, u"-ROUND(2.5,0)"_s}), (Ended{0, u"-3\n"_s, {}}));
 }
 
 } // namespace

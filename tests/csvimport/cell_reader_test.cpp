@@ -98,10 +98,15 @@ TEST(CellReader, ReadsDatesOfTheFormat)
                  {kDate, "0045-07-04", "1945-07-04"},
                  {kDate, "45-7-4", "1945-07-04"},
                  {kDate, "2001-13-4", "bad literal"},
+                 {kDate, "09:05:07", "1899-12-30 09:05:07"},
+                 {kDate, "24:00:00", "bad literal"},
+                 {kDate, "9:05", "bad literal"},
+                 {kDate, "9:05:7h", "bad literal"},
                  {kDate, "", "null"}},
                 {DateOrder::YearMonthDay, u'-', u':'});
     // The tests' locale is US English.
-    ExpectCells({{kDate, "7/4/2001 9:05:00 PM", "2001-07-04 21:05:00"},
+    ExpectCells({{kDate, "9:05:07 PM", "1899-12-30 21:05:07"},
+                 {kDate, "7/4/2001 9:05:00 PM", "2001-07-04 21:05:00"},
                  {kDate, "2001-07-04T09:05:00.25", "2001-07-04 09:05:00.250"},
                  {kDate, "2001-02-30", "bad literal"},
                  {kDate, "0045-07-04", "0045-07-04"},

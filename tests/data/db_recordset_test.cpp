@@ -102,5 +102,34 @@ TEST_F(RecordsetTest, BringsEveryTypeNameBack)
     }
 }
 
+TEST(OnlyReads, IsWhatShowsRecordsAlone)
+{
+    for (const char16_t* reads : {u"SELECT * FROM T", u"T", u"[My Birds]", u"not a statement at all"})
+        EXPECT_TRUE(OnlyReads(QString::fromUtf16(reads))) << QString::fromUtf16(reads).toStdString();
+    for (const char16_t* changes : {u"DELETE FROM T", u"UPDATE T SET A=1", u"DROP TABLE T", u"DROP DATABASE 'x'",
+                                    u"INSERT INTO T (A) VALUES(1)", u"CREATE TABLE T (A Integer)"})
+        EXPECT_FALSE(OnlyReads(QString::fromUtf16(changes))) << QString::fromUtf16(changes).toStdString();
+}
+
+TEST_F(RecordsetTest, TakesNothingButATableOrASelectForASource)
+{
+    const auto open = [&](const QString& source) {
+        return birds_.OpenSource(source, path_, CursorType::Static, LockType::Optimistic);
+    };
+    for (const QString& statement :
+         {u"DELETE FROM Birds"_s, u"DROP TABLE Birds;"_s, u"UPDATE Birds SET Wings=4"_s,
+          u"INSERT INTO Birds (Species) VALUES ('Emu')"_s, u"CREATE TABLE More (A Integer)"_s}) {
+        EXPECT_FALSE(open(statement)) << statement.toStdString();
+        EXPECT_EQ(birds_.LastResult(), Hr::SyntaxError);
+        EXPECT_EQ(birds_.ErrorContext(), u"only a SELECT can be read here"_s);
+    }
+    EXPECT_FALSE(open(u"SELECT * FROM Nowhere"_s));
+    EXPECT_EQ(birds_.LastResult(), Hr::NoSuchTable);
+    EXPECT_NE(birds_.ErrorContext(), u"only a SELECT can be read here"_s);
+    ASSERT_TRUE(open(u"Birds"_s));
+    EXPECT_EQ(birds_.RecordCount(), 3);
+    EXPECT_EQ(birds_.FieldValue(u"Wings"), Value::SmallInt(2));
+}
+
 } // namespace
 } // namespace mirel

@@ -213,13 +213,14 @@ TEST(Results, NameTheirColumns)
 
 TEST(Results, KnowTheirTypes)
 {
-    const SelectPlan plan = PlanOf(u"SELECT Qty/2, Qty+Small, Qty+Price, Made+1, Made-Made, Name+'x', Qty>1, "
-                                   "COALESCE(NULL,Made), IIF(Sold,1,2.5), NULL, AVG(Qty), SUM(Qty), MAX(Made) "
-                                   "FROM Items GROUP BY Qty,Small,Price,Made,Name,Sold"_s);
+    const SelectPlan plan =
+        PlanOf(u"SELECT Qty/2, Qty+Small, Qty+Price, Made+1, Made-Made, Name+'x', Qty>1, "
+               "COALESCE(NULL,Made), IIF(Sold,1,2.5), NULL, AVG(Qty), SUM(Qty), MAX(Made), SUM(Sold) "
+               "FROM Items GROUP BY Qty,Small,Price,Made,Name,Sold"_s);
     const std::vector<FieldType> types = {
         FieldType::Double, FieldType::Integer, FieldType::Double, FieldType::Date,   FieldType::Double,
         FieldType::Memo,   FieldType::YesNo,   FieldType::Date,   FieldType::Double, FieldType::None,
-        FieldType::Double, FieldType::Integer, FieldType::Date};
+        FieldType::Double, FieldType::Integer, FieldType::Date,   FieldType::Integer};
     ASSERT_EQ(plan.fields.size(), types.size());
     for (size_t i = 0; i < types.size(); ++i)
         EXPECT_EQ(plan.fields[i].type, types[i]) << qPrintable(plan.fields[i].name);

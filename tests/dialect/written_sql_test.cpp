@@ -148,6 +148,9 @@ TEST_F(WrittenSql, GivesWhatTheDialectMeans)
         {u"Qty = 7 OR Qty = 8 AND Small = 9, (Qty = 7 OR Qty = 8) AND Small = 9"_s, u"1|0"_s},
         {u"'it''s', \"say \"\"so\"\"\", 99999999999999999999 > 1"_s, u"it's|say \"so\"|1"_s},
         {u"Sold = -1, Sold = 'yes', Sold <> 0, Sold < 5, Sold = TRUE"_s, u"1|1|1|1|1"_s},
+        {u"Qty = 7, Qty <> 7, Qty < 7, Qty <= 7, Qty > 7, Qty >= 7"_s, u"1|0|0|1|0|1"_s},
+        {u"Qty <= 6, Qty <= 8, Qty >= 6, Qty >= 8, Qty BETWEEN 7 AND 7"_s, u"0|1|1|0|1"_s},
+        {u"'2.50' LIKE 2.50, '2.5' LIKE 2.50, Qty LIKE 7"_s, u"1|0|1"_s}, // a number is the text that was written
         {u"Qty = '7', Name = 'ärger', Small < 99999, Made = '7/4/2001 9:05'"_s, u"1|0|1|1"_s},
     };
     for (const auto& [expressions, expected] : rows)

@@ -95,6 +95,20 @@ TEST_F(Expressions, ReadFieldsByTheirColumnsType)
                   {u"[Nobody]+1"_s, u"<1>"_s}});
 }
 
+// Other programs store what they like: a text that does not read as its column's type comes as it stands.
+TEST_F(Expressions, TakeAStrayTextAsText)
+{
+    record.SetColumns({{u"Due"_s, FieldType::Date, Value::Text(u"next Tuesday"_s)},
+                       {u"Qty"_s, FieldType::Integer, Value::Text(u"seven"_s)},
+                       {u"Active"_s, FieldType::YesNo, Value::Text(u"perhaps"_s)}});
+    ExpectValues({{u"[Due]"_s, u"<next Tuesday>"_s},
+                  {u"[Due]+1"_s, u"<next Tuesday1>"_s},
+                  {u"YEAR([Due])"_s, u"null"_s},
+                  {u"[Qty]"_s, u"<seven>"_s},
+                  {u"[Qty]*2"_s, u"null"_s},
+                  {u"[Active]"_s, u"<perhaps>"_s}});
+}
+
 TEST_F(Expressions, LookNamesUpOnceForEachSetOfColumns)
 {
     const ExprTree tree = ParseExpression(u"[Qty]+[Nobody]", ExprMode::Value);
@@ -216,6 +230,16 @@ TEST_F(Expressions, Compare)
                       {u"[Qty] != 5"_s, u"1"_s},
                       {u"[Qty] =< 3"_s, u"0"_s},
                       {u"[Qty] > 3.5"_s, u"1"_s},
+                      {u"[Qty] = 3.5"_s, u"0"_s},
+                      {u"[Qty] <= 4"_s, u"1"_s},
+                      {u"[Qty] =< 4"_s, u"1"_s},
+                      {u"[Qty] <= 3.5"_s, u"0"_s},
+                      {u"[Qty] < 4"_s, u"0"_s},
+                      {u"[Qty] => 4.5"_s, u"0"_s},
+                      {u"[Qty] > 4"_s, u"0"_s},
+                      {u"[Name] <= 'Smith'"_s, u"1"_s},
+                      {u"[Name] >= 'Smith'"_s, u"1"_s},
+                      {u"[Name] < 'Smith'"_s, u"0"_s},
                       {u"[Name] = 'Smith'"_s, u"1"_s},
                       {u"[Name] = 'smith'"_s, u"0"_s},
                       {u"'a' > 'Z'"_s, u"1"_s},
@@ -236,6 +260,7 @@ TEST_F(Expressions, TestForNull)
                       {u"[Open] IS NULL"_s, u"1"_s},
                       {u"[Open] <> NULL"_s, u"1"_s},
                       {u"[Open] IS NOT NULL"_s, u"0"_s},
+                      {u"[Open] IS NOT NOT NULL"_s, u"1"_s},
                       {u"[Due] <> NULL"_s, u"0"_s},
                       {u"[Due] IS NOT NULL"_s, u"1"_s},
                       {u"NULL = NULL"_s, u"1"_s},
@@ -262,6 +287,8 @@ TEST_F(Expressions, MatchPatterns)
                       {u"[Empty] LIKE '%%'"_s, u"1"_s},
                       {u"[Empty] LIKE ''"_s, u"0"_s},
                       {u"[Qty] LIKE '4%'"_s, u"0"_s},
+                      {u"[Qty] LIKE '%'"_s, u"0"_s}, // a number has no text to match
+                      {u"'%' LIKE 5"_s, u"0"_s},
                       {u"NOT [Name] LIKE 'X%'"_s, u"1"_s}});
 }
 
@@ -342,6 +369,10 @@ TEST_F(Expressions, EndWhereTextsWouldUseUpTheMemory)
     for (int i = 0; i < 40; ++i)
         text = u"REPLACE("_s + text + u",'a','aaaaaaaaaaaaaaaa')"_s;
     EXPECT_EQ(Evaluated(text, ExprMode::Value), u"null"_s);
+    // Two copies of a long text go beyond what one evaluation may make, one does not.
+    record.SetColumns({{u"Long"_s, FieldType::Memo, Value::Text(QString((1 << 25) + 1, u'a'))}});
+    EXPECT_EQ(Evaluated(u"LENGTH(UPPER([Long]))"_s, ExprMode::Value), u"33554433"_s);
+    EXPECT_EQ(Evaluated(u"LENGTH(UPPER([Long]))+LENGTH(UPPER([Long]))"_s, ExprMode::Value), u"null"_s);
     const QString a(200000, u'a');
     EXPECT_EQ(Evaluated(u"INSTR('"_s + a + u"', '"_s + a.first(100000) + u"b')"_s, ExprMode::Value), u"0"_s);
 }

@@ -76,6 +76,8 @@ TEST(NextExpressionToken, KeepsQuotesAndBracketsTogether)
                           {u"'abc"_s, u"|'abc"_s},
                           {u"[a + b]*&[c d]"_s, u"|[a + b]|*|&[c d]"_s},
                           {u"abc[d e]f"_s, u"|abc[d e]|f"_s},
+                          {u"[a]]b] + T.[[c]]]d"_s, u"|[a]]b]|+|T.[[c]]]|d"_s}, // "]]" is a "]" of the name
+                          {u"[a]] + 1"_s, u"|[a]|]|+|1"_s},                     // but not where nothing closes it
                           {u"[never closed + 1"_s, u"|[never closed + 1"_s}});
 }
 

@@ -81,14 +81,5 @@ TEST(CompleteQuery, LeavesWhatNamesNoControl)
     });
 }
 
-TEST(OnlyReads, IsWhatShowsRecordsAlone)
-{
-    for (const char16_t* reads : {u"SELECT * FROM T", u"T", u"[My Birds]", u"not a statement at all"})
-        EXPECT_TRUE(OnlyReads(QString::fromUtf16(reads))) << QString::fromUtf16(reads).toStdString();
-    for (const char16_t* changes : {u"DELETE FROM T", u"UPDATE T SET A=1", u"DROP TABLE T", u"DROP DATABASE 'x'",
-                                    u"INSERT INTO T (A) VALUES(1)", u"CREATE TABLE T (A Integer)"})
-        EXPECT_FALSE(OnlyReads(QString::fromUtf16(changes))) << QString::fromUtf16(changes).toStdString();
-}
-
 } // namespace
 } // namespace mirel

@@ -1,6 +1,8 @@
 #include "forms/record_context.h"
 
 #include "expr/expr_parser.h"
+#include "forms/form_context.h"
+#include "support/sqlite_file.h"
 #include "support/test_database.h"
 
 namespace mirel {
@@ -48,6 +50,17 @@ TEST_F(RecordContextTest, FindsColumnsByEveryWayToWriteThem)
         EXPECT_EQ(Shown(row.name), QString::fromUtf16(row.shown)) << QString::fromUtf16(row.name).toStdString();
 }
 
+TEST_F(RecordContextTest, FindsNamesThatHoldBrackets)
+{
+    SqliteFile(path_).Run("CREATE TABLE Odd (\"a]b\" INTEGER, \"[c\" INTEGER, \"d].[e\" INTEGER);"
+                          "INSERT INTO Odd VALUES (1, 2, 3)");
+    ASSERT_TRUE(Open(records, u"SELECT * FROM Odd"_s));
+    context.ResultChanged();
+    EXPECT_EQ(Shown(u"[a]]b]"), u"1"_s);
+    EXPECT_EQ(Shown(u"Odd.[a]]b]+[[c]"), u"3"_s);
+    EXPECT_EQ(Shown(u"[d]].[e]"), u"3"_s);
+}
+
 TEST_F(RecordContextTest, FollowsTheCurrentRecord)
 {
     ASSERT_TRUE(Open(records, u"SELECT * FROM [Birds]"_s));
@@ -74,6 +87,47 @@ TEST_F(RecordContextTest, KnowsNoNameWhileClosed)
 {
     EXPECT_EQ(Shown(u"'<'+[Bird Name]+'>'"), u"<>"_s);
     EXPECT_EQ(Shown(u"RECCOUNT()"), QString());
+}
+
+// A walk lends cells where the current record has values: expressions must not see a difference.
+TEST_F(RecordContextTest, GivesAWalkTheValuesOfTheCurrentRecord)
+{
+    Run(u"CREATE TABLE [All] ([I] INTEGER, [D] FLOAT, [T] VARCHAR(40), [M] TEXT, [Y] BIT, [S] DATETIME, "
+        "[B] VARBINARY)"_s);
+    Run(u"INSERT INTO [All] ([I],[D],[T],[M],[Y],[S]) VALUES (7, 2.5, 'Gull', 'é€😀', 1, "
+        "'2001-07-04 09:05:00')"_s);
+    Run(u"INSERT INTO [All] ([I]) VALUES (NULL)"_s);
+    // As another program fills columns, whatever their types.
+    SqliteFile(path_).Run("INSERT INTO [All] VALUES (3000000000, 3, x'41FF', 12, 'perhaps', 'next Tuesday', "
+                          "x'00'), ('seven', 'x', 5, '', 0, 37076.5, 4)");
+
+    FormContext current(records, {u"ja"_s, u"nein"_s}, {}, [] { return QDateTime(); });
+    for (const QString& statement : {u"SELECT * FROM [All]"_s, u"SELECT I+1 AS I, D*2 AS D, UPPER(T) AS T, M, Y, "
+                                                               "S, B FROM [All]"_s}) {
+        ASSERT_TRUE(Open(records, statement));
+        current.ResultChanged();
+        for (const QString& text : {u"[I]"_s, u"[D]/2"_s, u"[T]"_s, u"UPPER([T])+'/'+[M]"_s, u"[Y]"_s, u"[S]"_s,
+                                    u"[S]+1"_s, u"[B]"_s, u"RECNO()+[T]+[Nobody]"_s, u"TO_CHAR([I])"_s}) {
+            const ExprTree tree = ParseExpression(text, ExprMode::Value);
+            QStringList walked;
+            RowContext rows(current, 0);
+            rows.Collect(*tree);
+            ASSERT_TRUE(records.Read({.fields = rows.Columns().empty() ? std::vector{0} : rows.Columns()},
+                                     [&](std::span<const Cell> cells) {
+                                         rows.Lend(walked.size(), cells);
+                                         EvaluateExpression(rows, *tree);
+                                         walked += (tree->null ? u"null "_s : u""_s) + ShownText(*tree);
+                                         return true;
+                                     }));
+            QStringList moved;
+            for (bool more = records.MoveFirst(); more && !records.IsEof(); more = records.MoveNext()) {
+                EvaluateExpression(current, *tree);
+                moved += (tree->null ? u"null "_s : u""_s) + ShownText(*tree);
+            }
+            EXPECT_EQ(moved.size(), 4);
+            EXPECT_EQ(walked, moved) << text.toStdString();
+        }
+    }
 }
 
 } // namespace

@@ -145,5 +145,19 @@ TEST_F(Queries, ThatFailLeaveTheViewAsItWas)
     EXPECT_EQ(browser.FieldCount(), 1) << "the new one is the base now";
 }
 
+TEST_F(Queries, AreShownBeforeTheyChangeAnything)
+{
+    EXPECT_TRUE(queries.AskIfItChanges(u"Old ones"_s, u"SELECT * FROM People"_s));
+    EXPECT_EQ(prompt.questions, QStringList());
+    const QString wipe = u"DELETE FROM People WHERE Name='"_s + QString(1000, u'x') + u'\'';
+    EXPECT_FALSE(queries.AskIfItChanges(u"Wipe"_s, wipe));
+    ASSERT_EQ(prompt.questions.size(), 1);
+    EXPECT_TRUE(prompt.questions[0].contains(u"\"Wipe\""_s));
+    EXPECT_TRUE(prompt.questions[0].contains(wipe.first(300)));
+    EXPECT_LT(prompt.questions[0].size(), 600) << "it has to fit a small window";
+    prompt.answers = {true};
+    EXPECT_TRUE(queries.AskIfItChanges(u"Wipe"_s, wipe));
+}
+
 } // namespace
 } // namespace mirel

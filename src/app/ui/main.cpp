@@ -29,9 +29,9 @@ void Say(std::FILE* stream, const QString& text)
 
 // The core of the program, from the ground up; a window stands on it, or none.
 struct Core {
-    Core(const QString& home, UserPrompt& prompt)
-        : folder(ProgramFolder::Find(home))
-        , profile(folder.ProfileFile())
+    Core(const QString& home, UserPrompt& prompt, Profile::Access access = Profile::Access::ReadWrite)
+        : folder{.path = ProgramFolder::Find(home).path, .profileAccess = access}
+        , profile(folder.OpenProfile())
         , settings(profile)
         , session(connection, folder, prompt)
         , commands(session, state, settings, SampleDatabase(folder, kSampleSource))
@@ -70,7 +70,8 @@ bool Open(Core& core, const WindowOptions& options)
 int TakePicture(const WindowOptions& options)
 {
     cli::ConsolePrompt prompt(kAnswerNo); // nobody is there to press a button
-    Core core(options.home, prompt);
+    // A script's picture must not become the database that the user's next window opens.
+    Core core(options.home, prompt, Profile::Access::ReadOnly);
     if (!Open(core, options))
         return kFailed;
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);

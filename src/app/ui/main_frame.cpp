@@ -176,7 +176,7 @@ void CMainFrame::Run(ShellCommand id)
         ShowAbout(session_, *this);
         return;
     case ShellCommand::Open:
-        if (const std::optional<TableRequest> request = commands_.RequestOfSelected())
+        if (const std::optional<TableRequest> request = commands_.RequestToOpen())
             OpenTable(*request);
         else if (const std::optional<FormCall> call = commands_.CallOfSelected())
             OpenForm(*call);

@@ -120,13 +120,13 @@ bool ResultCommands::OpenQuery()
         return true;
     if (!browser_.WriteEdit())
         return false;
-    const SavedQueries queries(*store_, prompt_);
+    SavedQueries queries(*store_, prompt_);
     CQueryDialog dialog(queries.Names(), &view_);
     FillSmallWindow(dialog, view_);
     if (dialog.exec() != QDialog::Accepted)
         return true;
     const std::optional<QString> statement = queries.StatementOf(dialog.Chosen());
-    if (!statement)
+    if (!statement || !queries.AskIfItChanges(dialog.Chosen(), *statement))
         return true;
     const WaitCursor waiting;
     if (!browser_.OpenInstead(*statement))
