@@ -42,7 +42,7 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
     , surface_(new FormSurface(form_, nullptr))
     , detail_(new QTreeWidget(this))
     , list_(new RecordList({.rows = [this](qint64 first, int count) { return form_.RecordTexts(first, count); },
-                            .maxColumnChars = surroundings.settings.maxColumnChars},
+                            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }},
                            this))
 {
     CreateActions();
@@ -234,7 +234,7 @@ void CFormEngView::FitSurface()
 
 void CFormEngView::ShowScrollBar(bool shown)
 {
-    scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
+    scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
     ActionOf(FormCommand::ScrollBar)->setChecked(shown);
 }
 

@@ -9,6 +9,7 @@
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QMouseEvent>
+#include <QPlainTextEdit>
 #include <QPushButton>
 
 #include <algorithm>
@@ -65,9 +66,11 @@ void FormSurface::MakeControls()
     for (int i = 0; i < int(controls.size()); ++i) {
         const ControlWidget::ListSource list{
             .rows = [this, i](qint64 first, int count) { return form_.ListRows(i, first, count); },
-            .maxColumnChars = form_.Settings().maxColumnChars};
+            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }};
         const ControlRun& control = controls[size_t(i)];
         widgets_.push_back(ControlWidget::Make(control, list, *this));
+        if (IsComputed(i))
+            widgets_.back()->SetComputed();
         widgets_.back()->Show(control);
         shown_[size_t(i)] = control.revision;
         Remember(i);
@@ -169,6 +172,19 @@ bool FormSurface::IsInput(int control) const
     return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
 }
 
+// A box that shows an expression is for reading, but where a button reads it: then what is typed counts.
+bool FormSurface::IsComputed(int control) const
+{
+    const ControlRun& run = form_.Controls()[size_t(control)];
+    if (run.type != ControlType::EditBox || run.keepsInput || run.definition->hasSource == 0)
+        return false;
+    return std::ranges::none_of(form_.Controls(), [&run](const ControlRun& other) {
+        const QString source = other.definition->source.Text();
+        return other.type == ControlType::Button &&
+               (source.contains(u'&' + run.name) || source.contains(QStringLiteral("&[") + run.name + u']'));
+    });
+}
+
 // The record counter is first in most lists; nobody begins with it.
 void FormSurface::FocusFirstInput()
 {
@@ -212,6 +228,22 @@ bool FormSurface::RevertFocused()
     });
     if (auto* line = qobject_cast<QLineEdit*>(WidgetOf(control)))
         line->selectAll();
+    return true;
+}
+
+bool FormSurface::PasteInto(int control, const QString& text)
+{
+    if (control < 0)
+        return false;
+    QWidget* widget = WidgetOf(control);
+    if (const auto* box = qobject_cast<QComboBox*>(widget))
+        widget = box->lineEdit();
+    if (auto* line = qobject_cast<QLineEdit*>(widget); line && !line->isReadOnly())
+        line->insert(text);
+    else if (auto* memo = qobject_cast<QPlainTextEdit*>(widget); memo && !memo->isReadOnly())
+        memo->insertPlainText(text);
+    else
+        return false;
     return true;
 }
 
@@ -273,6 +305,13 @@ bool FormSurface::eventFilter(QObject* watched, QEvent* event)
                               keyboard ? widget.mapToGlobal(widget.rect().bottomLeft()) : menu->globalPos());
         return true;
     }
+    case QEvent::Wheel:
+        // Scrolling over a box that nobody works in changes no record.
+        if (qobject_cast<QComboBox*>(WidgetOf(control)) && FocusedControl() != control) {
+            event->ignore();
+            return true;
+        }
+        break;
     case QEvent::MouseButtonPress:
     case QEvent::MouseMove:
     case QEvent::MouseButtonRelease:
@@ -316,7 +355,8 @@ void FormSurface::timerEvent(QTimerEvent* event)
         return;
     }
     hold_.stop();
-    Q_EMIT popupRequested(holdControl_, holdAt_);
+    if (!QApplication::activePopupWidget()) // the list of a drop-down box, which the tap has opened
+        Q_EMIT popupRequested(holdControl_, holdAt_);
 }
 
 } // namespace mirel

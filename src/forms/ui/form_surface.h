@@ -35,6 +35,8 @@ public:
     void FocusFirstInput();
     // Gives the focused control its text of before back. False when it has that already.
     bool RevertFocused();
+    // At the caret of a text control, or over what is selected in it. False: nothing can be typed there.
+    bool PasteInto(int control, const QString& text);
     // See ControlWidget::OpenMore.
     bool OpenMoreOf(int control);
 
@@ -55,6 +57,7 @@ private:
     void Watch(QWidget& widget, int control);
     void OrderTabs();
     bool IsInput(int control) const;
+    bool IsComputed(int control) const;
     bool KeyPressed(int control, const QKeyEvent& event);
     void FollowHold(QWidget& widget, const QMouseEvent& event);
     void Remember(int control);
