@@ -1,6 +1,7 @@
 #include "forms/ui/form_surface.h"
 
 #include "forms/ui/control_look.h"
+#include "platform/ui/look_roles.h"
 
 #include <QAbstractScrollArea>
 #include <QApplication>
@@ -211,9 +212,8 @@ void FormSurface::Remember(int control)
     before_[size_t(control)] = TextOf(form_.Controls()[size_t(control)]);
 }
 
-bool FormSurface::RevertFocused()
+bool FormSurface::Revert(int control)
 {
-    const int control = FocusedControl();
     if (control < 0 || !IsInput(control))
         return false;
     const ControlRun& run = form_.Controls()[size_t(control)];
@@ -229,6 +229,19 @@ bool FormSurface::RevertFocused()
     if (auto* line = qobject_cast<QLineEdit*>(WidgetOf(control)))
         line->selectAll();
     return true;
+}
+
+void FormSurface::MarkRefused(int control)
+{
+    if (control == refused_)
+        return;
+    for (const auto& [marked, refused] : {std::pair(refused_, false), std::pair(control, true)}) {
+        if (marked < 0)
+            continue;
+        WidgetOf(marked)->setProperty(kRefusedProperty, refused);
+        WidgetOf(marked)->update();
+    }
+    refused_ = control;
 }
 
 bool FormSurface::PasteInto(int control, const QString& text)
@@ -258,7 +271,7 @@ bool FormSurface::KeyPressed(int control, const QKeyEvent& event)
     const bool plain = (event.modifiers() & ~Qt::KeypadModifier) == Qt::NoModifier;
     switch (event.key()) {
     case Qt::Key_Escape:
-        return plain && RevertFocused();
+        return plain && Revert(FocusedControl());
     case Qt::Key_F4:
     case Qt::Key_F2:
         return plain && OpenMoreOf(control);
