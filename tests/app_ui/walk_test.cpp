@@ -251,6 +251,45 @@ TEST_F(Walk, GoesThroughTheTableView)
     }
 }
 
+// Fonts of any size, the other direction of reading, the most columns and the longest names that a table has: all
+// of it is drawn, and the selection comes into sight.
+TEST_F(Walk, BearsOddFontsDirectionsAndTables)
+{
+    QStringList columns;
+    for (int i = 0; i < 2000; ++i)
+        columns += u"[%1 %2] Varchar(9)"_s.arg(QString(240, u'n'), QString::number(i));
+    Run(u"CREATE TABLE Wide (%1)"_s.arg(columns.join(u',')));
+    Run(u"INSERT INTO Wide ([%1 0]) VALUES('x')"_s.arg(QString(240, u'n')));
+    Run(u"UPDATE People SET Note='%1' WHERE Name='P2'"_s.arg(QString(1'000'000, u'm')));
+    const QFont usual = QApplication::font();
+    for (const int points : {6, 9, 36}) {
+        for (const Qt::LayoutDirection direction : {Qt::LeftToRight, Qt::RightToLeft}) {
+            QFont font = usual;
+            font.setPointSize(points);
+            QApplication::setFont(font);
+            QApplication::setLayoutDirection(direction);
+            for (const QString& table : {u"Wide"_s, u"People"_s}) {
+                CTableView view(connection, path, prompt, {.maxColumnChars = TableViewSettings::kNoColumnLimit});
+                view.resize(kUpright);
+                ASSERT_TRUE(view.OpenTable(table));
+                view.show();
+                auto* grid = view.findChild<RecordGrid*>();
+                grid->setFocus();
+                QTest::keyClick(grid, Qt::Key_End);
+                QApplication::processEvents();
+                const RecordBrowser& browser = view.Browser();
+                const QRect cell = grid->CellRect(0, browser.SelectedColumn());
+                EXPECT_TRUE(cell.intersects(grid->viewport()->rect())) << table.toStdString() << " " << points;
+                EXPECT_LE(cell.width(), grid->viewport()->width()) << table.toStdString() << " " << points;
+                Paint(view, u"odd-%1-%2-%3"_s.arg(table, QString::number(points),
+                                                  direction == Qt::LeftToRight ? u"left"_s : u"right"_s));
+            }
+        }
+    }
+    QApplication::setFont(usual);
+    QApplication::setLayoutDirection(Qt::LeftToRight);
+}
+
 TEST_F(Walk, GoesThroughTheMessageBoxes)
 {
     MessageBoxPrompt boxes;

@@ -229,6 +229,12 @@ void FlatStyle::drawControl(ControlElement element, const QStyleOption* option, 
         if (const auto* tab = qstyleoption_cast<const QStyleOptionTab*>(option))
             return DrawTab(*painter, *tab);
         break;
+    case CE_MenuBarItem:
+        TouchTargetStyle::drawControl(element, option, painter, widget);
+        if (!(option->state & State_Selected)) // Fusion's line beneath it
+            painter->fillRect(QRect(option->rect.bottomLeft(), QSize(option->rect.width(), 1)),
+                              option->palette.color(QPalette::Window));
+        return;
     case CE_ToolBar:
     case CE_MenuBarEmptyArea:
         painter->fillRect(option->rect, option->palette.color(QPalette::Window));

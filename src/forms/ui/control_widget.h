@@ -39,6 +39,8 @@ public:
     virtual void Place(const SurfaceScale& scale);
     // The control shows what the form computes: nobody types into it.
     virtual void SetComputed() {}
+    // A line of text that stands beside a box goes to the height of the box's, in the surface's pixels.
+    virtual void AlignTextTo(const QWidget& box) { (void)box; }
     // The longer text or the calendar of an edit box, the items of a drop-down box. False: there is none.
     virtual bool OpenMore() { return false; }
 

@@ -150,7 +150,30 @@ void FormSurface::SetScale(const SurfaceScale& scale)
     scale_ = scale;
     for (const std::unique_ptr<ControlWidget>& widget : widgets_)
         widget->Place(scale);
+    AlignLabels();
     resize(scale.Of(formSize_));
+}
+
+// A label belongs to the first box to its right in its line.
+void FormSurface::AlignLabels()
+{
+    const std::span<const ControlRun> controls = form_.Controls();
+    for (size_t i = 0; i < controls.size(); ++i) {
+        if (controls[i].type != ControlType::Label)
+            continue;
+        const QRect label = widgets_[i]->Main()->geometry();
+        const QWidget* nearest = nullptr;
+        for (size_t other = 0; other < controls.size(); ++other) {
+            const QWidget* box = widgets_[other]->Main();
+            const bool isLine = qobject_cast<const QLineEdit*>(box) || qobject_cast<const QComboBox*>(box);
+            const bool beside = box->x() >= label.right() && box->y() <= label.center().y() &&
+                                box->geometry().bottom() >= label.center().y();
+            if (isLine && beside && (!nearest || box->x() < nearest->x()))
+                nearest = box;
+        }
+        if (nearest)
+            widgets_[i]->AlignTextTo(*nearest);
+    }
 }
 
 int FormSurface::ControlOf(const QObject* widget) const

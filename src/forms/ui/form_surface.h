@@ -59,6 +59,7 @@ private:
     void ConnectControl(int control);
     void Watch(QWidget& widget, int control);
     void OrderTabs();
+    void AlignLabels();
     bool IsInput(int control) const;
     bool IsComputed(int control) const;
     bool KeyPressed(int control, const QKeyEvent& event);

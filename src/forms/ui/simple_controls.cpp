@@ -12,6 +12,7 @@
 #include <QStylePainter>
 
 #include <algorithm>
+#include <cstdlib>
 #include <limits>
 
 namespace mirel {
@@ -97,6 +98,21 @@ void LabelWidget::Place(const SurfaceScale& scale)
     if (IsSingleLine())
         NarrowToFit(*label_, text_, label_->contentsRect().width(), kLeastLabel);
     ShowText();
+}
+
+// Both texts stand in the middle of their windows; the margin moves the label's to the base line of the box's.
+void LabelWidget::AlignTextTo(const QWidget& box)
+{
+    if (!IsSingleLine())
+        return;
+    const auto baseLine = [](const QWidget& widget) {
+        const QFontMetrics metrics = widget.fontMetrics();
+        return widget.y() + (widget.height() + metrics.ascent() - metrics.descent()) / 2;
+    };
+    label_->setContentsMargins({});
+    const int down = baseLine(box) - baseLine(*label_);
+    if (std::abs(down) < label_->height() / 2)
+        label_->setContentsMargins(0, std::max(2 * down, 0), 0, std::max(-2 * down, 0));
 }
 
 bool LabelWidget::IsSingleLine() const
