@@ -26,6 +26,8 @@ constexpr std::array kSettings = {
     SettingRow{Setting::MainViewBkColor, u"MainView", u"BkColor", Colors, u"", u"background colours"},
     SettingRow{Setting::MainViewTextColor, u"MainView", u"TextColor", Colors, u"", u"text colours"},
     SettingRow{Setting::MainViewFont, u"MainView", u"Font", Font, kDefaultFont, u"font"},
+    SettingRow{Setting::MainViewPalette, u"MainView", u"palette", Text, u"own",
+               u"own, light or dark: the program's own look; desktop: the desktop's"},
     SettingRow{Setting::TableViewMaxColumnChars, u"TableView", u"maxColumnChars", Integer, u"50",
                u"widest column of the record grid, in characters"},
     SettingRow{Setting::TableViewConfirmDelete, u"TableView", u"confirmDelete", Integer, u"1",

@@ -26,6 +26,7 @@ enum class Setting {
     MainViewBkColor,
     MainViewTextColor,
     MainViewFont,
+    MainViewPalette,
     TableViewMaxColumnChars,
     TableViewConfirmDelete,
     TableViewSortColumn,

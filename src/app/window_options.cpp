@@ -22,7 +22,7 @@ struct OptionDef {
 const std::array kOptions = {
     OptionDef{u"home", u"DIR", u"the program folder: side files, favorites, profile, sample", &WindowOptions::home,
               nullptr},
-    OptionDef{u"palette", u"light|dark", u"one of the program's own palettes instead of the desktop's",
+    OptionDef{u"palette", u"own|light|dark|desktop", u"the program's own look, or the desktop's",
               &WindowOptions::palette, nullptr},
     OptionDef{u"sample", u"", u"open the sample database, and make it first where it is not there", nullptr,
               &WindowOptions::sample},
@@ -64,8 +64,9 @@ bool ReadOptions(const QCommandLineParser& parser, WindowOptions& options, QStri
         if (option.flag)
             options.*option.flag = parser.isSet(name);
     }
-    if (!options.palette.isEmpty() && options.palette != u"light" && options.palette != u"dark") {
-        complaint = u"--palette is light or dark, not \"%1\""_s.arg(options.palette);
+    static const QStringList palettes = {{}, u"own"_s, u"light"_s, u"dark"_s, u"desktop"_s};
+    if (!palettes.contains(options.palette)) {
+        complaint = u"--palette is own, light, dark or desktop, not \"%1\""_s.arg(options.palette);
         return false;
     }
     if (parser.isSet(u"size"_s)) {

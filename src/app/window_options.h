@@ -12,7 +12,7 @@ namespace mirel {
 struct WindowOptions {
     QString database;    // to open; empty: the one of the last time
     QString home;        // the program folder; empty: as ProgramFolder::Find says
-    QString palette;     // "light", "dark"; empty: the desktop's
+    QString palette;     // "own", "light", "dark", "desktop"; empty: as the settings have it
     bool sample = false; // opens the sample, and makes it when it is not there
 
     // A picture of the window instead of the window.

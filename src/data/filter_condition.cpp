@@ -86,7 +86,15 @@ QString Quoted(FieldType type, const QString& value)
 {
     if (IsNumber(type))
         return value;
-    return u'\'' + (type == FieldType::Date ? value : PreparedText(value)) + u'\'';
+    return u'\'' + PreparedText(value) + u'\'';
+}
+
+// Nothing equals no value: IS does.
+QString ConditionWithoutValue(const QString& reference, QStringView operatorText)
+{
+    if (operatorText == u"=")
+        return reference + u" IS NULL"_s;
+    return operatorText == u"not =" ? reference + u" IS NOT NULL"_s : QString();
 }
 
 } // namespace
@@ -141,7 +149,9 @@ QString FilterDraft::Condition() const
         return operatorText.isEmpty() ? QString() : reference + u' ' + operatorText;
     if (fromTo) {
         const QString to = Trimmed(toValueText);
-        if (operatorText.isEmpty() || toOperatorText.isEmpty())
+        const bool needsValues = !IsText(type);
+        if (operatorText.isEmpty() || toOperatorText.isEmpty() ||
+            (needsValues && (value.isEmpty() || to.isEmpty())))
             return {};
         return u"%1 %2 %3 AND %1 %4 %5"_s.arg(reference, operatorText, Quoted(type, value), toOperatorText,
                                               Quoted(type, to));
@@ -150,6 +160,8 @@ QString FilterDraft::Condition() const
         return TextCondition(reference, operatorText, value);
     if (!IsNumber(type) && type != FieldType::Date)
         return {};
+    if (value.isEmpty())
+        return ConditionWithoutValue(reference, operatorText);
     if (type == FieldType::Double && operatorText == u"="_s)
         return u"%1 >= %2 AND %1 <= %2"_s.arg(reference, value);
     return u"%1 %2 %3"_s.arg(reference, operatorText, Quoted(type, value));

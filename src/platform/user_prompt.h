@@ -47,9 +47,21 @@ public:
         (void)third;
         return AskYesNo(question) ? Answer::Yes : Answer::No;
     }
+    // A question with a plain line below it that says what the answer means; empty: none.
+    virtual bool AskYesNoWithNote(const UserMessage& question, const QString& note)
+    {
+        (void)note;
+        return AskYesNo(question);
+    }
     virtual void Show(const UserMessage& message) = 0;
     // A text that is not a row of the string table: a failure of the provider, with its context.
     virtual void ShowError(const QString& text) = 0;
+    // The same with a line below it that says in plain words what is wrong with what the user did; empty: none.
+    virtual void ShowErrorWithReason(const QString& text, const QString& reason)
+    {
+        (void)reason;
+        ShowError(text);
+    }
     // Empty optional: the user cancelled.
     virtual std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,
                                            const QString& preset) = 0;

@@ -111,6 +111,11 @@ QString DisplayText(const Value& value, FieldType type, const YesNoWords& words)
     return VariantText(value);
 }
 
+QString BlobText(qint64 bytes)
+{
+    return UserLocale::Current().Locale().formattedDataSize(bytes, 1, QLocale::DataSizeTraditionalFormat);
+}
+
 QString CutForGrid(const QString& text, int maxChars)
 {
     if (maxChars < 0 || text.size() <= maxChars)

@@ -17,6 +17,9 @@ QString DisplayText(const Value& value, FieldType type, const YesNoWords& words)
 // `maxChars` characters and "~". Of a long text only what is shown is ever converted.
 QString GridText(const Cell& cell, FieldType type, const YesNoWords& words, int maxChars);
 
+// What stands for bytes, which nobody reads: how many they are.
+QString BlobText(qint64 bytes);
+
 QString CutForGrid(const QString& text, int maxChars);
 
 constexpr bool IsRightAligned(FieldType type)

@@ -2,6 +2,7 @@
 
 #include "platform/user_locale.h"
 #include "result/cell_text.h"
+#include "tableview/why_not_stored.h"
 
 namespace mirel {
 
@@ -20,9 +21,9 @@ void CellEdit::Load(const Value& value, FieldType type, int size)
     text_ = loadedText_ = VariantText(value);
 }
 
-bool CellEdit::IsKeptWhole() const
+QString CellEdit::WhyNotStored() const
 {
-    return kind_ == EditorKind::Check || mirel::IsKeptWhole(text_, type_, size_);
+    return !pending_ || kind_ == EditorKind::Check ? QString() : mirel::WhyNotStored(text_, type_, size_);
 }
 
 void CellEdit::SetText(const QString& text)
@@ -50,12 +51,6 @@ void CellEdit::Revert()
 {
     text_ = loadedText_;
     checked_ = loadedChecked_;
-    pending_ = false;
-}
-
-void CellEdit::ShowText(const QString& text)
-{
-    text_ = text;
     pending_ = false;
 }
 

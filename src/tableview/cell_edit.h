@@ -21,13 +21,14 @@ public:
     bool IsChecked() const { return checked_; }
     bool IsUnset() const { return unset_ && !pending_; } // a Yes/No that is neither
     bool IsPending() const { return pending_; }
-    bool IsKeptWhole() const; // false: what is stored will not be all of the text
+    // Why what is stored would not be all of the text; empty: it would.
+    QString WhyNotStored() const;
+    const QString& LoadedText() const { return loadedText_; } // what Revert gives back
 
     void SetText(const QString& text);
     void SetChecked(bool checked);
     void Clear(); // to NULL; an unticked box for a Yes/No
     void Revert();
-    void ShowText(const QString& text); // what is no edit: a later Revert gives the loaded text back
 
     Value Stored() const;
 

@@ -157,13 +157,10 @@ void RecordBrowser::RebuildColumns()
     ++columnsRevision_;
 }
 
-bool RecordBrowser::ChangeSettings(const TableViewSettings& settings)
+void RecordBrowser::ChangeSettings(const TableViewSettings& settings)
 {
-    if (!WriteEdit())
-        return false;
     settings_ = settings;
     FillPage();
-    return true;
 }
 
 bool RecordBrowser::CountOn(int budgetMs)
@@ -183,7 +180,17 @@ QString RecordBrowser::FieldLabel() const
 void RecordBrowser::ShowInEditor(const QString& label, const QString& text)
 {
     shownLabel_ = label;
-    edit_.ShowText(text);
+    shownResult_ = text;
+}
+
+QString RecordBrowser::WhyNotEditable() const
+{
+    if (edit_.Kind() == EditorKind::None || CanEdit())
+        return {};
+    if (!CanUpdate())
+        return StringText(Str::WhyReadOnly);
+    const Str why = IsBinary(TypeOfField(selectedField_)) ? Str::WhyBytes : Str::WhyComputed;
+    return StringText(why, {FieldName(selectedField_)});
 }
 
 bool RecordBrowser::CanEdit() const
@@ -193,32 +200,44 @@ bool RecordBrowser::CanEdit() const
 
 void RecordBrowser::EditText(const QString& text)
 {
-    if (CanEdit() && edit_.Kind() != EditorKind::Check)
-        edit_.SetText(text);
+    if (!CanEdit() || edit_.Kind() == EditorKind::Check)
+        return;
+    EndResult();
+    edit_.SetText(text);
 }
 
 void RecordBrowser::EditChecked(bool checked)
 {
-    if (CanEdit() && edit_.Kind() == EditorKind::Check)
-        edit_.SetChecked(checked);
+    if (!CanEdit() || edit_.Kind() != EditorKind::Check)
+        return;
+    EndResult();
+    edit_.SetChecked(checked);
 }
 
 void RecordBrowser::ClearCell()
 {
-    if (CanEdit())
-        edit_.Clear();
+    if (!CanEdit())
+        return;
+    EndResult();
+    edit_.Clear();
+}
+
+QString RecordBrowser::CurrentDateTimeText()
+{
+    const std::optional<double> now = OleDate(QDateTime::currentDateTime());
+    return now ? UserLocale::Current().DateTimeText(*now) : QString();
 }
 
 void RecordBrowser::InsertCurrentDateTime()
 {
-    if (const std::optional<double> now = OleDate(QDateTime::currentDateTime()))
-        EditText(UserLocale::Current().DateTimeText(*now));
+    EditText(CurrentDateTimeText());
 }
 
 void RecordBrowser::RepeatAbove()
 {
     if (!CanEdit() || SelectedRecord() < 1)
         return;
+    EndResult();
     const FieldType type = TypeOfField(selectedField_);
     const ReadRange above{.first = SelectedRecord() - 1, .count = 1, .fields = {selectedField_}};
     const bool read = Recordset().Read(above, [&](std::span<const Cell> cells) {
@@ -234,6 +253,7 @@ void RecordBrowser::RepeatAbove()
 
 void RecordBrowser::RevertEdit()
 {
+    EndResult();
     edit_.Revert();
     writeFailed_ = false;
     TakeUpChanges(); // what others did to this very record was kept from the editor
@@ -251,7 +271,9 @@ void RecordBrowser::ShowWriteError()
     if (!writeFailed_)
         return;
     writeFailed_ = false;
-    prompt_.ShowError(writeError_);
+    const QString why = WhyNotStored();
+    prompt_.ShowErrorWithReason(
+        writeError_, why.isEmpty() ? why : StringText(Str::WhyOfField, {FieldName(selectedField_), why}));
 }
 
 } // namespace mirel

@@ -61,7 +61,7 @@ public:
     const QString& Database() const { return result_.Database(); }
 
     const TableViewSettings& Settings() const { return settings_; }
-    bool ChangeSettings(const TableViewSettings& settings);
+    void ChangeSettings(const TableViewSettings& settings); // a pending edit stays
 
     int FieldCount() const { return result_.FieldCount(); }
     QString FieldName(int field) const { return result_.Records().FieldName(field); }
@@ -201,17 +201,27 @@ public:
     void EditChecked(bool checked);
     void ClearCell(); // NULL
     void InsertCurrentDateTime();
+    static QString CurrentDateTimeText();
     void RepeatAbove(); // the value of the same field in the record before
     void RevertEdit();
     QString SelectedText() const; // what the cell holds, or would with the pending edit; whole
     // What is pending as a value of the field's type.
     Value EditedValue() const { return edit_.Stored(); }
-    // Shows a text in the editor that is none of the record's: the result of a command. It is no edit.
+    // Shows the result of a command in the editor's place. It is not the cell's text: nothing edits it, and any
+    // edit, revert or move ends it.
     void ShowInEditor(const QString& label, const QString& text);
+    bool ShowsResult() const { return !shownLabel_.isEmpty(); }
+    void EndResult() { shownLabel_.clear(); }
+    const QString& ShownResult() const { return shownResult_; }
+
+    // In plain words. Empty: it can be edited; all of what is pending can be stored.
+    QString WhyNotEditable() const;
+    QString WhyNotStored() const { return edit_.WhyNotStored(); }
 
     [[nodiscard]] bool WriteEdit();
     bool WriteFailed() const { return writeFailed_; }
     void ShowWriteError();
+    const QString& WriteError() const { return writeError_; } // of the last write that failed
 
     // --- records ------------------------------------------------------------------------------------------
 
@@ -307,7 +317,8 @@ private:
     bool extending_ = false;
 
     CellEdit edit_;
-    QString shownLabel_; // of a text in the editor that is none of the record's
+    QString shownLabel_; // of a command's result; empty: the editor shows the cell
+    QString shownResult_;
     bool writeFailed_ = false;
     QString writeError_;
 };

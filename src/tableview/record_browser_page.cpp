@@ -10,6 +10,16 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+QString PageText(const Cell& cell, FieldType type, const TableViewSettings& settings)
+{
+    return cell.kind == Cell::Kind::Binary ? BlobText(qint64(cell.bytes.size()))
+                                           : GridText(cell, type, settings.words, settings.maxColumnChars);
+}
+
+} // namespace
+
 // --- the page -----------------------------------------------------------------------------------------------
 
 qint64 RecordBrowser::HighestTopRow() const
@@ -148,8 +158,7 @@ bool RecordBrowser::ReadRows(qint64 first, int count)
     return Recordset().Read({.first = first, .count = count, .fields = fields}, [&](std::span<const Cell> cells) {
         std::vector<PageCell> row(cells.size());
         for (size_t i = 0; i < cells.size(); ++i) {
-            row[i] = {GridText(cells[i], TypeOfField(fields[i]), settings_.words, settings_.maxColumnChars),
-                      cells[i].kind == Cell::Kind::Null};
+            row[i] = {PageText(cells[i], TypeOfField(fields[i]), settings_), cells[i].kind == Cell::Kind::Null};
         }
         page_.rows.push_back(std::move(row));
         return true;
@@ -170,8 +179,7 @@ void RecordBrowser::FillDetail()
         for (size_t i = 0; i < cells.size(); ++i) {
             const FieldType type = TypeOfField(fields[i]);
             page_.rows.push_back({{FieldName(fields[i]), false},
-                                  {GridText(cells[i], type, settings_.words, settings_.maxColumnChars),
-                                   cells[i].kind == Cell::Kind::Null}});
+                                  {PageText(cells[i], type, settings_), cells[i].kind == Cell::Kind::Null}});
         }
         return true;
     });

@@ -1,5 +1,7 @@
 #include "data/filter_condition.h"
 
+#include "data/condition_fault.h"
+
 #include "support/printing.h"
 
 #include <gtest/gtest.h>
@@ -58,6 +60,10 @@ TEST(FilterDraft, WritesTheConditionOfItsOperator)
         {FieldType::Double, u"="_s, u"2.5"_s, u"T.[My f] >= 2.5 AND T.[My f] <= 2.5"_s},
         {FieldType::Double, u">"_s, u"2.5"_s, u"T.[My f] > 2.5"_s},
         {FieldType::Date, u"<="_s, u"7/4/2001"_s, u"T.[My f] <= '7/4/2001'"_s},
+        {FieldType::Date, u"="_s, u"7/4/2001 9:05:00 AM"_s, u"T.[My f] = '7/4/2001 9:05:00 AM'"_s},
+        {FieldType::Integer, u"="_s, u" "_s, u"T.[My f] IS NULL"_s},
+        {FieldType::Date, u"not ="_s, u""_s, u"T.[My f] IS NOT NULL"_s},
+        {FieldType::Double, u">"_s, u""_s, u""_s},
         {FieldType::YesNo, u"is false"_s, u""_s, u"T.[My f] is false"_s},
         {FieldType::LongBinary, u"="_s, u"x"_s, u""_s},
         {FieldType::None, u"="_s, u"x"_s, u""_s},
@@ -75,6 +81,22 @@ TEST(FilterDraft, WritesTheConditionOfItsOperator)
     }
 }
 
+TEST(ConditionFault, IsFoundWhereTheTextCannotBeRead)
+{
+    const struct {
+        QString condition;
+        std::optional<qsizetype> at;
+    } rows[] = {
+        {u"Age > 5 AND Name LIKE 'x%'"_s, std::nullopt},
+        {u"Age >> 5"_s, 5},
+        {u"Age = 5 5"_s, 8},
+        {u"Age >"_s, 5},
+        {u"Name = 'open"_s, 7},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(FaultInCondition(row.condition), row.at) << row.condition.toStdString();
+}
+
 TEST(FilterDraft, WritesBothEndsOfARange)
 {
     FilterDraft draft{.table = u"T"_s,
@@ -90,6 +112,9 @@ TEST(FilterDraft, WritesBothEndsOfARange)
     draft.valueText = u"1"_s;
     draft.toValueText = u"9"_s;
     EXPECT_EQ(draft.Condition(), u"T.f >= 1 AND T.f < 9"_s);
+    draft.valueText.clear();
+    EXPECT_EQ(draft.Condition(), QString()) << "no bound is no range";
+    draft.valueText = u"1"_s;
     draft.toOperatorText.clear();
     EXPECT_EQ(draft.Condition(), QString());
 }

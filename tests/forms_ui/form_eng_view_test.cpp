@@ -3,19 +3,24 @@
 #include "forms/ui/control_look.h"
 #include "forms/ui/record_list.h"
 #include "forms_ui/form_fixture.h"
+#include "platform/ui/error_line.h"
 #include "tableview/ui/filter_chip.h"
 
 #include <QCheckBox>
+#include <QClipboard>
 #include <QComboBox>
 #include <QDialog>
 #include <QHeaderView>
 #include <QLineEdit>
+#include <QMenu>
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QSignalSpy>
 #include <QTimer>
+#include <QToolButton>
+#include <QWheelEvent>
 
 #include <limits>
 
@@ -309,6 +314,72 @@ TEST_F(FormView, ADropDownBoxOffersItsItemsAndTakesOtherTexts)
     box->lineEdit()->selectAll();
     Type(u"Bern"_s);
     EXPECT_EQ(TextOf(u"City"_s), u"Bern"_s);
+}
+
+TEST_F(FormView, ADropDownBoxChangesNothingUnderTheWheelOrAHold)
+{
+    settings.holdTimeMs = 50;
+    Show({Edit(u"Name"_s),
+          {.type = ControlType::DropDownBox, .name = u"City"_s, .source = JoinDropDown({{}, u"Cork;Oslo;Rome"_s})},
+          Save({u"City"_s})});
+    Find(u"Name"_s)->setFocus();
+    auto* box = Find<QComboBox>(u"City"_s);
+    const QPoint middle = box->rect().center();
+    QWheelEvent wheel(middle, box->mapToGlobal(middle), {}, {0, -120}, Qt::NoButton, {}, Qt::NoScrollPhase, false);
+    QApplication::sendEvent(box, &wheel);
+    EXPECT_EQ(TextOf(u"City"_s), QString());
+    EXPECT_FALSE(view->Form().IsDirty());
+
+    bool listAlone = false;
+    QTimer::singleShot(200, view.get(), [&] {
+        const QWidget* popup = QApplication::activePopupWidget();
+        listAlone = popup && !qobject_cast<const QMenu*>(popup);
+        while (QWidget* open = QApplication::activePopupWidget())
+            open->close();
+    });
+    QTest::mousePress(box, Qt::LeftButton, {}, QPoint(box->width() - 5, box->height() / 2));
+    QTest::qWait(300);
+    EXPECT_TRUE(listAlone) << "the list, and no menu over it";
+}
+
+TEST_F(FormView, PastesAtTheCaret)
+{
+    Show({Edit(u"Name"_s), Save({u"Name"_s})});
+    auto* name = Find<QLineEdit>(u"Name"_s);
+    name->setFocus();
+    name->setCursorPosition(1);
+    QApplication::clipboard()->setText(u"nn"_s);
+    ActionOf(Str::ActionPaste)->trigger();
+    EXPECT_EQ(TextOf(u"Name"_s), u"Annnn"_s);
+    EXPECT_TRUE(view->Form().IsDirty());
+}
+
+TEST_F(FormView, SaysWhichTextCannotBeStoredOnceItIsLeft)
+{
+    Show({Edit(u"Born"_s, EditKind::DatePicker), Edit(u"Name"_s), Save({u"Born"_s, u"Name"_s})});
+    auto* error = view->findChild<ErrorLine*>();
+    auto* born = Find<QLineEdit>(u"Born"_s);
+    const QString before = born->text();
+    born->setFocus();
+    born->selectAll();
+    Type(u"31.31.99"_s);
+    EXPECT_EQ(error->Text(), QString()) << "not while it is typed";
+    Press(Qt::Key_Tab);
+    EXPECT_EQ(error->Text(), u"Born: not a date: 31.31.99"_s);
+    QTest::mouseClick(error->findChild<QToolButton*>(), Qt::LeftButton);
+    EXPECT_EQ(born->text(), before);
+    EXPECT_EQ(error->Text(), QString());
+}
+
+TEST_F(FormView, NobodyTypesOverWhatAFormComputes)
+{
+    Show({kCounter,
+          Edit(u"Name"_s),
+          {.name = u"from"_s, .source = u"SYSDATE()"_s},
+          Button(u"find"_s, ButtonFunction::Select, u"SELECT * FROM People WHERE Born > &from"_s)});
+    EXPECT_TRUE(Find<QLineEdit>(u"rec"_s)->isReadOnly());
+    EXPECT_FALSE(Find<QLineEdit>(u"Name"_s)->isReadOnly());
+    EXPECT_FALSE(Find<QLineEdit>(u"from"_s)->isReadOnly()) << "a button reads it";
 }
 
 TEST_F(FormView, TheLargerEditorChangesTheTextAndKeepsItsLineEnds)

@@ -17,6 +17,7 @@ public:
 
     QStringList questions; // what was asked
     QStringList shown;     // messages and errors
+    QStringList reasons;   // the plain lines below them
 
     bool AskYesNo(const UserMessage& question) override
     {
@@ -25,6 +26,11 @@ public:
     }
     void Show(const UserMessage& message) override { shown += message.Text(); }
     void ShowError(const QString& text) override { shown += text; }
+    void ShowErrorWithReason(const QString& text, const QString& reason) override
+    {
+        shown += text;
+        reasons += reason;
+    }
     std::optional<QString> AskText(const UserMessage& title, const UserMessage& label, const QString&) override
     {
         questions += title.Text() + QLatin1Char('/') + label.Text();

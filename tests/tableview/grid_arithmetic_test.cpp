@@ -36,7 +36,7 @@ protected:
     {
         layout_.Reset(3);
         for (const int column : {0, 1, 2})
-            layout_.Fit(column, 100 * (column + 1));
+            layout_.SetWidth(column, 100 * (column + 1));
     }
     ColumnLayout layout_; // edges at 100, 300 and 600
 };
@@ -59,9 +59,35 @@ TEST_F(Columns, AreResizedByTheNearestEdgeWithinReach)
     layout_.SetByHand(0, -50);
     EXPECT_EQ(layout_.WidthPx(0), ColumnLayout::kNarrowestPx);
     EXPECT_TRUE(layout_.IsByHand(0));
-    layout_.Fit(0, 80);
+    layout_.FitAnew(0);
     EXPECT_FALSE(layout_.IsByHand(0));
-    EXPECT_EQ(layout_.LeftPx(1), 80);
+}
+
+TEST_F(Columns, GrowWithTheirContentAndNeverShrinkByThemselves)
+{
+    constexpr int kMarginPx = 5;
+    constexpr int kViewPx = 200;
+    layout_.SetByHand(2, 50);
+    const struct {
+        const char* what;
+        ColumnLayout::Content content;
+        int widthPx;
+    } pages[] = {
+        {"12.5", {20, 15}, 46},
+        {"narrower", {10, 5}, 46},
+        {"100 and .125 of other rows", {30, 25}, 66},
+        {"wider than the view", {900, 0}, kViewPx},
+    };
+    for (const auto& page : pages) {
+        layout_.Grow(1, page.content);
+        layout_.TakeContentWidths(kMarginPx, kViewPx);
+        EXPECT_EQ(layout_.WidthPx(1), page.widthPx) << page.what;
+    }
+    EXPECT_EQ(layout_.WidthPx(2), 50) << "set by hand";
+    layout_.FitAnew(1);
+    layout_.Grow(1, {10, 5});
+    layout_.TakeContentWidths(kMarginPx, kViewPx);
+    EXPECT_EQ(layout_.WidthPx(1), 26) << "when it was asked to";
 }
 
 TEST(ColumnWidths, ComeBackFromTheProfile)

@@ -1,6 +1,8 @@
 // The commands on a whole result as the user reaches them: menus, dialogs and keys.
 #include "data/filter_condition.h"
 #include "forms/form_store.h"
+#include "platform/ui/date_field.h"
+#include "platform/ui/error_line.h"
 #include "resources/string_table.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
@@ -17,7 +19,7 @@
 #include <QAction>
 #include <QApplication>
 #include <QCheckBox>
-#include <QDateEdit>
+#include <QDialogButtonBox>
 #include <QGroupBox>
 #include <QLabel>
 #include <QLineEdit>
@@ -29,6 +31,7 @@
 #include <QTabWidget>
 #include <QTest>
 #include <QTimer>
+#include <QToolButton>
 #include <QTreeWidget>
 
 #include <algorithm>
@@ -54,6 +57,10 @@ protected:
     {
         const QList<QAction*> actions = view.actions();
         return *std::ranges::find(actions, StringText(text), &QAction::text);
+    }
+    static void Accept(const QDialog& dialog)
+    {
+        dialog.findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click();
     }
     void Select(int field)
     {
@@ -145,15 +152,25 @@ TEST_F(ResultCommandsTest, FiltersByAnExpressionThatBeginsWithTheCell)
                                 EXPECT_EQ(dialog.Condition(), u"People.Age = 21"_s);
                                 QComboBox* operators = dialog.findChild<FilterTerm*>()->findChild<QComboBox*>();
                                 operators->setCurrentText(u">="_s);
+                                dialog.findChild<FilterTerm*>()->SetValue(u"fourty"_s);
+                                Accept(dialog);
+                                EXPECT_TRUE(dialog.isVisible());
+                                EXPECT_EQ(dialog.findChild<ErrorLine*>()->Text(), u"not a number: fourty"_s);
                                 dialog.findChild<FilterTerm*>()->SetValue(u"40"_s);
-                                dialog.accept();
+                                Accept(dialog);
                             });
     EXPECT_EQ(browser.Conditions(), QStringList(u"People.Age >= 40"_s));
     EXPECT_EQ(browser.CounterText(), u"1/4"_s);
     InDialog<CFilterDialog>([&] { ActionOf(Str::ActionFilterExpression)->trigger(); },
                             [](CFilterDialog& dialog) {
                                 dialog.findChild<QTabWidget*>()->setCurrentIndex(1);
-                                dialog.accept();
+                                auto* expression = dialog.findChild<QPlainTextEdit*>();
+                                expression->setPlainText(u"Age >> 41"_s);
+                                Accept(dialog);
+                                EXPECT_TRUE(dialog.isVisible()) << "what was typed is not lost";
+                                EXPECT_EQ(expression->textCursor().selectionStart(), 5);
+                                expression->clear();
+                                Accept(dialog);
                             });
     EXPECT_EQ(browser.Conditions().size(), 1) << "no expression, no filter";
 }
@@ -203,18 +220,20 @@ TEST_F(ResultCommandsTest, SavesAndOpensQueries)
 
 TEST_F(ResultCommandsTest, ShowsTheEditorsOfTheChosenField)
 {
-    CFilterDialog dialog(lists, u"People"_s, u"Born"_s, u"7/4/2001"_s, &view);
+    const auto apply = [](const QString&) { return true; };
+    CFilterDialog dialog(lists, u"People"_s, u"Born"_s, u"7/4/1501 9:05:00 AM"_s, apply, &view);
     dialog.show();
     const QList<FilterTerm*> terms = dialog.findChildren<FilterTerm*>();
     ASSERT_EQ(terms.size(), 3);
-    EXPECT_TRUE(terms[0]->findChild<QDateEdit*>()->isVisible());
-    EXPECT_EQ(dialog.Condition(), u"People.Born = '7/4/2001'"_s);
+    EXPECT_TRUE(terms[0]->findChild<DateField*>()->findChild<QToolButton*>()->isVisible());
+    EXPECT_EQ(dialog.Condition(), u"People.Born = '7/4/1501 9:05:00 AM'"_s) << "its time, and any year";
     EXPECT_FALSE(terms[1]->isEnabled());
     dialog.findChild<QCheckBox*>()->click();
     EXPECT_FALSE(terms[0]->isEnabled());
-    EXPECT_EQ(dialog.Condition(), u"People.Born >= '7/4/2001' AND People.Born <= '7/4/2001'"_s);
+    EXPECT_EQ(dialog.Condition(),
+              u"People.Born >= '7/4/1501 9:05:00 AM' AND People.Born <= '7/4/1501 9:05:00 AM'"_s);
 
-    CFilterDialog ticked(lists, u"People"_s, u"Member"_s, u"Yes"_s, &view);
+    CFilterDialog ticked(lists, u"People"_s, u"Member"_s, u"Yes"_s, apply, &view);
     EXPECT_EQ(ticked.Condition(), u"People.Member is true"_s);
     EXPECT_FALSE(ticked.findChild<FilterTerm*>()->findChild<QLineEdit*>()->isEnabled());
 }
@@ -297,7 +316,8 @@ TEST_F(ResultCommandsTest, FillsAHandheldsWindowAndNoMore)
     ExportDraft draft(connection, path, prompt);
     ASSERT_TRUE(draft.SetSource(u"SELECT * FROM People"_s));
     CExportWizard wizard(draft, u"People"_s, path, &view);
-    CFilterDialog filter(lists, u"People"_s, u"Note"_s, longNote, &view);
+    CFilterDialog filter(
+        lists, u"People"_s, u"Note"_s, longNote, [](const QString&) { return true; }, &view);
     CSortDialog sort(lists, u"People"_s, u"Age"_s, &view);
     CCsvOptionsDialog options({}, &view);
     for (QDialog* dialog : std::initializer_list<QDialog*>{&wizard, &filter, &sort, &options}) {

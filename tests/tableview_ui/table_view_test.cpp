@@ -1,8 +1,10 @@
 #include "tableview/ui/table_view.h"
 
+#include "platform/ui/error_line.h"
 #include "resources/string_table.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/cell_strip.h"
+#include "tableview/ui/empty_note.h"
 #include "tableview/ui/filter_chip.h"
 #include "tableview/ui/find_line.h"
 #include "tableview/ui/navigation_row.h"
@@ -12,12 +14,14 @@
 #include <QApplication>
 #include <QCheckBox>
 #include <QClipboard>
+#include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
 #include <QMenuBar>
 #include <QMimeData>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
+#include <QPushButton>
 #include <QScrollBar>
 #include <QTest>
 #include <QTimer>
@@ -411,6 +415,146 @@ TEST_F(TableView, KeepsLineEndsThatASingleLineCannotShow)
     Type(u"!"_s);
     Press(Qt::Key_Return);
     EXPECT_EQ(Stored(u"SELECT Note FROM People WHERE Name='P1'"_s), u"one\ntwo!"_s);
+}
+
+TEST_F(TableView, SaysBesideTheEditorWhatIsWrongAndRestores)
+{
+    auto* error = view.findChild<ErrorLine*>();
+    const struct {
+        int field;
+        QString typed;
+        QString said;
+    } rows[] = {{0, u"longer than ten"_s, u"at most 10 characters, this has 15"_s},
+                {2, u"31.31.99"_s, u"not a date: 31.31.99"_s}};
+    for (const auto& row : rows) {
+        Press(Qt::Key_Home);
+        for (int i = 0; i < row.field; ++i)
+            Press(Qt::Key_Right);
+        const QString before = browser.Edit().Text();
+        Type(row.typed);
+        EXPECT_EQ(error->Text(), QString()) << "not while it is typed";
+        Press(Qt::Key_Return);
+        EXPECT_EQ(error->Text(), row.said);
+        EXPECT_TRUE(QTest::qWaitFor([this] { return !prompt.shown.isEmpty(); }));
+        prompt.shown.clear();
+        QTest::mouseClick(error->findChild<QToolButton*>(), Qt::LeftButton);
+        EXPECT_EQ(browser.Edit().Text(), before);
+        EXPECT_EQ(error->Text(), QString());
+        EXPECT_TRUE(GridHasFocus());
+    }
+}
+
+TEST_F(TableView, SaysWhyNothingCanBeTyped)
+{
+    Run(u"CREATE TABLE Blobs ([Name] Varchar(10),[Photo] Long Varbinary)"_s);
+    Run(u"INSERT INTO Blobs (Name) VALUES('x')"_s);
+    auto* error = view.findChild<ErrorLine*>();
+    EXPECT_TRUE(view.OpenStatement(u"Q"_s, u"SELECT Name,Age+1 AS Older FROM People"_s));
+    Press(Qt::Key_Right);
+    Type(u"5"_s);
+    EXPECT_TRUE(error->Text().contains(u"computed"_s) || error->Text().contains(u"read-only"_s));
+    Press(Qt::Key_Left);
+    EXPECT_EQ(error->Text(), QString()) << "gone with the cell that it was about";
+    EXPECT_TRUE(view.OpenTable(u"Blobs"_s));
+    Press(Qt::Key_Right);
+    Type(u"5"_s);
+    EXPECT_EQ(error->Text(), u"\"Photo\" holds bytes: they cannot be typed."_s);
+}
+
+TEST_F(TableView, EditsAZoomedMemoInOnePlace)
+{
+    Run(u"UPDATE People SET Note='one\r\ntwo\u00A0x\nthree' WHERE Name='P1'"_s);
+    QTest::keyClick(&view, Qt::Key_F5);
+    Press(Qt::Key_End);
+    ActionOf(Str::ZoomIn)->trigger();
+    auto* zoom = view.findChild<QPlainTextEdit*>();
+    zoom->moveCursor(QTextCursor::End);
+    ActionOf(Str::ActionInsertDateTime)->trigger();
+    const QString now = zoom->toPlainText().mid(zoom->toPlainText().lastIndexOf(u"three"_s) + 5);
+    EXPECT_FALSE(now.isEmpty());
+    EXPECT_EQ(browser.Edit().Text(), u"one\r\ntwo\u00A0x\nthree"_s + now) << "what was not edited is as it was";
+    QApplication::clipboard()->setText(u"!"_s);
+    ActionOf(Str::ActionPaste)->trigger();
+    EXPECT_EQ(browser.Edit().Text(), u"one\r\ntwo\u00A0x\nthree"_s + now + u'!');
+    Press(Qt::Key_Escape);
+    EXPECT_EQ(browser.Edit().Text(), u"one\r\ntwo\u00A0x\nthree"_s);
+    EXPECT_TRUE(zoom->isVisible());
+    Press(Qt::Key_Escape);
+    EXPECT_FALSE(zoom->isVisible()) << "with nothing to give back it leaves";
+}
+
+TEST_F(TableView, EndsAShownSumWithTheFirstKey)
+{
+    Press(Qt::Key_Right);
+    const auto label = [this] { return view.findChild<CellStrip*>()->findChild<QLabel*>()->text(); };
+    const auto sum = [&] {
+        ActionOf(Str::ActionSum)->trigger();
+        EXPECT_EQ(Line()->text(), u"650"_s);
+        EXPECT_TRUE(Line()->isReadOnly());
+    };
+    sum();
+    Press(Qt::Key_F2);
+    EXPECT_EQ(Line()->text(), u"21"_s);
+    EXPECT_EQ(label(), u"Age:"_s);
+    Press(Qt::Key_Escape);
+    sum();
+    Press(Qt::Key_Escape);
+    EXPECT_EQ(label(), u"Age:"_s);
+    sum();
+    Line()->setFocus();
+    Type(u"5"_s);
+    EXPECT_EQ(Line()->text(), u"5"_s);
+    EXPECT_EQ(label(), u"Age:"_s);
+}
+
+TEST_F(TableView, MovesSidewaysForTheSelectionAlone)
+{
+    view.resize(240, 320);
+    Press(Qt::Key_End);
+    QScrollBar* bar = grid->horizontalScrollBar();
+    ASSERT_GT(bar->maximum(), 0);
+    bar->setValue(0);
+    Press(Qt::Key_PageDown);
+    grid->verticalScrollBar()->triggerAction(QAbstractSlider::SliderSingleStepAdd);
+    ActionOf(Str::ActionSortDescending)->trigger();
+    EXPECT_EQ(bar->value(), 0);
+    Press(Qt::Key_Left);
+    EXPECT_GT(bar->value(), 0);
+}
+
+TEST_F(TableView, GrowsItsColumnsAndNeverShrinksThem)
+{
+    Run(u"UPDATE People SET Name='WWWWWWWWWW' WHERE Name='P25'"_s);
+    const int narrow = grid->CellRect(0, 0).width();
+    QTest::keyClick(grid, Qt::Key_End, Qt::ControlModifier);
+    const int wide = grid->CellRect(0, 0).width();
+    EXPECT_GT(wide, narrow);
+    QTest::keyClick(grid, Qt::Key_Home, Qt::ControlModifier);
+    EXPECT_EQ(grid->CellRect(0, 0).width(), wide);
+    ActionOf(Str::ActionFitAll)->trigger();
+    EXPECT_EQ(grid->CellRect(0, 0).width(), narrow);
+}
+
+TEST_F(TableView, TogglesTheSelectedYesNoCellWithATap)
+{
+    const QPoint cell = grid->CellRect(0, 3).center();
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, cell);
+    EXPECT_FALSE(browser.HasPendingEdit()) << "the first tap selects";
+    QTest::mouseClick(grid->viewport(), Qt::LeftButton, {}, cell);
+    EXPECT_TRUE(browser.HasPendingEdit());
+    EXPECT_TRUE(browser.Edit().IsChecked());
+}
+
+TEST_F(TableView, OffersToRemoveAFilterThatNothingMatches)
+{
+    ActionOf(Str::ActionFilterBy)->trigger();
+    Run(u"DELETE FROM People WHERE Name='P1'"_s);
+    QTest::keyClick(&view, Qt::Key_F5);
+    auto* button = view.findChild<EmptyNote*>()->findChild<QPushButton*>();
+    ASSERT_TRUE(button->isVisible());
+    button->click();
+    EXPECT_EQ(browser.CounterText(), u"1/24"_s);
+    EXPECT_FALSE(button->isVisible());
 }
 
 TEST_F(TableView, ShowsTheFilterInForceWithItsCross)

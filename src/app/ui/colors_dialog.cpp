@@ -1,5 +1,6 @@
 #include "app/ui/colors_dialog.h"
 
+#include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
@@ -78,12 +79,16 @@ CColorsDialog::CColorsDialog(const std::optional<QColor>& color, Unset unset, QW
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
-    auto* column = new QVBoxLayout(this);
+    auto* page = new QWidget(this);
+    auto* column = new QVBoxLayout(page);
+    column->setContentsMargins({});
     column->addWidget(MakePalette());
     column->addWidget(desktops_);
     column->addLayout(codeRow);
     column->addStretch(1);
-    column->addWidget(buttons);
+    auto* whole = new QVBoxLayout(this);
+    whole->addWidget(Scrolled(page), 1);
+    whole->addWidget(buttons);
     ShowChosen();
     const auto at = std::ranges::find_if(swatches_, &QToolButton::isChecked);
     (at == swatches_.end() ? (desktops_->isChecked() ? desktops_ : swatches_.front()) : *at)->setFocus();

@@ -1,17 +1,12 @@
 #pragma once
 
-#include <QPalette>
 #include <QProxyStyle>
 #include <QStringView>
 
 namespace mirel {
 
-// The program's own palettes, for those who ask for one; otherwise the desktop's is used.
-QPalette LightPalette();
-QPalette DarkPalette();
-
-// Puts the program into one of them ("light", "dark") on the Fusion style, with our own icons. False, and nothing
-// changed, for any other name.
+// Puts the program into one of its own palettes ("light", "dark", or "own": the one that goes with the desktop's)
+// on the flat style, with our own icons. False, and nothing changed, for any other name.
 bool UsePalette(QStringView name);
 
 // The user's style, with what a finger or a stylus is to hit made large enough for it: 24 pixels, 32 where there

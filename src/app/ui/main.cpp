@@ -109,6 +109,13 @@ int ShowWindow(const WindowOptions& options)
     return result;
 }
 
+QString PaletteToUse(const WindowOptions& options)
+{
+    if (!options.palette.isEmpty())
+        return options.palette;
+    return Settings(Profile(ProgramFolder::Find(options.home).ProfileFile())).Text(Setting::MainViewPalette);
+}
+
 std::optional<int> AnswerWithoutWindow(const WindowOptions& options)
 {
     if (options.help) {
@@ -148,7 +155,7 @@ int main(int argc, char** argv)
         qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
     QGuiApplication::setApplicationDisplayName(QStringLiteral("Mirel"));
-    if (!UsePalette(options->palette))
+    if (!UsePalette(PaletteToUse(*options)))
         QApplication::setStyle(new TouchTargetStyle({}));
     return picture ? TakePicture(*options) : ShowWindow(*options);
 }

@@ -255,8 +255,10 @@ QWidget* CMainFrame::OpenTable(const TableRequest& request)
         if (ChooseLook(choice, item, *table))
             ShowLook();
     });
-    connect(table, &CTableView::settingsChanged, this,
-            [this](const TableViewSettings& options) { WriteTableViewSettings(settings_, options); });
+    connect(table, &CTableView::settingsChanged, this, [this](const TableViewSettings& options) {
+        WriteTableViewSettings(settings_, options);
+        SpreadOptions();
+    });
     Place(*table, kTablePlace, kTableFirstSize);
     table->installEventFilter(this);
     table->show();
@@ -282,14 +284,22 @@ CFormEngView* CMainFrame::OpenForm(const FormCall& call)
     connect(form, &CFormEngView::keysRequested, form, [form] { ShowKeys(*form); });
     connect(form, &CFormEngView::settingsChanged, this, [this](const FormViewSettings& options) {
         WriteFormViewSettings(settings_, options);
-        for (CFormEngView* open : Forms())
-            open->ChangeSettings(options);
+        SpreadOptions();
     });
     Place(*form, kFormPlace, form->PreferredSize());
     form->installEventFilter(this);
     form->show();
     (void)form->Open(); // after show: what it has to say stands over its window
     return form;
+}
+
+// The options of one view are those of all, and the words for Yes and No those of both kinds.
+void CMainFrame::SpreadOptions()
+{
+    for (CTableView* open : Tables())
+        open->ChangeSettings(ReadTableViewSettings(settings_));
+    for (CFormEngView* open : Forms())
+        open->ChangeSettings(ReadFormViewSettings(settings_));
 }
 
 // On a handheld the window takes the frame's place.

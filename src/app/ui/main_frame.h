@@ -59,6 +59,7 @@ private:
     QList<CTableView*> Tables() const;
     QList<CFormEngView*> Forms() const;
     void Place(QWidget& window, const QString& key, QSize firstSize);
+    void SpreadOptions();
     void KeepPlaceOf(QWidget& window);
 
     DatabaseSession& session_;

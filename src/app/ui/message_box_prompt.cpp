@@ -1,18 +1,25 @@
 #include "app/ui/message_box_prompt.h"
 
+#include "platform/ui/look_roles.h"
 #include "platform/ui/wait_cursor.h"
+#include "platform/ui/window_place.h"
+#include "platform/ui/wrapped_text.h"
 #include "resources/string_table.h"
 
 #include <QApplication>
 #include <QElapsedTimer>
+#include <QGridLayout>
 #include <QInputDialog>
+#include <QLabel>
 #include <QLocale>
 #include <QMessageBox>
 #include <QProgressDialog>
 #include <QPushButton>
+#include <QStyle>
 
 #include <algorithm>
 #include <utility>
+#include <vector>
 
 namespace mirel {
 namespace {
@@ -25,8 +32,15 @@ constexpr int kSteps = 1000; // of the bar: totals may pass what a bar counts to
 
 QWidget* FrontWindow()
 {
-    QWidget* modal = QApplication::activeModalWidget();
-    return modal ? modal : QApplication::activeWindow();
+    if (QWidget* modal = QApplication::activeModalWidget())
+        return modal;
+    if (QWidget* active = QApplication::activeWindow())
+        return active;
+    const QWidgetList windows = QApplication::topLevelWidgets();
+    const auto shown = std::ranges::find_if(windows, [](const QWidget* window) {
+        return window->isVisible() && (window->windowFlags() & Qt::WindowType_Mask) == Qt::Window;
+    });
+    return shown == windows.end() ? nullptr : *shown;
 }
 
 // The system's texts break lines as the handheld did.
@@ -35,11 +49,76 @@ QString LinesOf(QString text)
     return text.replace(u"\r\n"_s, u"\n"_s);
 }
 
-QMessageBox::StandardButton Ask(const QString& text, QMessageBox::Icon icon, QMessageBox::StandardButtons buttons,
-                                QMessageBox::StandardButton preset)
+// What of a text does not fit a box can be read in its details.
+constexpr int kMostLines = 12;
+constexpr int kFewestLines = 3;
+constexpr int kWidestChars = 60;
+
+int RoomFor(const QWidget* window, const QFontMetrics& metrics)
 {
-    QMessageBox box(icon, QApplication::applicationDisplayName(), LinesOf(text), buttons, FrontWindow());
-    box.setTextFormat(Qt::PlainText);
+    constexpr int kAroundPx = 2 * spacing::kSection + 2 * spacing::kGap; // the box's frame and margins
+    const int widest = kWidestChars * metrics.averageCharWidth();
+    return window ? std::clamp(window->width() - kAroundPx, widest / 4, widest) : widest;
+}
+
+int LinesFor(const QWidget* window, const QFontMetrics& metrics)
+{
+    constexpr int kOtherLines = 8; // the note, the buttons, margins
+    const int fitting = window ? window->height() / metrics.lineSpacing() - kOtherLines : kMostLines;
+    return std::clamp(fitting, kFewestLines, kMostLines);
+}
+
+// Texts as wide as the window allows, with a plain line below; a handheld has no room for the picture beside them.
+class WideBox : public QMessageBox {
+public:
+    WideBox(Icon icon, const QString& text, const QString& note, StandardButtons buttons)
+        : QMessageBox(icon, QApplication::applicationDisplayName(), {}, buttons, FrontWindow())
+    {
+        const bool small = parentWidget() && IsHandheldSize(parentWidget()->window()->size());
+        if (small)
+            setIcon(NoIcon);
+        setTextFormat(Qt::PlainText);
+        const int picture = small ? 0 : style()->pixelMetric(QStyle::PM_MessageBoxIconSize) + spacing::kSection;
+        const int room = RoomFor(parentWidget() ? parentWidget()->window() : nullptr, fontMetrics()) - picture;
+        QStringList lines = WrappedText(LinesOf(text), font(), room).split(u'\n');
+        const int most = LinesFor(parentWidget() ? parentWidget()->window() : nullptr, fontMetrics());
+        if (lines.size() > most) {
+            setDetailedText(text);
+            lines.resize(most);
+            lines.last() = lines.last().chopped(1) + u'…';
+        }
+        setText(lines.join(u'\n'));
+        if (!note.isEmpty())
+            setInformativeText(WrappedText(LinesOf(note), font(), room));
+        if (auto* grid = qobject_cast<QGridLayout*>(layout()))
+            grid->addItem(new QSpacerItem(room + picture, 0), grid->rowCount(), 0, 1, grid->columnCount());
+    }
+};
+
+// The boxes of the work in progress, the latest last.
+std::vector<QProgressDialog*>& WorkShown()
+{
+    static std::vector<QProgressDialog*> boxes;
+    return boxes;
+}
+
+// Nothing covers a question or an error: the work's box makes room for it, and comes back with its next step.
+class WorkHidden {
+public:
+    WorkHidden()
+    {
+        for (QProgressDialog* box : WorkShown())
+            box->hide();
+    }
+    ~WorkHidden() = default;
+    Q_DISABLE_COPY_MOVE(WorkHidden)
+};
+
+QMessageBox::StandardButton Ask(const QString& text, const QString& note, QMessageBox::Icon icon,
+                                QMessageBox::StandardButtons buttons, QMessageBox::StandardButton preset)
+{
+    const WorkHidden hidden;
+    WideBox box(icon, text, note, buttons);
     box.setDefaultButton(preset);
     box.setEscapeButton(preset);
     const UsualCursor answering;
@@ -54,7 +133,13 @@ public:
         , box_(FrontWindow())
     {
         box_.setWindowTitle(QApplication::applicationDisplayName());
+        auto* label = new QLabel(&box_);
+        label->setWordWrap(true);
+        label->setAlignment(Qt::AlignCenter);
+        box_.setLabel(label);
         box_.setLabelText(what_);
+        box_.setMinimumWidth(RoomFor(box_.parentWidget(), box_.fontMetrics()));
+        WorkShown().push_back(&box_);
         box_.setRange(0, total > 0 ? kSteps : 0);
         box_.setWindowModality(Qt::ApplicationModal);
         box_.setMinimumDuration(kMomentMs);
@@ -65,7 +150,11 @@ public:
         sinceRepaint_.start();
     }
 
-    ~ProgressBox() override { QGuiApplication::restoreOverrideCursor(); }
+    ~ProgressBox() override
+    {
+        std::erase(WorkShown(), &box_);
+        QGuiApplication::restoreOverrideCursor();
+    }
     Q_DISABLE_COPY_MOVE(ProgressBox)
 
     bool Advance(qint64 done) override
@@ -100,16 +189,20 @@ private:
 
 bool MessageBoxPrompt::AskYesNo(const UserMessage& question)
 {
-    return Ask(question.Text(), QMessageBox::Question, QMessageBox::Yes | QMessageBox::No, QMessageBox::No) ==
-           QMessageBox::Yes;
+    return AskYesNoWithNote(question, {});
+}
+
+bool MessageBoxPrompt::AskYesNoWithNote(const UserMessage& question, const QString& note)
+{
+    return Ask(question.Text(), note, QMessageBox::Question, QMessageBox::Yes | QMessageBox::No,
+               QMessageBox::No) == QMessageBox::Yes;
 }
 
 UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, const UserMessage& third)
 {
-    QMessageBox box(QMessageBox::Question, QApplication::applicationDisplayName(), LinesOf(question.Text()),
-                    QMessageBox::Yes | QMessageBox::No, FrontWindow());
+    const WorkHidden hidden;
+    WideBox box(QMessageBox::Question, question.Text(), {}, QMessageBox::Yes | QMessageBox::No);
     const QAbstractButton* other = box.addButton(third.Text(), QMessageBox::AcceptRole);
-    box.setTextFormat(Qt::PlainText);
     box.setDefaultButton(QMessageBox::No);
     box.setEscapeButton(QMessageBox::No);
     const int pressed = box.exec();
@@ -120,18 +213,24 @@ UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, con
 
 void MessageBoxPrompt::Show(const UserMessage& message)
 {
-    Ask(message.Text(), QMessageBox::Information, QMessageBox::Ok, QMessageBox::Ok);
+    Ask(message.Text(), {}, QMessageBox::Information, QMessageBox::Ok, QMessageBox::Ok);
 }
 
 void MessageBoxPrompt::ShowError(const QString& text)
 {
-    Ask(text, QMessageBox::Critical, QMessageBox::Ok, QMessageBox::Ok);
+    ShowErrorWithReason(text, {});
+}
+
+void MessageBoxPrompt::ShowErrorWithReason(const QString& text, const QString& reason)
+{
+    Ask(text, reason, QMessageBox::Critical, QMessageBox::Ok, QMessageBox::Ok);
 }
 
 std::optional<QString> MessageBoxPrompt::AskText(const UserMessage& title, const UserMessage& label,
                                                  const QString& preset)
 {
     bool accepted = false;
+    const WorkHidden hidden;
     const UsualCursor answering;
     const QString text = QInputDialog::getText(FrontWindow(), title.Text(), LinesOf(label.Text()),
                                                QLineEdit::Normal, preset, &accepted);

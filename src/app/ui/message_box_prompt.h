@@ -11,9 +11,11 @@ namespace mirel {
 class MessageBoxPrompt : public UserPrompt {
 public:
     bool AskYesNo(const UserMessage& question) override;
+    bool AskYesNoWithNote(const UserMessage& question, const QString& note) override;
     Answer AskYesNoOr(const UserMessage& question, const UserMessage& third) override;
     void Show(const UserMessage& message) override;
     void ShowError(const QString& text) override;
+    void ShowErrorWithReason(const QString& text, const QString& reason) override;
     std::optional<QString> AskText(const UserMessage& title, const UserMessage& label,
                                    const QString& preset) override;
     // The box appears when the work takes longer than a moment; the wait cursor at once. While it shows, no other

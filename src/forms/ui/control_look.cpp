@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFontMetricsF>
+#include <QWidget>
 
 #include <algorithm>
 #include <cmath>
@@ -56,6 +57,16 @@ QFont FontOf(const TextStyle& style, qreal scale, int roomPx)
     if (height > roomPx)
         font.setPointSizeF(std::max(font.pointSizeF() * roomPx / height, kLeastPoints));
     return font;
+}
+
+void NarrowToFit(QWidget& widget, const QString& text, int roomPx, qreal least)
+{
+    const int width = widget.fontMetrics().size(Qt::TextShowMnemonic, text).width();
+    if (width <= roomPx)
+        return;
+    QFont font = widget.font();
+    font.setPointSizeF(font.pointSizeF() * std::max(qreal(roomPx) / width, least));
+    widget.setFont(font);
 }
 
 int LineHeightOf(const TextStyle& style)

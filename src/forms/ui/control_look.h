@@ -7,6 +7,8 @@
 
 #include <optional>
 
+class QWidget;
+
 namespace mirel {
 
 // How a form's records say that a control looks, as a font and a palette.
@@ -14,6 +16,9 @@ namespace mirel {
 // The style's font at that scale. `roomPx` is the height that a line of it may take: a font that is higher is
 // made smaller, down to what can just be read; 0: any.
 QFont FontOf(const TextStyle& style, qreal scale, int roomPx);
+
+// Makes the font of a text that is wider than its room smaller, down to that part of it.
+void NarrowToFit(QWidget& widget, const QString& text, int roomPx, qreal least);
 
 // What a line of the style's text takes of the form's height, in the form's pixels.
 int LineHeightOf(const TextStyle& style);

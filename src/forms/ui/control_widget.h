@@ -27,7 +27,7 @@ public:
     // What only a list needs.
     struct ListSource {
         RowReader rows;
-        int maxColumnChars;
+        std::function<int()> maxColumnChars; // as the options are now
     };
 
     static std::unique_ptr<ControlWidget> Make(const ControlRun& control, const ListSource& list,
@@ -37,6 +37,10 @@ public:
     virtual void Show(const ControlRun& control) = 0;
     // Puts the widgets where the definition says, in the surface's pixels, with a font to match.
     virtual void Place(const SurfaceScale& scale);
+    // The control shows what the form computes: nobody types into it.
+    virtual void SetComputed() {}
+    // A line of text that stands beside a box goes to the height of the box's, in the surface's pixels.
+    virtual void AlignTextTo(const QWidget& box) { (void)box; }
     // The longer text or the calendar of an edit box, the items of a drop-down box. False: there is none.
     virtual bool OpenMore() { return false; }
 

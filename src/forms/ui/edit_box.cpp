@@ -3,12 +3,11 @@
 #include "forms/ui/control_look.h"
 #include "forms/ui/long_text_dialog.h"
 #include "platform/ui/day_chooser.h"
+#include "platform/ui/memo_edit.h"
 #include "platform/user_locale.h"
 #include "resources/string_table.h"
 
 #include <QLineEdit>
-#include <QPlainTextEdit>
-#include <QSignalBlocker>
 #include <QStyleOptionToolButton>
 #include <QStylePainter>
 #include <QTextOption>
@@ -112,6 +111,16 @@ protected:
         return std::max(heightPx - (Definition().windowStyle & style::kBorder ? kFrameRoomPx : 0), 1);
     }
     const QString& Text() const { return text_; }
+    // On the ground of the form, where the form gives it no other.
+    void DrawComputed()
+    {
+        Main()->setFocusPolicy(Qt::ClickFocus);
+        if (Definition().backgroundColor != kDefaultColor)
+            return;
+        QPalette palette = Main()->palette();
+        palette.setColor(QPalette::Base, Qt::transparent);
+        Main()->setPalette(palette);
+    }
 
 private:
     QPoint BelowBox() const { return Main()->mapToGlobal(Main()->rect().bottomLeft()); }
@@ -137,6 +146,20 @@ public:
         connect(line_, &QLineEdit::textEdited, this, &ControlWidget::textEdited);
     }
 
+    void SetComputed() override
+    {
+        line_->setReadOnly(true);
+        line_->setFrame(false);
+        DrawComputed();
+    }
+
+    void Place(const SurfaceScale& scale) override
+    {
+        ControlWidget::Place(scale);
+        font_ = line_->font();
+        FitComputed();
+    }
+
 protected:
     QString EditorText() const override { return line_->text(); }
     void SetEditorText(const QString& text) override
@@ -146,53 +169,58 @@ protected:
             line_->selectAll();
         else
             line_->setCursorPosition(0);
+        FitComputed();
     }
 
 private:
+    // A counter or a total that nobody can scroll to its end is drawn in smaller letters.
+    void FitComputed()
+    {
+        constexpr int kAroundTextPx = 6;
+        constexpr qreal kLeast = 0.6;
+        if (!line_->isReadOnly())
+            return;
+        line_->setFont(font_);
+        NarrowToFit(*line_, line_->text(), line_->width() - kAroundTextPx, kLeast);
+    }
+
     QLineEdit* line_;
+    QFont font_; // as the form has it
 };
 
 class TextBox : public EditBox {
 public:
     TextBox(const ControlRun& control, QWidget& surface)
-        : EditBox(control, *new QPlainTextEdit(&surface), surface)
-        , text_(static_cast<QPlainTextEdit*>(Main()))
+        : EditBox(control, *new MemoEdit(&surface), surface)
+        , text_(static_cast<MemoEdit*>(Main()))
     {
         const quint32 windowStyle = Definition().windowStyle;
-        text_->setTabChangesFocus(true);
         text_->setFrameShape(windowStyle & style::kBorder ? QFrame::StyledPanel : QFrame::NoFrame);
-        text_->setVerticalScrollBarPolicy(windowStyle & style::kVerticalScrollBar ? Qt::ScrollBarAlwaysOn
-                                                                                  : Qt::ScrollBarAsNeeded);
         const bool wraps = (windowStyle & style::kAutoHorizontalScroll) == 0;
         QTextOption option(AlignmentOf(windowStyle));
         option.setWrapMode(wraps ? QTextOption::WrapAtWordBoundaryOrAnywhere : QTextOption::NoWrap);
         text_->setLineWrapMode(wraps ? QPlainTextEdit::WidgetWidth : QPlainTextEdit::NoWrap);
         text_->document()->setDefaultTextOption(option);
         text_->document()->setDocumentMargin(2);
-        connect(text_, &QPlainTextEdit::textChanged, this,
-                [this] { Q_EMIT textEdited(WithLineEndsOf(Text(), text_->toPlainText())); });
+        connect(text_, &MemoEdit::edited, this, &ControlWidget::textEdited);
+    }
+
+    void SetComputed() override
+    {
+        text_->setReadOnly(true);
+        DrawComputed();
     }
 
 protected:
-    QString EditorText() const override { return WithLineEndsOf(Text(), text_->toPlainText()); }
-    void SetEditorText(const QString& text) override
-    {
-        const QSignalBlocker quiet(text_);
-        text_->setPlainText(text);
-    }
+    QString EditorText() const override { return text_->Text(); }
+    void SetEditorText(const QString& text) override { text_->SetText(text); }
     int TextRoomPx(int) const override { return 0; }
 
 private:
-    QPlainTextEdit* text_;
+    MemoEdit* text_;
 };
 
 } // namespace
-
-QString WithLineEndsOf(const QString& before, QString edited)
-{
-    const QString handheld = u"\r\n"_s;
-    return before.contains(handheld) ? edited.replace(u'\n', handheld) : edited;
-}
 
 std::unique_ptr<ControlWidget> MakeEditBox(const ControlRun& control, QWidget& surface)
 {

@@ -8,8 +8,4 @@ namespace mirel {
 // or with none.
 std::unique_ptr<ControlWidget> MakeEditBox(const ControlRun& control, QWidget& surface);
 
-// Edited text with the line ends that the text before it had: editors know one kind only, and what the user did
-// not change is to stay as it is.
-QString WithLineEndsOf(const QString& before, QString edited);
-
 } // namespace mirel

@@ -2,9 +2,11 @@
 
 #include "forms/ui/form_surface.h"
 #include "forms/ui/record_list.h"
+#include "platform/ui/error_line.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/filter_chip.h"
+#include "tableview/why_not_stored.h"
 
 #include <QApplication>
 #include <QCloseEvent>
@@ -42,8 +44,9 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
     , surface_(new FormSurface(form_, nullptr))
     , detail_(new QTreeWidget(this))
     , list_(new RecordList({.rows = [this](qint64 first, int count) { return form_.RecordTexts(first, count); },
-                            .maxColumnChars = surroundings.settings.maxColumnChars},
+                            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }},
                            this))
+    , error_(new ErrorLine(this))
 {
     CreateActions();
     chip_ = new FilterChip(ActionOf(FormCommand::RemoveFilter), this);
@@ -56,7 +59,9 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
         lastFocused_ = surface_->ControlOf(widget);
         scroller_->ensureWidgetVisible(widget, 0, widget->height() / 2);
         ShowActions();
+        ShowReason();
     });
+    connect(error_, &ErrorLine::restoreRequested, this, [this] { (void)surface_->Revert(refusedControl_); });
     connect(list_, &RecordList::headerTapped, this, &CFormEngView::SortByHeader);
     connect(list_, &RecordList::rowChosen, this, [this](qint64 row) {
         (void)form_.GoToRecord(row);
@@ -76,6 +81,7 @@ void CFormEngView::LayOut()
     column->setSpacing(0);
     column->addWidget(stack_, 1);
     column->addWidget(chip_);
+    column->addWidget(error_);
     stack_->addWidget(scroller_);
     stack_->addWidget(detail_);
     stack_->addWidget(list_);
@@ -165,6 +171,32 @@ void CFormEngView::ShowState()
     if (CurrentPage() == Page::List)
         ShowList();
     ShowActions();
+    ShowReason();
+}
+
+void CFormEngView::ShowReason()
+{
+    refusedControl_ = -1;
+    QString why;
+    const std::span<const ControlRun> controls = form_.Controls();
+    for (int i = 0; i < int(controls.size()) && why.isEmpty(); ++i) {
+        const int field = controls[size_t(i)].edited ? form_.FieldOfControl(i) : -1;
+        if (field < 0 || i == surface_->FocusedControl())
+            continue;
+        const ResultField& shown = form_.Fields()[size_t(field)];
+        const bool isTyped = IsText(shown.type) || IsNumber(shown.type) || shown.type == FieldType::Date;
+        why = isTyped ? WhyNotStored(controls[size_t(i)].text, shown.type, shown.size) : QString();
+        if (why.isEmpty())
+            continue;
+        refusedControl_ = i;
+        why = StringText(Str::WhyOfField, {shown.name, why});
+    }
+    surface_->MarkRefused(refusedControl_);
+    if (refusedControl_ < 0)
+        return error_->Clear();
+    const QString before = Quoted(surface_->TextBefore(refusedControl_)).replace(u'&', QStringLiteral("&&"));
+    error_->ShowError(why, before.isEmpty() ? StringText(Str::ErrorRestoreEmpty)
+                                            : StringText(Str::ErrorRestore, {before}));
 }
 
 CFormEngView::Page CFormEngView::CurrentPage() const
@@ -234,7 +266,7 @@ void CFormEngView::FitSurface()
 
 void CFormEngView::ShowScrollBar(bool shown)
 {
-    scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAlwaysOn : Qt::ScrollBarAlwaysOff);
+    scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
     ActionOf(FormCommand::ScrollBar)->setChecked(shown);
 }
 

@@ -16,6 +16,7 @@ class QTreeWidget;
 
 namespace mirel {
 
+class ErrorLine;
 class FilterChip;
 class FormSurface;
 class RecordList;
@@ -80,6 +81,8 @@ private:
     bool RunInForm(FormCommand id); // false: it is no command of the running form's
     void ShowState();
     void ShowActions();
+    // What is wrong with the first text that cannot be stored; not with the one that is being typed.
+    void ShowReason();
     // The form itself, all fields of its record, or all its records.
     enum class Page { Form, Detail, List };
     Page CurrentPage() const;
@@ -105,6 +108,8 @@ private:
     RecordList* list_;
     QToolBar* toolBar_ = nullptr;
     FilterChip* chip_ = nullptr;
+    ErrorLine* error_;
+    int refusedControl_ = -1; // that the error is about
     QBasicTimer clock_;
     int sortedField_ = -1; // of the list, by its header; -1: none
     bool sortedDescending_ = false;

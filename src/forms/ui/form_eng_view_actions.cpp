@@ -1,6 +1,8 @@
 #include "forms/ui/form_eng_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/form_surface.h"
+#include "forms/ui/record_list.h"
+#include "platform/ui/menu_keys.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
@@ -58,6 +60,7 @@ void CFormEngView::CreateMenus()
 void CFormEngView::FillMenu(QMenu* menu, std::span<const FormMenuEntry> entries)
 {
     menu->setToolTipsVisible(true);
+    LeaveOutKeysWhenSmall(*menu, *this);
     for (const FormMenuEntry entry : entries) {
         if (entry)
             menu->addAction(ActionOf(*entry));
@@ -221,8 +224,7 @@ void CFormEngView::Paste()
     const QString text = QGuiApplication::clipboard()->text();
     if (control < 0 || text.isEmpty())
         return;
-    form_.SetText(control, text);
-    ShowState();
+    (void)surface_->PasteInto(control, text);
 }
 
 void CFormEngView::ChangeSettings(const FormViewSettings& settings)
@@ -231,6 +233,8 @@ void CFormEngView::ChangeSettings(const FormViewSettings& settings)
     ActionOf(Command::FitToWindow)->setChecked(settings.fitToWindow);
     FitSurface();
     ShowState();
+    for (RecordList* list : findChildren<RecordList*>())
+        list->viewport()->update();
 }
 
 void CFormEngView::ChooseOptions()

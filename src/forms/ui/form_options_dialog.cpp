@@ -1,5 +1,7 @@
 #include "forms/ui/form_options_dialog.h"
 
+#include "platform/ui/look_roles.h"
+#include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
@@ -9,7 +11,6 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QScreen>
-#include <QScrollArea>
 #include <QSpinBox>
 #include <QVBoxLayout>
 
@@ -74,18 +75,16 @@ void CFormOptionsDialog::ShowSettings()
 
 void CFormOptionsDialog::LayOut()
 {
-    // A small screen scrolls the options and keeps the buttons in sight.
-    auto* scroller = new QScrollArea(this);
-    auto* page = new QWidget(scroller);
-    scroller->setWidget(page);
-    scroller->setWidgetResizable(true);
-    scroller->setFrameShape(QFrame::NoFrame);
+    auto* page = new QWidget(this);
     auto* column = new QVBoxLayout(page);
+    constexpr int margin = spacing::kTight;
+    column->setContentsMargins(margin, margin, margin, margin);
     for (QCheckBox* box : {confirmDelete_, confirmSave_, thirdAnswer_, aggregate_, fit_, sort_})
         column->addWidget(box);
     AddNumbers(*column);
     auto* wordsLabel = new QLabel(StringText(Str::OptionYesNoWords), this);
     wordsLabel->setBuddy(words_);
+    wordsLabel->setWordWrap(true);
     column->addWidget(wordsLabel);
     column->addWidget(words_);
     column->addStretch(1);
@@ -93,8 +92,10 @@ void CFormOptionsDialog::LayOut()
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    // A small screen scrolls the options and keeps the buttons in sight.
     auto* whole = new QVBoxLayout(this);
-    whole->addWidget(scroller, 1);
+    whole->setContentsMargins(margin, margin, margin, margin);
+    whole->addWidget(Scrolled(page), 1);
     whole->addWidget(buttons);
     const QSize wanted = page->sizeHint() + QSize(2, 5) * fontMetrics().height();
     const QSize window = parentWidget() ? parentWidget()->window()->size() : wanted;
@@ -105,8 +106,8 @@ void CFormOptionsDialog::LayOut()
 void CFormOptionsDialog::AddNumbers(QVBoxLayout& column)
 {
     const auto addLine = [this, &column](QWidget* before, QSpinBox* number, Str unit) {
+        column.addWidget(before);
         auto* line = new QHBoxLayout;
-        line->addWidget(before);
         line->addWidget(number);
         line->addWidget(new QLabel(StringText(unit), this), 1);
         column.addLayout(line);
@@ -114,7 +115,9 @@ void CFormOptionsDialog::AddNumbers(QVBoxLayout& column)
     auto* scrollLabel = new QLabel(StringText(Str::FormOptionScroll), this);
     scrollLabel->setBuddy(scrollPx_);
     scrollLabel->setWordWrap(true);
-    column.addWidget(new QLabel(StringText(Str::OptionColumnGroup), this));
+    auto* limitLabel = new QLabel(StringText(Str::OptionColumnGroup), this);
+    limitLabel->setWordWrap(true);
+    column.addWidget(limitLabel);
     addLine(limit_, characters_, Str::OptionCharacters);
     addLine(popup_, holdMs_, Str::OptionMilliseconds);
     addLine(scrollLabel, scrollPx_, Str::FormOptionPixels);

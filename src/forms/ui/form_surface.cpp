@@ -1,6 +1,7 @@
 #include "forms/ui/form_surface.h"
 
 #include "forms/ui/control_look.h"
+#include "platform/ui/look_roles.h"
 
 #include <QAbstractScrollArea>
 #include <QApplication>
@@ -9,6 +10,7 @@
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QMouseEvent>
+#include <QPlainTextEdit>
 #include <QPushButton>
 
 #include <algorithm>
@@ -65,9 +67,11 @@ void FormSurface::MakeControls()
     for (int i = 0; i < int(controls.size()); ++i) {
         const ControlWidget::ListSource list{
             .rows = [this, i](qint64 first, int count) { return form_.ListRows(i, first, count); },
-            .maxColumnChars = form_.Settings().maxColumnChars};
+            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }};
         const ControlRun& control = controls[size_t(i)];
         widgets_.push_back(ControlWidget::Make(control, list, *this));
+        if (IsComputed(i))
+            widgets_.back()->SetComputed();
         widgets_.back()->Show(control);
         shown_[size_t(i)] = control.revision;
         Remember(i);
@@ -146,7 +150,30 @@ void FormSurface::SetScale(const SurfaceScale& scale)
     scale_ = scale;
     for (const std::unique_ptr<ControlWidget>& widget : widgets_)
         widget->Place(scale);
+    AlignLabels();
     resize(scale.Of(formSize_));
+}
+
+// A label belongs to the first box to its right in its line.
+void FormSurface::AlignLabels()
+{
+    const std::span<const ControlRun> controls = form_.Controls();
+    for (size_t i = 0; i < controls.size(); ++i) {
+        if (controls[i].type != ControlType::Label)
+            continue;
+        const QRect label = widgets_[i]->Main()->geometry();
+        const QWidget* nearest = nullptr;
+        for (size_t other = 0; other < controls.size(); ++other) {
+            const QWidget* box = widgets_[other]->Main();
+            const bool isLine = qobject_cast<const QLineEdit*>(box) || qobject_cast<const QComboBox*>(box);
+            const bool beside = box->x() >= label.right() && box->y() <= label.center().y() &&
+                                box->geometry().bottom() >= label.center().y();
+            if (isLine && beside && (!nearest || box->x() < nearest->x()))
+                nearest = box;
+        }
+        if (nearest)
+            widgets_[i]->AlignTextTo(*nearest);
+    }
 }
 
 int FormSurface::ControlOf(const QObject* widget) const
@@ -167,6 +194,19 @@ bool FormSurface::IsInput(int control) const
 {
     const ControlType type = form_.Controls()[size_t(control)].type;
     return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
+}
+
+// A box that shows an expression is for reading, but where a button reads it: then what is typed counts.
+bool FormSurface::IsComputed(int control) const
+{
+    const ControlRun& run = form_.Controls()[size_t(control)];
+    if (run.type != ControlType::EditBox || run.keepsInput || run.definition->hasSource == 0)
+        return false;
+    return std::ranges::none_of(form_.Controls(), [&run](const ControlRun& other) {
+        const QString source = other.definition->source.Text();
+        return other.type == ControlType::Button &&
+               (source.contains(u'&' + run.name) || source.contains(QStringLiteral("&[") + run.name + u']'));
+    });
 }
 
 // The record counter is first in most lists; nobody begins with it.
@@ -195,9 +235,8 @@ void FormSurface::Remember(int control)
     before_[size_t(control)] = TextOf(form_.Controls()[size_t(control)]);
 }
 
-bool FormSurface::RevertFocused()
+bool FormSurface::Revert(int control)
 {
-    const int control = FocusedControl();
     if (control < 0 || !IsInput(control))
         return false;
     const ControlRun& run = form_.Controls()[size_t(control)];
@@ -215,6 +254,35 @@ bool FormSurface::RevertFocused()
     return true;
 }
 
+void FormSurface::MarkRefused(int control)
+{
+    if (control == refused_)
+        return;
+    for (const auto& [marked, refused] : {std::pair(refused_, false), std::pair(control, true)}) {
+        if (marked < 0)
+            continue;
+        WidgetOf(marked)->setProperty(kRefusedProperty, refused);
+        WidgetOf(marked)->update();
+    }
+    refused_ = control;
+}
+
+bool FormSurface::PasteInto(int control, const QString& text)
+{
+    if (control < 0)
+        return false;
+    QWidget* widget = WidgetOf(control);
+    if (const auto* box = qobject_cast<QComboBox*>(widget))
+        widget = box->lineEdit();
+    if (auto* line = qobject_cast<QLineEdit*>(widget); line && !line->isReadOnly())
+        line->insert(text);
+    else if (auto* memo = qobject_cast<QPlainTextEdit*>(widget); memo && !memo->isReadOnly())
+        memo->insertPlainText(text);
+    else
+        return false;
+    return true;
+}
+
 bool FormSurface::OpenMoreOf(int control)
 {
     return control >= 0 && widgets_[size_t(control)]->OpenMore();
@@ -226,7 +294,7 @@ bool FormSurface::KeyPressed(int control, const QKeyEvent& event)
     const bool plain = (event.modifiers() & ~Qt::KeypadModifier) == Qt::NoModifier;
     switch (event.key()) {
     case Qt::Key_Escape:
-        return plain && RevertFocused();
+        return plain && Revert(FocusedControl());
     case Qt::Key_F4:
     case Qt::Key_F2:
         return plain && OpenMoreOf(control);
@@ -273,6 +341,13 @@ bool FormSurface::eventFilter(QObject* watched, QEvent* event)
                               keyboard ? widget.mapToGlobal(widget.rect().bottomLeft()) : menu->globalPos());
         return true;
     }
+    case QEvent::Wheel:
+        // Scrolling over a box that nobody works in changes no record.
+        if (qobject_cast<QComboBox*>(WidgetOf(control)) && FocusedControl() != control) {
+            event->ignore();
+            return true;
+        }
+        break;
     case QEvent::MouseButtonPress:
     case QEvent::MouseMove:
     case QEvent::MouseButtonRelease:
@@ -316,7 +391,8 @@ void FormSurface::timerEvent(QTimerEvent* event)
         return;
     }
     hold_.stop();
-    Q_EMIT popupRequested(holdControl_, holdAt_);
+    if (!QApplication::activePopupWidget()) // the list of a drop-down box, which the tap has opened
+        Q_EMIT popupRequested(holdControl_, holdAt_);
 }
 
 } // namespace mirel

@@ -33,8 +33,13 @@ public:
     int ControlOf(const QObject* widget) const; // -1: none of them, nor within one
     int FocusedControl() const;                 // -1: none
     void FocusFirstInput();
-    // Gives the focused control its text of before back. False when it has that already.
-    bool RevertFocused();
+    // Gives a control its text of before back. False when it has that already.
+    bool Revert(int control);
+    const QString& TextBefore(int control) const { return before_[size_t(control)]; }
+    // The edge of an editor whose text cannot be stored.
+    void MarkRefused(int control); // -1: none
+    // At the caret of a text control, or over what is selected in it. False: nothing can be typed there.
+    bool PasteInto(int control, const QString& text);
     // See ControlWidget::OpenMore.
     bool OpenMoreOf(int control);
 
@@ -54,7 +59,9 @@ private:
     void ConnectControl(int control);
     void Watch(QWidget& widget, int control);
     void OrderTabs();
+    void AlignLabels();
     bool IsInput(int control) const;
+    bool IsComputed(int control) const;
     bool KeyPressed(int control, const QKeyEvent& event);
     void FollowHold(QWidget& widget, const QMouseEvent& event);
     void Remember(int control);
@@ -66,6 +73,7 @@ private:
     QHash<const QObject*, int> controlOf_;
     std::vector<quint64> shown_;  // each control's revision
     std::vector<QString> before_; // each control's text before the user edited it
+    int refused_ = -1;
     QSize formSize_;
     SurfaceScale scale_;
     QBasicTimer hold_;

@@ -1,11 +1,10 @@
 #include "forms/ui/long_text_dialog.h"
 
-#include "forms/ui/edit_box.h"
+#include "platform/ui/memo_edit.h"
 #include "platform/ui/window_place.h"
 
 #include <QDialog>
 #include <QDialogButtonBox>
-#include <QPlainTextEdit>
 #include <QShortcut>
 #include <QVBoxLayout>
 
@@ -25,8 +24,8 @@ std::optional<QString> EditLongText(const LongText& longText, QWidget& parent)
     const QWidget& window = *parent.window();
     QDialog dialog(&parent);
     dialog.setWindowTitle(longText.title);
-    auto* editor = new QPlainTextEdit(longText.text, &dialog);
-    editor->setTabChangesFocus(true);
+    auto* editor = new MemoEdit(&dialog);
+    editor->SetText(longText.text);
     editor->setReadOnly(longText.readOnly);
     editor->setAccessibleName(longText.title);
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
@@ -46,7 +45,7 @@ std::optional<QString> EditLongText(const LongText& longText, QWidget& parent)
     editor->moveCursor(QTextCursor::End);
     if (dialog.exec() != QDialog::Accepted || longText.readOnly)
         return std::nullopt;
-    return WithLineEndsOf(longText.text, editor->toPlainText());
+    return editor->Text();
 }
 
 } // namespace mirel

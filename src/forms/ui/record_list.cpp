@@ -138,10 +138,10 @@ void RecordList::ReadRows()
 
 QString RecordList::Shown(const QString& text) const
 {
-    const int most = source_.maxColumnChars;
+    const int most = source_.maxColumnChars();
     if (most < 0 || text.size() <= most)
         return SingleLine(text);
-    return SingleLine(text.left(most)) + u'…';
+    return SingleLine(text.left(most)) + u'~';
 }
 
 // To the rows in sight, until the user sizes them. The last column takes what is left; where they do not fit, the

@@ -12,6 +12,7 @@
 #include <QStylePainter>
 
 #include <algorithm>
+#include <cstdlib>
 #include <limits>
 
 namespace mirel {
@@ -22,17 +23,6 @@ constexpr int kFramePx = 4;          // above and below a text together
 constexpr qreal kLeastCaption = 0.6; // of its font: what a caption is narrowed to before it is cut
 constexpr qreal kLeastLabel = 0.85;
 constexpr int kMostSquarePx = 22; // of a check box
-
-// Makes the font of a text that is wider than its room smaller, down to that part of it.
-void Narrow(QWidget& widget, const QString& text, int roomPx, qreal least)
-{
-    const int width = widget.fontMetrics().size(Qt::TextShowMnemonic, text).width();
-    if (width <= roomPx)
-        return;
-    QFont font = widget.font();
-    font.setPointSizeF(font.pointSizeF() * std::max(qreal(roomPx) / width, least));
-    widget.setFont(font);
-}
 
 // A drop-down box whose items are read when its list is opened.
 class LazyComboBox : public QComboBox {
@@ -106,8 +96,23 @@ void LabelWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
     if (IsSingleLine())
-        Narrow(*label_, text_, label_->contentsRect().width(), kLeastLabel);
+        NarrowToFit(*label_, text_, label_->contentsRect().width(), kLeastLabel);
     ShowText();
+}
+
+// Both texts stand in the middle of their windows; the margin moves the label's to the base line of the box's.
+void LabelWidget::AlignTextTo(const QWidget& box)
+{
+    if (!IsSingleLine())
+        return;
+    const auto baseLine = [](const QWidget& widget) {
+        const QFontMetrics metrics = widget.fontMetrics();
+        return widget.y() + (widget.height() + metrics.ascent() - metrics.descent()) / 2;
+    };
+    label_->setContentsMargins({});
+    const int down = baseLine(box) - baseLine(*label_);
+    if (std::abs(down) < label_->height() / 2)
+        label_->setContentsMargins(0, std::max(2 * down, 0), 0, std::max(-2 * down, 0));
 }
 
 bool LabelWidget::IsSingleLine() const
@@ -135,6 +140,7 @@ DropDownWidget::DropDownWidget(const ControlRun& control, QWidget& surface)
     , box_(static_cast<QComboBox*>(Main()))
 {
     box_->setEditable(true);
+    box_->setFocusPolicy(Qt::StrongFocus);
     box_->setInsertPolicy(QComboBox::NoInsert);
     box_->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     box_->lineEdit()->setMaxLength(std::numeric_limits<int>::max());
@@ -206,7 +212,7 @@ void ButtonWidget::Show(const ControlRun& control)
 void ButtonWidget::Place(const SurfaceScale& scale)
 {
     ControlWidget::Place(scale);
-    Narrow(*button_, button_->text(), button_->width() - kFramePx, kLeastCaption);
+    NarrowToFit(*button_, button_->text(), button_->width() - kFramePx, kLeastCaption);
 }
 
 int ButtonWidget::TextRoomPx(int heightPx) const

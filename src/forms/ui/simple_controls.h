@@ -16,6 +16,7 @@ public:
     LabelWidget(const ControlRun& control, QWidget& surface);
     void Show(const ControlRun& control) override;
     void Place(const SurfaceScale& scale) override;
+    void AlignTextTo(const QWidget& box) override;
 
 private:
     bool IsSingleLine() const;

@@ -1,11 +1,16 @@
 #include "platform/ui/day_chooser.h"
 
 #include "platform/ole_date.h"
+#include "platform/ui/window_place.h"
 #include "platform/user_locale.h"
+#include "resources/ui/theme_icon.h"
 
 #include <QCalendarWidget>
 #include <QDate>
 #include <QMenu>
+#include <QScreen>
+#include <QTextCharFormat>
+#include <QToolButton>
 #include <QWidgetAction>
 
 #include <cmath>
@@ -31,6 +36,26 @@ QDate DayOf(const QString& text)
     return parts ? QDate(parts->year, parts->month, parts->day) : QDate::currentDate();
 }
 
+// No numbers of weeks, and letters for the days where the screen is small: seven columns fit 240 pixels.
+void FitScreen(QCalendarWidget& calendar, const QScreen& screen)
+{
+    const bool small = IsHandheldSize(screen.availableSize());
+    calendar.setVerticalHeaderFormat(QCalendarWidget::NoVerticalHeader);
+    calendar.setHorizontalHeaderFormat(small ? QCalendarWidget::SingleLetterDayNames
+                                             : QCalendarWidget::ShortDayNames);
+    const QTextCharFormat plain; // Saturdays and Sundays are no warning
+    calendar.setWeekdayTextFormat(Qt::Saturday, plain);
+    calendar.setWeekdayTextFormat(Qt::Sunday, plain);
+    // The style's arrows go with no palette of ours.
+    for (const auto& [button, icon] :
+         {std::pair("qt_calendar_prevmonth", u"go-previous"), std::pair("qt_calendar_nextmonth", u"go-next")}) {
+        if (auto* arrow = calendar.findChild<QToolButton*>(QLatin1StringView(button)))
+            arrow->setIcon(ThemeIcon(icon).pixmap(arrow->iconSize(), QIcon::Selected));
+    }
+    constexpr int kAroundPx = 8; // the popup's frame
+    calendar.setMaximumSize(screen.availableSize() - QSize(kAroundPx, kAroundPx));
+}
+
 } // namespace
 
 std::optional<QString> ChooseDay(const QString& text, QPoint globalPosition, QWidget& parent)
@@ -43,6 +68,7 @@ std::optional<QString> ChooseDay(const QString& text, QPoint globalPosition, QWi
     calendar->setMinimumDate(QDate(1, 1, 1));
     calendar->setMaximumDate(QDate(9999, 12, 31));
     calendar->setSelectedDate(DayOf(text));
+    FitScreen(*calendar, *parent.screen());
     auto* holder = new QWidgetAction(&popup);
     holder->setDefaultWidget(calendar);
     popup.addAction(holder);

@@ -1,5 +1,8 @@
 #include "platform/ui/scrolled_page.h"
 
+#include "platform/ui/look_roles.h"
+#include "platform/ui/wrapped_text.h"
+
 #include <QScrollArea>
 #include <QScrollBar>
 
@@ -11,12 +14,25 @@ public:
     using QScrollArea::QScrollArea;
 
     QSize sizeHint() const override { return widget()->sizeHint() + QSize(BarWidth(), 0); }
+    // Captions wrap, so that the page can be as narrow as what it cannot wrap.
     QSize minimumSizeHint() const override
     {
-        return {widget()->minimumSizeHint().width() + BarWidth(), QScrollArea::minimumSizeHint().height()};
+        return {kFewestChars * fontMetrics().averageCharWidth() + BarWidth(),
+                QScrollArea::minimumSizeHint().height()};
+    }
+
+protected:
+    void resizeEvent(QResizeEvent* event) override
+    {
+        QScrollArea::resizeEvent(event);
+        WrapCaptions(*widget(), viewport()->width() - 2 * kAroundCaptionPx);
+        widget()->setMaximumWidth(viewport()->width());
     }
 
 private:
+    static constexpr int kFewestChars = 16;
+    static constexpr int kAroundCaptionPx = spacing::kWide; // margins of the page and of a group in it
+
     int BarWidth() const { return verticalScrollBar()->sizeHint().width(); }
 };
 

@@ -83,11 +83,13 @@ bool TokenCursor::Fail()
 bool TokenCursor::Fail(Place place)
 {
     if (place.begin == place.end)
-        return Keep({Hr::SyntaxError, StringText(Str::SyntaxErrorAtEnd)});
+        return Keep({Hr::SyntaxError, StringText(Str::SyntaxErrorAtEnd), place.begin});
     constexpr qsizetype kShown = 30;
     const QStringView there = lexer_.Statement().sliced(place.begin, place.end - place.begin);
-    return Keep({Hr::SyntaxError, StringText(Str::SyntaxErrorNear,
-                                             {QString::number(place.begin + 1), there.left(kShown).toString()})});
+    return Keep(
+        {Hr::SyntaxError,
+         StringText(Str::SyntaxErrorNear, {QString::number(place.begin + 1), there.left(kShown).toString()}),
+         place.begin});
 }
 
 bool TokenCursor::Fail(Hr code)
@@ -97,7 +99,7 @@ bool TokenCursor::Fail(Hr code)
 
 bool TokenCursor::FailTooDeep(qsizetype at)
 {
-    return Keep({Hr::SyntaxError, StringText(Str::SyntaxTooDeep, {QString::number(at + 1)})});
+    return Keep({Hr::SyntaxError, StringText(Str::SyntaxTooDeep, {QString::number(at + 1)}), at});
 }
 
 bool TokenCursor::Keep(Failure failure)

@@ -1,48 +1,27 @@
 #include "tableview/ui/cell_strip.h"
 
-#include "platform/ole_date.h"
+#include "platform/ui/date_field.h"
 #include "platform/ui/hold_popup.h"
-#include "platform/user_locale.h"
+#include "platform/ui/look_roles.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
 #include <QAction>
-#include <QCalendarWidget>
 #include <QCheckBox>
-#include <QDate>
 #include <QHBoxLayout>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMenu>
 #include <QStyle>
 #include <QToolButton>
-#include <QWidgetAction>
-
-#include <cmath>
-#include <limits>
 
 namespace mirel {
 namespace {
 
-// The calendar changes the day of a value and leaves its time alone.
-QString TextWithDay(const QString& text, QDate day)
+bool IsTyped(const QKeyEvent& event)
 {
-    const UserLocale& locale = UserLocale::Current();
-    const std::optional<double> before = locale.ParseDateTime(text);
-    const std::optional<double> midnight = OleDate({day.year(), day.month(), day.day()});
-    if (!midnight)
-        return text;
-    const double time = before ? std::abs(*before - std::trunc(*before)) : 0.0;
-    return locale.DateTimeText(*midnight < 0 ? *midnight - time : *midnight + time);
-}
-
-// The day that the calendar opens on: the value's, else today.
-QDate DayOf(const QString& text)
-{
-    const std::optional<double> date = UserLocale::Current().ParseDateTime(text);
-    const std::optional<DateParts> parts = date ? PartsOfOleDate(*date) : std::nullopt;
-    return parts ? QDate(parts->year, parts->month, parts->day) : QDate::currentDate();
+    const bool command = event.modifiers() & (Qt::ControlModifier | Qt::AltModifier | Qt::MetaModifier);
+    return !command && !event.text().isEmpty() && event.text().front().isPrint();
 }
 
 } // namespace
@@ -51,28 +30,23 @@ CellStrip::CellStrip(const RecordBrowser& browser, QWidget* parent)
     : QWidget(parent)
     , browser_(browser)
     , label_(new QLabel(this))
-    , line_(new QLineEdit(this))
+    , field_(new DateField(this))
+    , line_(field_->Line())
     , lossMark_(line_->addAction(style()->standardIcon(QStyle::SP_MessageBoxWarning), QLineEdit::TrailingPosition))
-    , calendarButton_(new QToolButton(this))
     , check_(new QCheckBox(this))
     , zoom_(new QToolButton(this))
 {
-    line_->setMaxLength(std::numeric_limits<int>::max()); // the longest memo passes through whole
-    lossMark_->setToolTip(StringText(Str::EditLosesText));
     lossMark_->setVisible(false);
-    calendarButton_->setArrowType(Qt::DownArrow);
-    calendarButton_->setToolTip(StringText(Str::CalendarTip));
-    calendarButton_->setAccessibleName(calendarButton_->toolTip());
+    connect(lossMark_, &QAction::triggered, this, &CellStrip::reasonRequested);
     zoom_->setIcon(ThemeIcon(u"zoom-in"));
     zoom_->setToolTip(StringText(Str::ZoomTip));
     zoom_->setFocusPolicy(Qt::TabFocus);
     line_->installEventFilter(this);
     new HoldPopup(line_, [this] { return browser_.Settings().holdTimeMs; });
     check_->installEventFilter(this);
-    connect(line_, &QLineEdit::textEdited, this, &CellStrip::textEdited);
+    connect(field_, &DateField::textEdited, this, &CellStrip::textEdited);
     // Of a box without a value the first tap makes a tick.
     connect(check_, &QCheckBox::clicked, this, [this] { Q_EMIT checkEdited(!browser_.Edit().IsChecked()); });
-    connect(calendarButton_, &QToolButton::clicked, this, &CellStrip::ShowCalendar);
     connect(zoom_, &QToolButton::clicked, this, [this] { Q_EMIT commandRequested(TableCommand::Zoom); });
     LayOut();
 }
@@ -80,43 +54,47 @@ CellStrip::CellStrip(const RecordBrowser& browser, QWidget* parent)
 void CellStrip::LayOut()
 {
     auto* row = new QHBoxLayout(this);
-    const int side = style()->pixelMetric(QStyle::PM_LayoutLeftMargin) / 2;
-    row->setContentsMargins(side, 0, side, 0);
-    row->setSpacing(side);
+    row->setContentsMargins(spacing::kGap, spacing::kTight, spacing::kGap, 0);
+    row->setSpacing(spacing::kGap);
     row->addWidget(label_);
-    row->addWidget(line_, 1);
-    row->addWidget(calendarButton_);
+    row->addWidget(field_, 1);
     row->addWidget(check_, 1);
     row->addWidget(zoom_);
 }
 
+bool CellStrip::ShowsTick() const
+{
+    return browser_.Edit().Kind() == EditorKind::Check && !browser_.ShowsResult();
+}
+
 QWidget* CellStrip::Editor() const
 {
-    return browser_.Edit().Kind() == EditorKind::Check ? static_cast<QWidget*>(check_) : line_;
+    return ShowsTick() ? static_cast<QWidget*>(check_) : line_;
 }
 
 void CellStrip::ShowState(bool zoomed)
 {
-    zoomed_ = zoomed;
     const CellEdit& edit = browser_.Edit();
-    const bool isCheck = edit.Kind() == EditorKind::Check;
+    const bool result = browser_.ShowsResult();
     const bool isText = edit.Kind() == EditorKind::Text;
+    const bool isDate = edit.Kind() == EditorKind::Date && !result;
     const bool hadFocus = HasEditorFocus();
-    line_->setVisible(!isCheck && !(zoomed && isText));
-    calendarButton_->setVisible(edit.Kind() == EditorKind::Date);
-    calendarButton_->setEnabled(browser_.CanEdit());
-    check_->setVisible(isCheck);
-    check_->setEnabled(browser_.CanEdit());
+    const bool editable = browser_.CanEdit() && !result;
+    field_->setVisible(!ShowsTick() && !(zoomed && isText));
+    field_->SetTakesDates(isDate && editable);
+    check_->setVisible(ShowsTick());
+    check_->setEnabled(editable);
     check_->setCheckState(edit.IsUnset() ? Qt::PartiallyChecked : edit.IsChecked() ? Qt::Checked : Qt::Unchecked);
     check_->setText(edit.IsUnset() ? StringText(Str::CellHasNoValue) : browser_.SelectedText());
-    if (line_->text() != edit.Text())
-        line_->setText(edit.Text());
+    if (const QString& text = result ? browser_.ShownResult() : edit.Text(); line_->text() != text)
+        line_->setText(text);
     if (!edit.IsPending() && !line_->hasFocus())
         line_->setCursorPosition(0);
-    line_->setReadOnly(!browser_.CanEdit());
+    line_->setReadOnly(!editable);
     line_->setEnabled(edit.Kind() != EditorKind::None);
-    line_->setPlaceholderText(edit.Kind() == EditorKind::Date ? UserLocale::Current().DateFormat() : QString());
-    lossMark_->setVisible(edit.IsPending() && !edit.IsKeptWhole());
+    const QString why = browser_.WhyNotStored();
+    lossMark_->setVisible(!why.isEmpty());
+    lossMark_->setToolTip(why.isEmpty() ? why : StringText(Str::ErrorMarkTip, {why}));
     zoom_->setText(StringText(zoomed ? Str::ZoomBack : Str::ZoomIn));
     zoom_->setEnabled(zoomed || isText);
     for (QWidget* editor : {static_cast<QWidget*>(line_), static_cast<QWidget*>(check_)})
@@ -124,6 +102,14 @@ void CellStrip::ShowState(bool zoomed)
     ShowLabel();
     if (hadFocus && !HasEditorFocus() && Editor()->isVisible())
         Editor()->setFocus();
+}
+
+void CellStrip::MarkRefused(bool refused)
+{
+    if (line_->property(kRefusedProperty).toBool() == refused)
+        return;
+    line_->setProperty(kRefusedProperty, refused);
+    line_->update();
 }
 
 // A long name gives way to the editor, and can be read as a tool tip.
@@ -161,32 +147,6 @@ void CellStrip::BeginTyping(const QString& text)
     Q_EMIT textEdited(text);
 }
 
-void CellStrip::ShowCalendar()
-{
-    QMenu popup(this);
-    auto* calendar = new QCalendarWidget(&popup);
-    calendar->setLocale(UserLocale::Current().Locale());
-    calendar->setFirstDayOfWeek(UserLocale::Current().Locale().firstDayOfWeek());
-    calendar->setMinimumDate(QDate(1, 1, 1));
-    calendar->setMaximumDate(QDate(9999, 12, 31));
-    calendar->setSelectedDate(DayOf(line_->text()));
-    auto* holder = new QWidgetAction(&popup);
-    holder->setDefaultWidget(calendar);
-    popup.addAction(holder);
-    const auto take = [&](QDate day) {
-        popup.close();
-        BeginTyping(TextWithDay(line_->text(), day));
-    };
-    connect(calendar, &QCalendarWidget::clicked, &popup, take);
-    connect(calendar, &QCalendarWidget::activated, &popup, [&](QDate day) {
-        if (popup.isVisible())
-            take(day);
-    });
-    calendar->setFocus();
-    const QPoint below = calendarButton_->mapToGlobal(calendarButton_->rect().bottomLeft());
-    popup.exec(below);
-}
-
 bool CellStrip::eventFilter(QObject* watched, QEvent* event)
 {
     // With nothing of its own to undo the line leaves the key to the window.
@@ -199,6 +159,10 @@ bool CellStrip::eventFilter(QObject* watched, QEvent* event)
         return QWidget::eventFilter(watched, event);
     const auto* key = static_cast<QKeyEvent*>(event);
     const std::optional<TableCommand> command = CommandOfKey(KeyPlace::Editor, key->keyCombination());
+    if (!command && browser_.ShowsResult() && IsTyped(*key)) {
+        Q_EMIT typedOverResult(key->text());
+        return true;
+    }
     if (!command)
         return QWidget::eventFilter(watched, event);
     Q_EMIT commandRequested(*command);

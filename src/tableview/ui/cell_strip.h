@@ -3,18 +3,17 @@
 #include "tableview/record_browser.h"
 #include "tableview/ui/table_command.h"
 
-#include <QPointer>
 #include <QWidget>
 
 class QAction;
-class QCalendarWidget;
 class QCheckBox;
-class QHBoxLayout;
 class QLabel;
 class QLineEdit;
 class QToolButton;
 
 namespace mirel {
+
+class DateField;
 
 // The line under the grid: the selected field's name and one editor for its value, as text, as text with a
 // calendar for dates, or as a tick. It hands over what the user enters; whoever answers calls ShowState.
@@ -25,6 +24,7 @@ public:
     CellStrip(const RecordBrowser& browser, QWidget* parent);
 
     void ShowState(bool zoomed);
+    void MarkRefused(bool refused); // the text was not stored
     // Puts the focus into the editor; the second goes on with what was typed on the grid.
     void BeginEdit();
     void BeginTyping(const QString& text);
@@ -34,6 +34,8 @@ Q_SIGNALS:
     void textEdited(const QString& text);
     void checkEdited(bool checked);
     void commandRequested(TableCommand command);
+    void reasonRequested(); // the mark of a text that cannot be stored was tapped
+    void typedOverResult(const QString& text);
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -42,17 +44,16 @@ protected:
 private:
     void LayOut();
     void ShowLabel();
-    void ShowCalendar();
+    bool ShowsTick() const;
     QWidget* Editor() const;
 
     const RecordBrowser& browser_;
     QLabel* label_;
+    DateField* field_;
     QLineEdit* line_;
     QAction* lossMark_; // the text will not be stored as it stands
-    QToolButton* calendarButton_;
     QCheckBox* check_;
     QToolButton* zoom_;
-    bool zoomed_ = false;
 };
 
 } // namespace mirel

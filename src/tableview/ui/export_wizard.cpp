@@ -2,6 +2,7 @@
 
 #include "platform/ui/elided_label.h"
 #include "platform/ui/file_choice.h"
+#include "platform/ui/scrolled_page.h"
 #include "platform/ui/wait_cursor.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -85,8 +86,8 @@ CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, QWi
     , next_(new QPushButton(this))
 {
     setWindowTitle(StringText(Str::ExportTitle));
-    pages_->addWidget(SourcePage());
-    pages_->addWidget(SeparatorPage());
+    for (QWidget* page : {SourcePage(), SeparatorPage()})
+        pages_->addWidget(Scrolled(page));
     LayOut();
     ShowStep(0);
 }

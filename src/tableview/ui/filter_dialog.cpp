@@ -1,23 +1,27 @@
 #include "tableview/ui/filter_dialog.h"
 
 #include "data/catalog.h"
-#include "platform/ole_date.h"
+#include "data/condition_fault.h"
+#include "platform/ui/date_field.h"
+#include "platform/ui/error_line.h"
+#include "platform/ui/look_roles.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/user_locale.h"
 #include "resources/string_table.h"
+#include "result/cell_text.h"
 #include "tableview/ui/field_chooser.h"
 #include "tableview/ui/pick_box.h"
+#include "tableview/why_not_stored.h"
 
 #include <QCheckBox>
 #include <QComboBox>
-#include <QDateEdit>
 #include <QDialogButtonBox>
 #include <QFormLayout>
-#include <QHBoxLayout>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPlainTextEdit>
-#include <QStackedWidget>
+#include <QPushButton>
+#include <QRegularExpression>
 #include <QTabWidget>
 #include <QTimer>
 #include <QVBoxLayout>
@@ -53,35 +57,37 @@ QComboBox* WordBox(const QStringList& words, QWidget* parent)
 
 FilterTerm::FilterTerm(QWidget* parent)
     : QWidget(parent)
+    , row_(new QBoxLayout(QBoxLayout::LeftToRight, this))
     , operators_(new QComboBox(this))
-    , values_(new QStackedWidget(this))
-    , text_(new QLineEdit(this))
-    , date_(new QDateEdit(QDate::currentDate(), this))
+    , value_(new DateField(this))
 {
-    date_->setCalendarPopup(true);
-    date_->setDisplayFormat(UserLocale::Current().DateFormat());
-    values_->addWidget(text_);
-    values_->addWidget(date_);
-    values_->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-    operators_->setAccessibleName(StringText(Str::OperatorsLabel));
-    text_->setAccessibleName(StringText(Str::FilterValueName));
-    date_->setAccessibleName(StringText(Str::FilterValueName));
-    auto* row = new QHBoxLayout(this);
-    row->setContentsMargins({});
-    row->addWidget(operators_, 2);
-    row->addWidget(values_, 3);
-    setFocusProxy(text_);
+    operators_->setAccessibleName(StringText(Str::OperatorsLabel).remove(u'&'));
+    operators_->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+    operators_->setMinimumContentsLength(6);
+    value_->Line()->setAccessibleName(StringText(Str::FilterValueName));
+    row_->setContentsMargins({});
+    row_->setSpacing(spacing::kTight);
+    row_->addWidget(operators_, 2);
+    row_->addWidget(value_, 3);
+    setFocusProxy(value_);
+}
+
+// The longest operator and a value take two lines of a handheld.
+void FilterTerm::resizeEvent(QResizeEvent*)
+{
+    constexpr int kNarrowChars = 34;
+    const bool narrow = width() < kNarrowChars * fontMetrics().averageCharWidth();
+    row_->setDirection(narrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
 }
 
 void FilterTerm::SetType(FieldType type, FilterKind kind)
 {
+    type_ = type;
     operators_->clear();
     for (const std::u16string_view name : FilterOperators(type, kind))
         operators_->addItem(QStringView(name).toString());
-    const bool isDate = type == FieldType::Date;
-    values_->setCurrentWidget(isDate ? static_cast<QWidget*>(date_) : text_);
-    values_->setEnabled(type != FieldType::YesNo);
-    setFocusProxy(isDate ? static_cast<QWidget*>(date_) : text_);
+    value_->SetTakesDates(type == FieldType::Date);
+    value_->setEnabled(type != FieldType::YesNo);
 }
 
 void FilterTerm::SetOperator(const QString& operatorText)
@@ -91,11 +97,7 @@ void FilterTerm::SetOperator(const QString& operatorText)
 
 void FilterTerm::SetValue(const QString& displayText)
 {
-    text_->setText(displayText);
-    if (const std::optional<double> date = UserLocale::Current().ParseDateTime(displayText)) {
-        if (const std::optional<DateParts> parts = PartsOfOleDate(*date))
-            date_->setDate({parts->year, parts->month, parts->day});
-    }
+    value_->SetText(displayText);
 }
 
 QString FilterTerm::Operator() const
@@ -105,24 +107,37 @@ QString FilterTerm::Operator() const
 
 QString FilterTerm::Value() const
 {
-    if (values_->currentWidget() == text_)
-        return text_->text();
-    const std::optional<double> day = OleDate(date_->date().startOfDay());
-    return day ? UserLocale::Current().DateText(*day) : QString();
+    static const QRegularExpression plain(u"^[+-]?\\d+(\\.\\d+)?$"_s);
+    const QString text = value_->Text();
+    if (!IsNumber(type_) || plain.match(text.trimmed()).hasMatch())
+        return text;
+    const auto number = TypedValue(text, FieldType::Double); // as the user writes numbers
+    return number.IsNull() ? text : VariantText(number);
+}
+
+QString FilterTerm::Fault(bool mayBeMissing) const
+{
+    const bool needsValue = IsNumber(type_) || type_ == FieldType::Date;
+    const QString text = value_->Text().trimmed();
+    if (needsValue && text.isEmpty())
+        return mayBeMissing ? QString() : StringText(Str::WhyMissing);
+    return needsValue ? WhyNotStored(text, type_ == FieldType::Date ? type_ : FieldType::Double, -1) : QString();
 }
 
 void FilterTerm::FocusValue()
 {
-    QWidget* const value = values_->isEnabled() ? values_->currentWidget() : operators_;
-    value->setFocus(Qt::TabFocusReason);
-    text_->end(false);
-    text_->home(true); // all of it, and its beginning in sight
+    if (!value_->isEnabled())
+        return operators_->setFocus(Qt::TabFocusReason);
+    value_->setFocus(Qt::TabFocusReason);
+    value_->Line()->end(false);
+    value_->Line()->home(true); // all of it, and its beginning in sight
 }
 
 CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QString& field,
-                             const QString& displayText, QWidget* parent)
+                             const QString& displayText, Apply apply, QWidget* parent)
     : QDialog(parent)
     , lists_(lists)
+    , apply_(std::move(apply))
     , tabs_(new QTabWidget(this))
     , field_(new FieldChooser(lists, FieldChooser::Use::ToChoose, this))
     , single_(new FilterTerm(this))
@@ -130,6 +145,7 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
     , from_(new FilterTerm(this))
     , to_(new FilterTerm(this))
     , expression_(new QPlainTextEdit(this))
+    , error_(new ErrorLine(this))
 {
     setWindowTitle(StringText(Str::FilterTitle));
     field_->Choose(table, field);
@@ -138,12 +154,15 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
     tabs_->setUsesScrollButtons(false);
 
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
+    connect(buttons, &QDialogButtonBox::accepted, this, &CFilterDialog::TakeCondition);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     auto* column = new QVBoxLayout(this);
     column->addWidget(tabs_, 1);
+    column->addWidget(error_);
     column->addWidget(buttons);
 
+    for (QComboBox* box : findChildren<QComboBox*>())
+        box->setMaxVisibleItems(8);
     connect(field_, &FieldChooser::fieldChanged, this, &CFilterDialog::TakeField);
     connect(fromTo_, &QCheckBox::toggled, this, &CFilterDialog::ShowRange);
     TakeField();
@@ -178,19 +197,26 @@ QWidget* CFilterDialog::AdvancedPage()
     QComboBox* const operators = WordBox(kExpressionOperators, page);
     QComboBox* const words = WordBox(kExpressionWords, page);
     expression_->setTabChangesFocus(true);
-    expression_->setMinimumHeight(5 * fontMetrics().lineSpacing());
-    expression_->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored); // it takes what is left
+    expression_->setMinimumHeight(4 * fontMetrics().lineSpacing());
+    expression_->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Ignored);
     expression_->setAccessibleName(StringText(Str::FilterPrompt));
 
-    auto* form = new QFormLayout(page);
-    PrepareForm(form);
     auto* prompt = new QLabel(StringText(Str::FilterPrompt), page);
-    prompt->setBuddy(expression_);
-    form->addRow(prompt);
-    form->addRow(StringText(Str::FilterExpressionLabel), expression_);
-    form->addRow(chooser);
+    prompt->setWordWrap(true);
+    auto* label = new QLabel(StringText(Str::FilterExpressionLabel), page);
+    label->setBuddy(expression_);
+    auto* form = new QFormLayout;
+    PrepareForm(form);
+    form->setContentsMargins({});
     form->addRow(StringText(Str::OperatorsLabel), operators);
     form->addRow(StringText(Str::FilterAndOrNot), words);
+    auto* column = new QVBoxLayout(page);
+    column->setSpacing(spacing::kTight);
+    column->addWidget(prompt);
+    column->addWidget(label);
+    column->addWidget(expression_, 1); // it takes what is left
+    column->addWidget(chooser);
+    column->addLayout(form);
 
     connect(chooser, &FieldChooser::fieldPicked, this, [this, chooser] {
         Insert(FieldReference(chooser->Table()) + u'.' + FieldReference(chooser->Field()));
@@ -240,6 +266,47 @@ FilterDraft CFilterDialog::Draft() const
 QString CFilterDialog::Condition() const
 {
     return tabs_->currentIndex() == 0 ? Draft().Condition() : expression_->toPlainText();
+}
+
+QString CFilterDialog::FaultInBasic() const
+{
+    const auto fault = [](const FilterTerm* term, bool mayBeMissing) { return term->Fault(mayBeMissing); };
+    if (fromTo_->isChecked()) {
+        const QString from = fault(from_, false);
+        return from.isEmpty() ? fault(to_, false) : from;
+    }
+    const QString operatorText = single_->Operator();
+    return fault(single_, operatorText == u"=" || operatorText == u"not =");
+}
+
+QString CFilterDialog::MarkFaultInExpression()
+{
+    constexpr qsizetype kShown = 20;
+    const QString text = expression_->toPlainText();
+    const std::optional<qsizetype> at = text.trimmed().isEmpty() ? std::nullopt : FaultInCondition(text);
+    if (!at)
+        return {};
+    QTextCursor place = expression_->textCursor();
+    place.setPosition(int(*at));
+    place.movePosition(QTextCursor::EndOfWord, QTextCursor::KeepAnchor);
+    expression_->setTextCursor(place);
+    expression_->setFocus();
+    if (*at >= text.size())
+        return StringText(Str::WhyBreaksOff);
+    return StringText(Str::WhyNoPlace, {QString::number(*at + 1), text.mid(*at, kShown).simplified()});
+}
+
+void CFilterDialog::TakeCondition()
+{
+    const QString fault = tabs_->currentIndex() == 0 ? FaultInBasic() : MarkFaultInExpression();
+    if (!fault.isEmpty())
+        return error_->ShowError(fault, {});
+    error_->Clear();
+    const QString condition = Condition();
+    if (condition.trimmed().isEmpty())
+        return reject();
+    if (apply_(condition))
+        accept();
 }
 
 // As if it were typed at the caret.

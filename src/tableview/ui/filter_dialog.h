@@ -5,19 +5,21 @@
 
 #include <QDialog>
 
+#include <functional>
+
+class QBoxLayout;
 class QCheckBox;
 class QComboBox;
-class QDateEdit;
-class QLineEdit;
 class QPlainTextEdit;
-class QStackedWidget;
 class QTabWidget;
 
 namespace mirel {
 
+class DateField;
+class ErrorLine;
 class FieldChooser;
 
-// One operator and one value of a filter; the value is typed, or a day picked for a date field.
+// One operator and one value of a filter. Of a date field the value is a date with or without a time.
 class FilterTerm : public QWidget {
     Q_OBJECT
 
@@ -26,16 +28,21 @@ public:
 
     void SetType(FieldType type, FilterKind kind); // makes the list of operators anew
     void SetOperator(const QString& operatorText);
-    void SetValue(const QString& displayText); // a date is read in the user's form
+    void SetValue(const QString& displayText);
     QString Operator() const;
-    QString Value() const;
+    QString Value() const; // a number as a statement has it
     void FocusValue();
+    // Why the value cannot be compared, in plain words; empty: it can.
+    QString Fault(bool mayBeMissing) const;
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
 
 private:
+    FieldType type_ = FieldType::None;
+    QBoxLayout* row_;
     QComboBox* operators_;
-    QStackedWidget* values_;
-    QLineEdit* text_;
-    QDateEdit* date_;
+    DateField* value_;
 };
 
 // "Filter Expression": puts a condition together from a field, an operator and a value, or takes one as text.
@@ -43,9 +50,13 @@ class CFilterDialog : public QDialog {
     Q_OBJECT
 
 public:
-    // Begins with the selected cell: its table and field, and the text that it shows, uncut.
+    // What takes the condition; false: it was refused, and the user was told why.
+    using Apply = std::function<bool(const QString& condition)>;
+
+    // Begins with the selected cell: its table and field, and the text that it shows, uncut. The dialog stays
+    // open, with all that was entered, until the condition is taken.
     CFilterDialog(FieldLists& lists, const QString& table, const QString& field, const QString& displayText,
-                  QWidget* parent);
+                  Apply apply, QWidget* parent);
 
     // Empty: nothing to filter by, as after Cancel.
     QString Condition() const;
@@ -57,8 +68,12 @@ private:
     void ShowRange(bool fromTo);
     FilterDraft Draft() const;
     void Insert(const QString& text);
+    void TakeCondition();
+    QString FaultInBasic() const;
+    QString MarkFaultInExpression();
 
     FieldLists& lists_;
+    Apply apply_;
     QTabWidget* tabs_;
     FieldChooser* field_;
     FilterTerm* single_;
@@ -66,6 +81,7 @@ private:
     FilterTerm* from_;
     FilterTerm* to_;
     QPlainTextEdit* expression_;
+    ErrorLine* error_;
 };
 
 } // namespace mirel

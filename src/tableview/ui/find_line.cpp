@@ -1,15 +1,15 @@
 #include "tableview/ui/find_line.h"
 
+#include "platform/ui/elided_label.h"
+#include "platform/ui/look_roles.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
 #include <QAction>
 #include <QHBoxLayout>
 #include <QKeyEvent>
-#include <QLabel>
 #include <QLineEdit>
 #include <QLocale>
-#include <QStyle>
 #include <QToolButton>
 
 namespace mirel {
@@ -35,19 +35,20 @@ FindLine::FindLine(RecordBrowser& browser, const Actions& actions, QWidget* pare
     : QWidget(parent)
     , find_(browser)
     , text_(new QLineEdit(this))
-    , note_(new QLabel(this))
+    , note_(new ElidedLabel(this))
 {
     auto* row = new QHBoxLayout(this);
-    const int side = style()->pixelMetric(QStyle::PM_LayoutLeftMargin) / 2;
-    row->setContentsMargins(side, 0, side, 0);
-    row->setSpacing(side / 2);
+    row->setContentsMargins(spacing::kGap, 0, spacing::kTight, 0);
+    row->setSpacing(spacing::kTight);
+    setMinimumWidth(1); // what is in it gives way, never the window
     text_->setPlaceholderText(StringText(Str::FindPrompt));
     text_->setAccessibleName(StringText(Str::FindPrompt));
     text_->setClearButtonEnabled(true);
     text_->addAction(ThemeIcon(u"edit-find"), QLineEdit::LeadingPosition);
     note_->setForegroundRole(QPalette::PlaceholderText);
-    row->addWidget(text_, 1);
-    row->addWidget(note_);
+    text_->setMinimumWidth(1);
+    row->addWidget(text_, 2);
+    row->addWidget(note_, 0);
     AddButton(this, actions.previous);
     AddButton(this, actions.next);
     auto* close = new QAction(ThemeIcon(u"window-close"), StringText(Str::FindClose), this);
@@ -108,9 +109,10 @@ void FindLine::ShowNote()
     case QuickFind::State::Failed:
         break;
     }
-    note_->setText(note_->fontMetrics().elidedText(note, Qt::ElideRight, width() / 3));
-    note_->setToolTip(note_->text() == note ? QString() : note);
-    note_->setAccessibleName(note);
+    note_->SetText(note);
+    note_->setToolTip(note);
+    note_->setMaximumWidth(width() / 3);
+    note_->setVisible(!note.isEmpty());
 }
 
 void FindLine::keyPressEvent(QKeyEvent* event)

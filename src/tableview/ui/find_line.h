@@ -5,10 +5,11 @@
 #include <QTimer>
 #include <QWidget>
 
-class QLabel;
 class QLineEdit;
 
 namespace mirel {
+
+class ElidedLabel;
 
 // The line that looks for a text in the records while it is typed: Enter goes on to the next place, Shift+Enter
 // to the one before, Escape ends a search that takes long, or closes the line.
@@ -45,7 +46,7 @@ private:
 
     QuickFind find_;
     QLineEdit* text_;
-    QLabel* note_;
+    ElidedLabel* note_;
     QTimer slices_;
 };
 

@@ -1,12 +1,13 @@
 #include "tableview/ui/navigation_row.h"
 
+#include "platform/ui/look_roles.h"
 #include "resources/string_table.h"
 
 #include <QAction>
 #include <QHBoxLayout>
 #include <QMenu>
-#include <QStyle>
-#include <QToolButton>
+#include <QStyleOptionToolButton>
+#include <QStylePainter>
 
 #include <algorithm>
 
@@ -16,17 +17,41 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kTouchPx = 24;
+constexpr int kLeastCounterPx = 48;
+constexpr int kCounterChars = 18; // of a roomy row: millions of millions
+constexpr qreal kLeastPoints = 5.5;
 
 } // namespace
 
+void CounterButton::paintEvent(QPaintEvent*)
+{
+    QStylePainter painter(this);
+    QStyleOptionToolButton option;
+    initStyleOption(&option);
+    const QString shown = option.text;
+    option.text.clear();
+    painter.drawComplexControl(QStyle::CC_ToolButton, option);
+    const int room = width() - spacing::kTight;
+    QFont narrow = font();
+    int wide = fontMetrics().horizontalAdvance(shown);
+    if (wide > room) {
+        narrow.setStretch(QFont::SemiCondensed);
+        wide = QFontMetrics(narrow).horizontalAdvance(shown);
+    }
+    if (wide > room)
+        narrow.setPointSizeF(std::max(narrow.pointSizeF() * room / wide, kLeastPoints));
+    painter.setFont(narrow);
+    painter.drawItemText(rect(), Qt::AlignCenter, palette(), isEnabled(), shown, QPalette::ButtonText);
+}
+
 NavigationRow::NavigationRow(const Actions& actions, QWidget* parent)
     : QWidget(parent)
-    , counter_(new QToolButton(this))
+    , counter_(new CounterButton(this))
     , more_(new QToolButton(this))
     , moreMenu_(new QMenu(this))
 {
     auto* row = new QHBoxLayout(this);
-    row->setContentsMargins(0, 0, 0, style()->pixelMetric(QStyle::PM_LayoutBottomMargin) / 2);
+    row->setContentsMargins(0, 0, 0, spacing::kTight);
     row->setSpacing(0);
     row->setSizeConstraint(QLayout::SetNoConstraint); // FitButtons sees to it that they fit
 
@@ -69,15 +94,8 @@ QToolButton* NavigationRow::AddButton(QAction* action)
 
 void NavigationRow::ShowCounter(const QString& text)
 {
-    if (counter_->text() == text)
-        return;
-    const bool sameLength = counter_->text().size() == text.size();
     counter_->setText(text);
     counter_->setAccessibleName(text);
-    if (!sameLength) {
-        FitButtons();
-        layout()->activate(); // the very next picture shows it whole
-    }
 }
 
 QSize NavigationRow::minimumSizeHint() const
@@ -85,18 +103,19 @@ QSize NavigationRow::minimumSizeHint() const
     return {0, QWidget::minimumSizeHint().height()};
 }
 
-int NavigationRow::NeededWidth() const
+int NavigationRow::ButtonsWidth() const
 {
     const QMargins margins = layout()->contentsMargins();
     int width = margins.left() + margins.right();
     for (int i = 0; i < layout()->count(); ++i) {
         const QWidget* widget = layout()->itemAt(i)->widget();
-        if (widget && !widget->isHidden())
+        if (widget && widget != counter_ && !widget->isHidden())
             width += std::max(widget->sizeHint().width(), widget->minimumWidth());
     }
     return width;
 }
 
+// The counter has what is left, up to what any counter takes.
 void NavigationRow::FitButtons()
 {
     const auto setWords = [this](Qt::ToolButtonStyle words) {
@@ -108,16 +127,17 @@ void NavigationRow::FitButtons()
     more_->hide();
     moreMenu_->clear();
     setWords(Qt::ToolButtonTextBesideIcon);
-    if (NeededWidth() <= width())
-        return;
-    setWords(Qt::ToolButtonIconOnly);
+    const int roomy = kCounterChars * fontMetrics().horizontalAdvance(u'0');
+    if (ButtonsWidth() + roomy > width())
+        setWords(Qt::ToolButtonIconOnly);
     for (QToolButton* button : yielding_) {
-        if (NeededWidth() <= width())
-            return;
+        if (ButtonsWidth() + kLeastCounterPx <= width())
+            break;
         more_->show();
         button->hide();
         moreMenu_->addAction(button->defaultAction());
     }
+    counter_->setFixedWidth(std::clamp(width() - ButtonsWidth(), kLeastCounterPx, roomy));
 }
 
 void NavigationRow::resizeEvent(QResizeEvent*)

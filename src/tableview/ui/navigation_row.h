@@ -1,18 +1,28 @@
 #pragma once
 
+#include <QToolButton>
 #include <QWidget>
 
 #include <array>
 
 class QAction;
 class QMenu;
-class QToolButton;
 
 namespace mirel {
 
+// A button whose text is always whole: in a narrow one the letters get narrower.
+class CounterButton : public QToolButton {
+    Q_OBJECT
+public:
+    using QToolButton::QToolButton;
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+};
+
 // The buttons under the grid: first, previous, the counter (which opens Go To Record), next, last, New, Delete,
-// and the change between list and detail. The counter is always whole: where the row is too narrow, words give
-// way to icons, and then buttons move into a menu behind "…".
+// and the change between list and detail. Their places depend on the row's width alone, not on the counter: where
+// the row is narrow, words give way to icons, and in a very narrow one buttons move into a menu behind "…".
 class NavigationRow : public QWidget {
     Q_OBJECT
 
@@ -40,9 +50,9 @@ protected:
 private:
     QToolButton* AddButton(QAction* action);
     void FitButtons();
-    int NeededWidth() const;
+    int ButtonsWidth() const; // all but the counter
 
-    QToolButton* counter_;
+    CounterButton* counter_;
     QToolButton* more_;
     QMenu* moreMenu_;
     std::array<QToolButton*, 3> worded_{};   // New, Delete, Detail

@@ -1,16 +1,18 @@
 #include "tableview/ui/options_dialog.h"
 
+#include "platform/ui/look_roles.h"
+#include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
 #include <QCheckBox>
 #include <QComboBox>
 #include <QDialogButtonBox>
+#include <QGridLayout>
 #include <QGroupBox>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QScreen>
-#include <QScrollArea>
 #include <QSpinBox>
 #include <QStyle>
 #include <QVBoxLayout>
@@ -20,17 +22,6 @@ namespace {
 
 constexpr int kMostCharacters = 9999;
 constexpr int kLongestHoldMs = 5000;
-
-// A box takes no text of several lines by itself.
-void BreakInTwo(QCheckBox& box, int roomPx)
-{
-    if (box.sizeHint().width() <= roomPx)
-        return;
-    QString text = box.text();
-    const qsizetype blank = text.indexOf(u' ', text.size() / 2);
-    if (blank >= 0)
-        box.setText(text.replace(blank, 1, u'\n'));
-}
 
 } // namespace
 
@@ -68,28 +59,26 @@ COptionsDialog::COptionsDialog(const TableViewSettings& settings, QWidget* paren
 
 void COptionsDialog::LayOut()
 {
-    // A small screen scrolls the options and keeps the buttons in sight.
-    auto* scroller = new QScrollArea(this);
-    auto* page = new QWidget(scroller);
-    scroller->setWidget(page);
-    scroller->setWidgetResizable(true);
-    scroller->setFrameShape(QFrame::NoFrame);
+    auto* page = new QWidget(this);
     auto* column = new QVBoxLayout(page);
-    const int margin = style()->pixelMetric(QStyle::PM_LayoutLeftMargin, nullptr, this) / 2;
+    constexpr int margin = spacing::kTight;
     column->setContentsMargins(margin, margin, margin, margin);
     column->addWidget(confirmDelete_);
 
     auto* limitBox = new QGroupBox(StringText(Str::OptionColumnGroup), this);
-    auto* limitRow = new QHBoxLayout(limitBox);
+    auto* limitRow = new QGridLayout(limitBox);
     limitRow->setContentsMargins(margin, margin, margin, margin);
     limitRow->setSpacing(margin);
-    limitRow->addWidget(limit_);
-    limitRow->addWidget(characters_);
-    limitRow->addWidget(new QLabel(StringText(Str::OptionCharacters), limitBox), 1);
+    limitRow->addWidget(limit_, 0, 0, 1, 2);
+    limitRow->addWidget(characters_, 1, 0);
+    limitRow->addWidget(new QLabel(StringText(Str::OptionCharacters), limitBox), 1, 1);
+    limitRow->setColumnStretch(1, 1);
+    limitBox->setMinimumWidth(1); // its title may be cut before the page is
     column->addWidget(limitBox);
 
     auto* wordsLabel = new QLabel(StringText(Str::OptionYesNoWords), this);
     wordsLabel->setBuddy(words_);
+    wordsLabel->setWordWrap(true);
     column->addWidget(wordsLabel);
     column->addWidget(words_);
 
@@ -106,16 +95,16 @@ void COptionsDialog::LayOut()
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     column->addStretch(1);
+    // A small screen scrolls the options and keeps the buttons in sight.
+    QWidget* scroller = Scrolled(page);
     auto* whole = new QVBoxLayout(this);
     whole->setContentsMargins(margin, margin, margin, margin);
     whole->addWidget(scroller, 1);
     whole->addWidget(buttons);
     resize((scroller->sizeHint() + QSize(2, 3) * fontMetrics().height()).boundedTo(screen()->availableSize()));
     FillSmallWindow(*this, *parentWidget()->window());
-    for (QCheckBox* box : {confirmDelete_, popup_, sortByHeader_})
-        BreakInTwo(*box, width() - 5 * margin);
     characters_->setAccessibleName(StringText(Str::OptionColumnGroup));
-    holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup));
+    holdMs_->setAccessibleName(StringText(Str::OptionHoldPopup).remove(u'&'));
 }
 
 TableViewSettings COptionsDialog::Chosen() const

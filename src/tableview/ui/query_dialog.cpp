@@ -15,7 +15,12 @@ CQueryDialog::CQueryDialog(const QStringList& names, QWidget* parent)
 {
     setWindowTitle(StringText(Str::OpenQueryTitle));
     list_->addItems(names);
+    for (int row = 0; row < list_->count(); ++row)
+        list_->item(row)->setToolTip(names[row].toHtmlEscaped());
     list_->setCurrentRow(0);
+    list_->setTextElideMode(Qt::ElideMiddle);
+    list_->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    list_->setAccessibleName(StringText(Str::OpenQueryPrompt).remove(u'&'));
     auto* label = new QLabel(StringText(Str::OpenQueryPrompt), this);
     label->setBuddy(list_);
     label->setWordWrap(true);

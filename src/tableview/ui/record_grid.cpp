@@ -1,6 +1,10 @@
 #include "tableview/ui/record_grid.h"
 
+#include "platform/ui/look_roles.h"
+#include "platform/ui/window_place.h"
+#include "resources/string_table.h"
 #include "tableview/scroll_scale.h"
+#include "tableview/ui/empty_note.h"
 #include "tableview/ui/grid_header.h"
 
 #include <QEvent>
@@ -10,7 +14,6 @@
 #include <QScrollBar>
 #include <QScroller>
 #include <QStyle>
-#include <QStyleOption>
 
 #include <algorithm>
 
@@ -27,11 +30,22 @@ bool HasTouchScreen()
     });
 }
 
-QColor Blend(const QColor& over, const QColor& under, qreal strength)
+// Air around the text of a cell.
+struct CellAir {
+    int sidePx;
+    int abovePx; // and below
+};
+constexpr CellAir kDesktopAir{6, 4};
+constexpr CellAir kHandheldAir{3, 2};
+
+constexpr float kRowTint = 0.14F;
+constexpr float kBlockTint = 0.26F;
+
+// The fraction of a number, its point included; the whole of other texts has none.
+QStringView FractionOf(QStringView number)
 {
-    const auto mix = [strength](float a, float b) { return a * float(strength) + b * float(1 - strength); };
-    return QColor::fromRgbF(mix(over.redF(), under.redF()), mix(over.greenF(), under.greenF()),
-                            mix(over.blueF(), under.blueF()));
+    const qsizetype point = number.indexOf(u'.');
+    return point < 0 ? QStringView() : number.mid(point);
 }
 
 } // namespace
@@ -40,7 +54,9 @@ RecordGrid::RecordGrid(const RecordBrowser& browser, QWidget* parent)
     : QAbstractScrollArea(parent)
     , browser_(browser)
     , header_(new GridHeader(layout_, browser.Page(), this))
+    , empty_(new EmptyNote(viewport()))
 {
+    connect(empty_, &EmptyNote::commandRequested, this, &RecordGrid::commandRequested);
     header_->setObjectName(QStringLiteral("header"));
     setFocusPolicy(Qt::StrongFocus);
     viewport()->setBackgroundRole(QPalette::Base);
@@ -65,9 +81,11 @@ RecordGrid::~RecordGrid() = default;
 void RecordGrid::TakeUpFont()
 {
     text_.emplace(font());
-    marginPx_ = style()->pixelMetric(QStyle::PM_FocusFrameHMargin, nullptr, this) + 2;
+    handheld_ = IsHandheldSize(window()->size());
+    const CellAir& air = handheld_ ? kHandheldAir : kDesktopAir;
+    marginPx_ = air.sidePx;
     header_->SetMargin(marginPx_);
-    rowHeightPx_ = std::max(text_->LineHeight() + 4, HasTouchScreen() ? kTouchRowPx : kRowPx);
+    rowHeightPx_ = std::max(text_->LineHeight() + 2 * air.abovePx, HasTouchScreen() ? kTouchRowPx : kRowPx);
     PlaceHeader();
 }
 
@@ -80,7 +98,7 @@ void RecordGrid::PlaceHeader()
 
 QSize RecordGrid::minimumSizeHint() const
 {
-    return {rowHeightPx_ * 4, rowHeightPx_ * 4};
+    return {rowHeightPx_ * 4, rowHeightPx_ * 2};
 }
 
 QSize RecordGrid::sizeHint() const
@@ -99,16 +117,14 @@ QRect RecordGrid::CellRect(int row, int column) const
 void RecordGrid::ShowState()
 {
     const bool otherColumns = shownColumns_ != browser_.ColumnsRevision();
-    const int widthBefore = layout_.TotalPx();
     if (otherColumns) {
         shownColumns_ = browser_.ColumnsRevision();
         layout_.Reset(browser_.Page().ColumnCount());
-        shownColumn_ = -1;
     }
     if (shownPage_ != browser_.PageRevision() || otherColumns) {
         shownPage_ = browser_.PageRevision();
         if (browser_.Settings().autoSizing || otherColumns)
-            FitToContent(otherColumns);
+            FitToContent(otherColumns ? Fit::Anew : Fit::Grow);
         if (otherColumns)
             TakeUpWidths();
     }
@@ -116,10 +132,25 @@ void RecordGrid::ShowState()
     header_->SetArrow(sort.field, sort.direction == SortDirection::Ascending ? GridHeader::Arrow::Ascending
                                                                              : GridHeader::Arrow::Descending);
     UpdateScrollBars();
-    if (shownColumn_ != browser_.SelectedColumn() || layout_.TotalPx() != widthBefore)
+    if (shownField_ != browser_.SelectedField())
         ScrollToSelectedColumn();
+    ShowEmptyNote();
     header_->update();
     viewport()->update();
+}
+
+void RecordGrid::ShowEmptyNote()
+{
+    const bool filtered = browser_.IsFiltered();
+    if (!browser_.IsOpen() || !browser_.IsEmpty())
+        empty_->hide();
+    else if (filtered)
+        empty_->Show(StringText(Str::EmptyFiltered), TableCommand::RemoveFilter);
+    else if (browser_.CanUpdate())
+        empty_->Show(StringText(Str::EmptyTable), TableCommand::NewRecord);
+    else
+        empty_->Show(StringText(Str::EmptyResult), {});
+    empty_->setGeometry(viewport()->rect());
 }
 
 void RecordGrid::SetWidthsByHand(const ColumnWidths& widths)
@@ -144,15 +175,22 @@ void RecordGrid::TakeUpWidths()
 
 void RecordGrid::KeepWidth(int column)
 {
-    if (browser_.CurrentPresentation() == Presentation::List)
+    if (browser_.CurrentPresentation() == Presentation::List) {
         widthsByHand_.insert(browser_.Page().columns[size_t(column)].title, layout_.WidthPx(column));
+        return;
+    }
+    if (column == 0)
+        detailNamesPx_ = layout_.WidthPx(0);
+    FitDetail();
 }
 
 void RecordGrid::FitAllColumns()
 {
     if (browser_.CurrentPresentation() == Presentation::List)
         widthsByHand_.clear();
-    FitToContent(true);
+    else
+        detailNamesPx_ = 0;
+    FitToContent(Fit::Anew);
     UpdateScrollBars();
     header_->update();
     viewport()->update();
@@ -164,38 +202,53 @@ void RecordGrid::FitColumn(int column)
         return;
     if (browser_.CurrentPresentation() == Presentation::List)
         widthsByHand_.remove(browser_.Page().columns[size_t(column)].title);
-    layout_.Fit(column, ContentWidth(column));
+    layout_.FitAnew(column);
+    TakeUpContent(column);
+    TakeContentWidths();
     UpdateScrollBars();
     header_->update();
     viewport()->update();
 }
 
-void RecordGrid::FitToContent(bool alsoByHand)
+// No column is wider than the view, so that a whole one can always be seen at once.
+void RecordGrid::FitToContent(Fit fit)
 {
     for (int column = 0; column < layout_.Count(); ++column) {
-        if (alsoByHand || !layout_.IsByHand(column))
-            layout_.Fit(column, ContentWidth(column));
+        if (fit == Fit::Anew)
+            layout_.FitAnew(column);
+        TakeUpContent(column);
     }
+    TakeContentWidths();
+}
+
+void RecordGrid::TakeContentWidths()
+{
+    layout_.TakeContentWidths(marginPx_, std::max(viewport()->width(), ColumnLayout::kNarrowestPx));
     if (browser_.CurrentPresentation() == Presentation::Detail && layout_.Count() == 2)
         FitDetail();
 }
 
-// No wider than the view, so that a whole column can always be seen at once.
-int RecordGrid::ContentWidth(int column) const
+void RecordGrid::TakeUpContent(int column)
 {
     const RecordPage& page = browser_.Page();
-    int width = header_->WidthFor(page.columns[size_t(column)].title);
-    for (int row = 0; row < page.RowCount(); ++row)
-        width = std::max(width, text_->WidthOf(page.At(row, column).text) + 2 * marginPx_ + 1);
-    return std::min(width, std::max(viewport()->width(), ColumnLayout::kNarrowestPx));
+    const PageColumn& shown = page.columns[size_t(column)];
+    layout_.Grow(column, {.wholePx = header_->WidthFor(shown.title) - 2 * marginPx_ - layout_.FractionPx(column)});
+    for (int row = 0; row < page.RowCount(); ++row) {
+        const QString& text = page.At(row, column).text;
+        const QStringView fraction = shown.rightAligned ? FractionOf(text) : QStringView();
+        const int fractionPx = fraction.isEmpty() ? 0 : text_->WidthOf(fraction.toString());
+        layout_.Grow(column, {text_->WidthOf(text) - fractionPx, fractionPx});
+    }
 }
 
 // A single record is read from top to bottom, never sideways: its values take the room that the names leave.
 void RecordGrid::FitDetail()
 {
     const int room = viewport()->width();
-    layout_.Fit(0, std::min(layout_.WidthPx(0), room * 2 / 5));
-    layout_.Fit(1, room - layout_.WidthPx(0));
+    const int most = room - std::max(room / 5, ColumnLayout::kNarrowestPx);
+    const int names = detailNamesPx_ > 0 ? detailNamesPx_ : std::min(layout_.WidthPx(0), room * 2 / 5);
+    layout_.SetWidth(0, std::min(names, most));
+    layout_.SetWidth(1, room - layout_.WidthPx(0));
 }
 
 void RecordGrid::UpdateScrollBars()
@@ -216,12 +269,13 @@ void RecordGrid::UpdateScrollBars()
 
 void RecordGrid::ScrollToSelectedColumn()
 {
-    shownColumn_ = browser_.SelectedColumn();
-    if (shownColumn_ < 0)
+    shownField_ = browser_.SelectedField();
+    const int column = browser_.SelectedColumn();
+    if (column < 0)
         return;
     QScrollBar* bar = horizontalScrollBar();
-    const int left = layout_.LeftPx(shownColumn_);
-    const int right = left + layout_.WidthPx(shownColumn_);
+    const int left = layout_.LeftPx(column);
+    const int right = left + layout_.WidthPx(column);
     if (right > bar->value() + viewport()->width())
         bar->setValue(right - viewport()->width());
     if (left < bar->value())
@@ -250,8 +304,8 @@ void RecordGrid::PaintRow(QPainter& painter, int row, const QRect& dirty)
         PaintBlock(painter, row, band);
     } else if (row == browser_.SelectedRow()) {
         const QRect filled = band.intersected(QRect(0, 0, CellRect(row, layout_.Count() - 1).right(), height()));
-        painter.fillRect(filled,
-                         Blend(palette().color(QPalette::Highlight), palette().color(QPalette::Base), 0.2));
+        painter.fillRect(filled, Blend(ColorOfRole(LookRole::Accent, palette()),
+                                       ColorOfRole(LookRole::Base, palette()), kRowTint));
     }
     for (int column = 0; column < layout_.Count(); ++column) {
         const QRect rect = CellRect(row, column);
@@ -267,36 +321,57 @@ void RecordGrid::PaintBlock(QPainter& painter, int row, const QRect& band) const
         return;
     QRect filled = CellRect(row, block.firstColumn).united(CellRect(row, block.lastColumn));
     filled = filled.intersected(band);
-    painter.fillRect(filled, Blend(palette().color(QPalette::Highlight), palette().color(QPalette::Base), 0.3));
+    painter.fillRect(filled, Blend(ColorOfRole(LookRole::Accent, palette()),
+                                   ColorOfRole(LookRole::Base, palette()), kBlockTint));
+}
+
+QString RecordGrid::ShownText(int row, int column) const
+{
+    const bool edited =
+        browser_.HasPendingEdit() && row == browser_.SelectedRow() && column == browser_.SelectedColumn();
+    return LinePainter::SingleLine(edited ? browser_.SelectedText() : browser_.Page().At(row, column).text);
+}
+
+bool RecordGrid::IsDetailName(int column) const
+{
+    return column == 0 && browser_.CurrentPresentation() == Presentation::Detail;
 }
 
 void RecordGrid::PaintCell(QPainter& painter, int row, int column, const QRect& rect)
 {
-    const bool edited =
-        browser_.HasPendingEdit() && row == browser_.SelectedRow() && column == browser_.SelectedColumn();
-    const PageCell& cell = browser_.Page().At(row, column);
+    const QString text = ShownText(row, column);
     const bool right = browser_.Page().columns[size_t(column)].rightAligned;
     const QRect inner = rect.adjusted(marginPx_, 0, -marginPx_ - 1, 0);
-    if (cell.isNull && !edited) {
+    if (text.isEmpty() && browser_.Page().At(row, column).isNull) {
         const int dash = text_->LineHeight() / 2;
-        painter.setPen(palette().color(QPalette::PlaceholderText));
+        painter.setPen(ColorOfRole(LookRole::Dim, palette()));
         painter.drawLine(right ? inner.right() - dash : inner.left(), inner.center().y(),
                          right ? inner.right() : inner.left() + dash, inner.center().y());
         return;
     }
-    const bool isName = browser_.Page().columns[size_t(column)].field < 0 && column == 0 &&
-                        browser_.CurrentPresentation() == Presentation::Detail;
-    painter.setPen(palette().color(isName ? QPalette::PlaceholderText : QPalette::Text));
-    text_->Draw(painter, inner, LinePainter::SingleLine(edited ? browser_.SelectedText() : cell.text),
-                right ? Qt::AlignRight : Qt::AlignLeft);
+    painter.setPen(ColorOfRole(IsDetailName(column) ? LookRole::Dim : LookRole::Text, palette()));
+    if (right)
+        PaintNumber(painter, column, inner, text);
+    else if (IsDetailName(column)) // names differ at their ends
+        text_->Draw(painter, inner, fontMetrics().elidedText(text, Qt::ElideMiddle, inner.width()), Qt::AlignLeft);
+    else
+        text_->Draw(painter, inner, text, Qt::AlignLeft);
+}
+
+// The points of a column stand under one another; a column too narrow for that gives up the room behind them.
+void RecordGrid::PaintNumber(QPainter& painter, int column, const QRect& inner, const QString& number)
+{
+    int behind = layout_.FractionPx(column);
+    if (const QStringView fraction = FractionOf(number); behind > 0 && !fraction.isEmpty())
+        behind -= text_->WidthOf(fraction.toString());
+    if (behind > 0)
+        behind = std::clamp(inner.width() - text_->WidthOf(number), 0, behind);
+    text_->Draw(painter, inner.adjusted(0, 0, -behind, 0), number, Qt::AlignRight);
 }
 
 void RecordGrid::PaintGridLines(QPainter& painter, const QRect& dirty) const
 {
-    QStyleOption option;
-    option.initFrom(this);
-    const int hint = style()->styleHint(QStyle::SH_Table_GridLineColor, &option, this);
-    painter.setPen(QColor::fromRgb(QRgb(hint)));
+    painter.setPen(ColorOfRole(LookRole::Line, palette()));
     const int bottom = browser_.Page().RowCount() * rowHeightPx_ - 1;
     const int right = layout_.TotalPx() - horizontalScrollBar()->value() - 1;
     for (int y = rowHeightPx_ - 1; y <= std::min(bottom, dirty.bottom()); y += rowHeightPx_)
@@ -317,7 +392,7 @@ void RecordGrid::PaintSelection(QPainter& painter) const
     const int column = browser_.SelectedColumn();
     if (row < 0 || column < 0)
         return;
-    QPen pen(palette().color(QPalette::Highlight), 2);
+    QPen pen(ColorOfRole(LookRole::Accent, palette()), 2);
     pen.setJoinStyle(Qt::MiterJoin);
     painter.setPen(pen);
     painter.setBrush(Qt::NoBrush);
@@ -328,12 +403,15 @@ void RecordGrid::PaintSelection(QPainter& painter) const
 
 void RecordGrid::resizeEvent(QResizeEvent*)
 {
+    if (IsHandheldSize(window()->size()) != handheld_)
+        TakeUpFont();
     PlaceHeader();
     const int rows = std::max(viewport()->height() / rowHeightPx_, 1);
     if (rows != browser_.RowsPerPage())
         Q_EMIT rowsPerPageChanged(rows);
     if (browser_.Settings().autoSizing)
-        FitToContent(false);
+        FitToContent(Fit::Grow);
+    empty_->setGeometry(viewport()->rect());
     UpdateScrollBars();
 }
 
@@ -342,6 +420,8 @@ void RecordGrid::changeEvent(QEvent* event)
     QAbstractScrollArea::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
         TakeUpFont();
+        FitToContent(Fit::Anew);
+        TakeUpWidths();
         resizeEvent(nullptr);
     }
 }

@@ -13,6 +13,7 @@
 
 namespace mirel {
 
+class EmptyNote;
 class GridHeader;
 
 // Draws the browser's page with its selection, and turns keys, taps, the wheel and its scroll bars into
@@ -43,6 +44,7 @@ Q_SIGNALS:
     void textTyped(const QString& text);
     void cellPressed(int row, int column);
     void cellReached(int row, int column); // by a drag of the mouse, or pressed with Shift
+    void selectedCellTapped();             // that was selected before
     void cellDoubleTapped();
     void popupRequested(const QPoint& globalPosition);
     void headerTapped(int column);
@@ -68,9 +70,13 @@ protected:
 private:
     void TakeUpFont();
     void PlaceHeader();
-    void FitToContent(bool alsoByHand);
-    int ContentWidth(int column) const;
+    // Grows the columns with the page; Anew: fits them to it alone.
+    enum class Fit { Grow, Anew };
+    void FitToContent(Fit fit);
+    void TakeUpContent(int column);
+    void TakeContentWidths();
     void FitDetail();
+    void ShowEmptyNote();
     void KeepWidth(int column);
     void TakeUpWidths();
     void UpdateScrollBars();
@@ -80,12 +86,17 @@ private:
     std::optional<QPoint> CellAt(const QPoint& position) const;
     bool PressCell(const QPoint& position); // false: there is none
     void EndBlockPressed();
+    QPoint PopupPlace() const;
     void DragTo(const QPoint& position);
     void DragOnward();
 
     void PaintRow(QPainter& painter, int row, const QRect& dirty);
     void PaintBlock(QPainter& painter, int row, const QRect& band) const;
     void PaintCell(QPainter& painter, int row, int column, const QRect& rect);
+    void PaintNumber(QPainter& painter, int column, const QRect& inner, const QString& number);
+    QString ShownText(int row, int column) const;
+    bool ShowToolTip(const QPoint& position, const QPoint& globalPosition);
+    bool IsDetailName(int column) const;
     void PaintGridLines(QPainter& painter, const QRect& dirty) const;
     void PaintSelection(QPainter& painter) const;
 
@@ -95,14 +106,18 @@ private:
     GridHeader* header_;
     std::optional<LinePainter> text_; // for the widget's font
     int rowHeightPx_ = 0;
-    int marginPx_ = 4;
+    int marginPx_ = 0;
+    EmptyNote* empty_;
+    bool handheld_ = false;
     quint64 shownPage_ = 0;
     quint64 shownColumns_ = 0;
-    int shownColumn_ = -1;
+    int shownField_ = -1;   // scrolled to when it was selected
+    int detailNamesPx_ = 0; // set by hand; 0: as they need
     bool syncing_ = false;
     QBasicTimer hold_;
     QPoint pressedAt_;
     std::optional<QPoint> pressedInBlock_; // the cell: a hold opens the block's menu, all else ends the block
+    bool pressedSelected_ = false;         // the selected cell: neither dragged nor held since
     bool dragging_ = false;
     QBasicTimer dragOn_; // while the mouse is dragged beyond the cells
     QPoint dragAt_;

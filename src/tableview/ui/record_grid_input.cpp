@@ -3,10 +3,12 @@
 #include "tableview/ui/record_grid.h"
 
 #include <QApplication>
+#include <QHelpEvent>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QScrollBar>
 #include <QScrollPrepareEvent>
+#include <QToolTip>
 
 #include <algorithm>
 #include <utility>
@@ -30,6 +32,8 @@ void RecordGrid::keyPressEvent(QKeyEvent* event)
 {
     if (const std::optional<TableCommand> command = CommandOfKey(KeyPlace::Grid, event->keyCombination()))
         Q_EMIT commandRequested(*command);
+    else if (event->key() == Qt::Key_F10 && event->modifiers() == Qt::ShiftModifier)
+        Q_EMIT popupRequested(PopupPlace());
     else if (IsTyped(*event))
         Q_EMIT textTyped(event->text());
     else
@@ -65,6 +69,8 @@ void RecordGrid::mousePressEvent(QMouseEvent* event)
     if (!isLeft && inBlock)
         return; // its menu is the block's
     pressedInBlock_.reset();
+    pressedSelected_ = isLeft && event->modifiers() == Qt::NoModifier && !browser_.HasBlock() &&
+                       *cell == QPoint(browser_.SelectedColumn(), browser_.SelectedRow());
     if (isLeft && event->modifiers() == Qt::ShiftModifier)
         Q_EMIT cellReached(cell->y(), cell->x());
     else if (inBlock)
@@ -90,6 +96,7 @@ void RecordGrid::mouseMoveEvent(QMouseEvent* event)
     }
     if (!dragging_ || !(event->buttons() & Qt::LeftButton))
         return;
+    pressedSelected_ = false;
     EndBlockPressed();
     DragTo(at);
 }
@@ -137,6 +144,8 @@ void RecordGrid::mouseReleaseEvent(QMouseEvent*)
     dragOn_.stop();
     dragging_ = false;
     EndBlockPressed();
+    if (std::exchange(pressedSelected_, false))
+        Q_EMIT selectedCellTapped();
 }
 
 void RecordGrid::mouseDoubleClickEvent(QMouseEvent* event)
@@ -149,12 +158,30 @@ void RecordGrid::mouseDoubleClickEvent(QMouseEvent* event)
 
 void RecordGrid::contextMenuEvent(QContextMenuEvent* event)
 {
-    QPoint at = event->globalPos();
-    if (event->reason() == QContextMenuEvent::Keyboard && browser_.SelectedRow() >= 0) {
-        const QRect cell = CellRect(browser_.SelectedRow(), std::max(browser_.SelectedColumn(), 0));
-        at = viewport()->mapToGlobal(cell.intersected(viewport()->rect()).bottomLeft());
+    Q_EMIT popupRequested(event->reason() == QContextMenuEvent::Keyboard ? PopupPlace() : event->globalPos());
+}
+
+// Of the menu that a key opens.
+QPoint RecordGrid::PopupPlace() const
+{
+    const int row = std::max(browser_.SelectedRow(), 0);
+    const QRect cell = browser_.SelectedColumn() < 0 ? QRect() : CellRect(row, browser_.SelectedColumn());
+    return viewport()->mapToGlobal(cell.intersected(viewport()->rect()).bottomLeft());
+}
+
+bool RecordGrid::ShowToolTip(const QPoint& position, const QPoint& globalPosition)
+{
+    const std::optional<QPoint> cell = CellAt(position);
+    if (cell) {
+        const QString text = ShownText(cell->y(), cell->x());
+        const QRect place = CellRect(cell->y(), cell->x());
+        if (text_->WidthOf(text) > place.width() - 2 * marginPx_ - 1) {
+            QToolTip::showText(globalPosition, text.toHtmlEscaped(), viewport(), place);
+            return true;
+        }
     }
-    Q_EMIT popupRequested(at);
+    QToolTip::hideText();
+    return true;
 }
 
 void RecordGrid::timerEvent(QTimerEvent* event)
@@ -164,6 +191,7 @@ void RecordGrid::timerEvent(QTimerEvent* event)
     } else if (event->timerId() == hold_.timerId()) {
         hold_.stop();
         dragging_ = false;
+        pressedSelected_ = false;
         pressedInBlock_.reset();
         Q_EMIT popupRequested(viewport()->mapToGlobal(pressedAt_));
     } else {
@@ -200,10 +228,15 @@ bool RecordGrid::viewportEvent(QEvent* event)
     if (event->type() == QEvent::Scroll) {
         hold_.stop();
         dragging_ = false;
+        pressedSelected_ = false;
         const auto* scroll = static_cast<QScrollEvent*>(event);
         horizontalScrollBar()->setValue(int(scroll->contentPos().x()));
         Q_EMIT scrollRequested(qint64(scroll->contentPos().y() / rowHeightPx_));
         return true;
+    }
+    if (event->type() == QEvent::ToolTip) {
+        const auto* help = static_cast<QHelpEvent*>(event);
+        return ShowToolTip(help->pos(), help->globalPos());
     }
     return QAbstractScrollArea::viewportEvent(event);
 }

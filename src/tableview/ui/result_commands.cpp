@@ -92,13 +92,16 @@ bool ResultCommands::FilterByExpression()
     if (!browser_.WriteEdit())
         return false;
     FieldLists lists(connection_, browser_.Database(), prompt_);
-    CFilterDialog dialog(lists, browser_.TableOf(browser_.SelectedField()), SelectedColumn(),
-                         browser_.SelectedText(), &view_);
+    CFilterDialog dialog(
+        lists, browser_.TableOf(browser_.SelectedField()), SelectedColumn(), browser_.SelectedText(),
+        [this](const QString& condition) {
+            const WaitCursor waiting;
+            return browser_.AddCondition(condition);
+        },
+        &view_);
     FillSmallWindow(dialog, view_);
-    if (dialog.exec() != QDialog::Accepted)
-        return true;
-    const WaitCursor waiting;
-    return browser_.AddCondition(dialog.Condition());
+    dialog.exec();
+    return true;
 }
 
 bool ResultCommands::SortByExpression()

@@ -1,6 +1,9 @@
 #include "tableview/ui/table_view.h"
 
+#include "platform/ui/error_line.h"
 #include "platform/ui/hold_popup.h"
+#include "platform/ui/look_roles.h"
+#include "platform/ui/memo_edit.h"
 #include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
@@ -9,11 +12,11 @@
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/result_commands.h"
+#include "tableview/why_not_stored.h"
 
 #include <QApplication>
 #include <QCloseEvent>
 #include <QKeyEvent>
-#include <QPlainTextEdit>
 #include <QStackedWidget>
 #include <QVBoxLayout>
 
@@ -36,8 +39,9 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
     , resultCommands_(new ResultCommands(browser_, connection, prompt, *this))
     , stack_(new QStackedWidget(this))
     , grid_(new RecordGrid(browser_, this))
-    , zoomEdit_(new QPlainTextEdit(this))
+    , zoomEdit_(new MemoEdit(this))
     , strip_(new CellStrip(browser_, this))
+    , error_(new ErrorLine(this))
 {
     CreateActions();
     chip_ = new FilterChip(ActionOf(Command::RemoveFilter), this);
@@ -66,15 +70,17 @@ void CTableView::LayOut()
     auto* center = new QWidget(this);
     auto* column = new QVBoxLayout(center);
     column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(spacing::kTight);
     column->addWidget(stack_, 1);
     column->addWidget(findLine_);
     column->addWidget(chip_);
+    column->addWidget(error_);
     column->addWidget(strip_);
     column->addWidget(navigation_);
     stack_->addWidget(grid_);
     stack_->addWidget(zoomEdit_);
     grid_->setFrameShape(QFrame::NoFrame);
-    zoomEdit_->setTabChangesFocus(true);
+    zoomEdit_->setFrameShape(QFrame::NoFrame);
     zoomEdit_->installEventFilter(this);
     new HoldPopup(zoomEdit_->viewport(), [this] { return browser_.Settings().holdTimeMs; });
     grid_->setAccessibleName(StringText(Str::GridName));
@@ -90,6 +96,12 @@ void CTableView::ConnectParts()
             [this](int row, int cell) { Settle(browser_.SelectCell(row, cell)); });
     connect(grid_, &RecordGrid::cellReached, this,
             [this](int row, int cell) { Settle(browser_.ExtendToCell(row, cell)); });
+    connect(grid_, &RecordGrid::selectedCellTapped, this, [this] {
+        if (browser_.Edit().Kind() != EditorKind::Check || browser_.ShowsResult())
+            return;
+        browser_.EditChecked(!browser_.Edit().IsChecked());
+        ShowState();
+    });
     connect(grid_, &RecordGrid::cellDoubleTapped, this, [this] { Edit(nullptr); });
     connect(grid_, &RecordGrid::popupRequested, this, &CTableView::ShowPopup);
     connect(grid_, &RecordGrid::headerTapped, this, [this](int column) { Settle(browser_.TapHeader(column)); });
@@ -114,12 +126,16 @@ void CTableView::ConnectParts()
     });
     connect(findLine_, &FindLine::moved, this, [this] { Settle(!browser_.WriteFailed()); });
     connect(findLine_, &FindLine::closed, stack_, [this] { stack_->currentWidget()->setFocus(); });
-    connect(zoomEdit_, &QPlainTextEdit::textChanged, this, [this] {
-        if (showing_)
-            return;
-        browser_.EditText(zoomEdit_->toPlainText());
+    connect(zoomEdit_, &MemoEdit::edited, this, [this](const QString& text) {
+        browser_.EditText(text);
         ShowState();
     });
+    connect(strip_, &CellStrip::reasonRequested, this, [this] {
+        refused_ = true;
+        ShowState();
+    });
+    connect(strip_, &CellStrip::typedOverResult, this, [this](const QString& text) { Edit(&text); });
+    connect(error_, &ErrorLine::restoreRequested, this, [this] { Do(Command::RevertEdit); });
     connect(&countTimer_, &QTimer::timeout, this, [this] {
         if (browser_.CountOn(kCountSliceMs))
             ShowState();
@@ -184,6 +200,10 @@ void CTableView::SetWidthsByHand(const ColumnWidths& widths)
 
 bool CTableView::Settle(bool done)
 {
+    if (!done && browser_.WriteFailed()) {
+        refused_ = true;
+        refusal_ = {browser_.Edit().Text(), browser_.WriteError()};
+    }
     ShowState();
     if (!done && browser_.WriteFailed()) {
         QTimer::singleShot(kWriteErrorDelayMs, this, [this] {
@@ -196,9 +216,15 @@ bool CTableView::Settle(bool done)
 
 void CTableView::ShowState()
 {
-    showing_ = true;
+    const bool wasRefused = refused_;
+    refused_ = refused_ && browser_.HasPendingEdit();
     grid_->ShowState();
     strip_->ShowState(zoomed_);
+    strip_->MarkRefused(refused_);
+    if (refused_)
+        ShowReason();
+    else if (wasRefused || notedAt_ != CellPlace{browser_.SelectedRecord(), browser_.SelectedField()})
+        error_->Clear();
     chip_->ShowConditions(browser_.Conditions());
     ShowZoom();
     ShowActions();
@@ -213,7 +239,26 @@ void CTableView::ShowState()
         countTimer_.start(0);
     else
         countTimer_.stop();
-    showing_ = false;
+}
+
+// The words of what was typed; else, where the store has refused it, those of the store.
+void CTableView::ShowReason()
+{
+    const QString why = browser_.WhyNotStored();
+    const bool isRefusedText = browser_.Edit().Text() == refusal_.text;
+    const QString what = !why.isEmpty() ? why : isRefusedText ? refusal_.why : QString();
+    notedAt_ = {browser_.SelectedRecord(), browser_.SelectedField()};
+    if (what.isEmpty())
+        return error_->Clear();
+    const QString before = Quoted(browser_.Edit().LoadedText()).replace(u'&', QStringLiteral("&&"));
+    error_->ShowError(what, before.isEmpty() ? StringText(Str::ErrorRestoreEmpty)
+                                             : StringText(Str::ErrorRestore, {before}));
+}
+
+void CTableView::Note(const QString& text)
+{
+    notedAt_ = {browser_.SelectedRecord(), browser_.SelectedField()};
+    error_->ShowNote(text);
 }
 
 // Dates and ticks keep their ordinary editors while the view is zoomed.
@@ -227,8 +272,7 @@ void CTableView::ShowZoom()
         return;
     zoomEdit_->setReadOnly(!browser_.CanEdit());
     zoomEdit_->setAccessibleName(browser_.FieldLabel());
-    if (zoomEdit_->toPlainText() != browser_.Edit().Text() && !browser_.HasPendingEdit())
-        zoomEdit_->setPlainText(browser_.Edit().Text());
+    zoomEdit_->SetText(browser_.Edit().Text());
     if (moved)
         zoomEdit_->setFocus();
 }

@@ -12,15 +12,16 @@
 
 class QAction;
 class QMenu;
-class QPlainTextEdit;
 class QStackedWidget;
 
 namespace mirel {
 
 class CellStrip;
+class ErrorLine;
 class FilterChip;
 class FindLine;
 class FormStore;
+class MemoEdit;
 class NavigationRow;
 class RecordGrid;
 class ResultCommands;
@@ -46,6 +47,9 @@ public:
     void SetStore(FormStore& store);
 
     const RecordBrowser& Browser() const { return browser_; }
+
+    // Options that were confirmed in another view.
+    void ChangeSettings(const TableViewSettings& settings);
 
     void SetLook(const ViewLook& look);
     ColumnWidths WidthsByHand() const;
@@ -78,6 +82,8 @@ private:
     bool Settle(bool done);
     void ShowState();
     void ShowZoom();
+    void ShowReason();              // why what is typed was not, or will not be, stored
+    void Note(const QString& text); // until another cell is selected
     void ShowActions();
 
     void Edit(const QString* typed); // null: as the cell is
@@ -102,14 +108,21 @@ private:
     QHash<TableCommand, QAction*> actions_;
     QStackedWidget* stack_;
     RecordGrid* grid_;
-    QPlainTextEdit* zoomEdit_;
+    MemoEdit* zoomEdit_;
     CellStrip* strip_;
+    ErrorLine* error_;
     FindLine* findLine_ = nullptr;
     FilterChip* chip_ = nullptr;
     NavigationRow* navigation_ = nullptr;
     QTimer countTimer_;
     bool zoomed_ = false;
-    bool showing_ = false;
+    bool refused_ = false; // the error stands beside the editor, until the edit ends
+    struct Refusal {
+        QString text;
+        QString why;
+    };
+    Refusal refusal_;   // the last one of the store, and of which text
+    CellPlace notedAt_; // the note is about that cell
 };
 
 } // namespace mirel

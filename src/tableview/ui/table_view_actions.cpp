@@ -1,3 +1,4 @@
+#include "platform/ui/memo_edit.h"
 #include "platform/ui/menu_keys.h"
 #include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
@@ -205,13 +206,20 @@ void CTableView::ShowActions()
 
 void CTableView::Do(TableCommand command)
 {
+    if (command == Command::InsertDateTime && stack_->currentWidget() == zoomEdit_ && !zoomEdit_->isReadOnly())
+        return zoomEdit_->insertPlainText(RecordBrowser::CurrentDateTimeText()); // a memo is not replaced by it
     const auto row = std::ranges::find(kBrowserCalls, command, &BrowserCall::command);
     if (row != kBrowserCalls.end()) {
         const bool fromEditor = strip_->HasEditorFocus();
         const bool isEdit = command == Command::RepeatAbove || command == Command::InsertDateTime;
         const auto waiting = row->takesTime ? std::make_unique<WaitCursor>() : nullptr;
+        const qint64 before = browser_.SelectedRecord();
         if (Run(row->call) && fromEditor && !isEdit)
             grid_->setFocus();
+        const bool listAgain =
+            command == Command::ToggleDetail && browser_.CurrentPresentation() == Presentation::List;
+        if (listAgain && browser_.SelectedRecord() != before)
+            Note(StringText(Str::DetailLeft, {QString::number(browser_.SelectedRecord() + 1)}));
         return;
     }
     const auto look = std::ranges::find(kLookItems, command, &LookCommand::command);

@@ -1,4 +1,5 @@
 #include "platform/ui/keys_dialog.h"
+#include "platform/ui/memo_edit.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/find_line.h"
@@ -12,7 +13,6 @@
 #include <QClipboard>
 #include <QGuiApplication>
 #include <QMimeData>
-#include <QPlainTextEdit>
 #include <QStackedWidget>
 
 // What the table view does with the selected cell, and its dialogs.
@@ -29,6 +29,12 @@ const QString kCellsFormat = QStringLiteral("application/x-mirel-cells");
 
 void CTableView::Edit(const QString* typed)
 {
+    if (browser_.ShowsResult()) {
+        browser_.EndResult();
+        ShowState();
+    }
+    if (const QString why = browser_.WhyNotEditable(); typed && !why.isEmpty())
+        return Note(why);
     if (stack_->currentWidget() == zoomEdit_) {
         zoomEdit_->setFocus();
         return;
@@ -46,15 +52,16 @@ void CTableView::Edit(const QString* typed)
 
 void CTableView::Revert()
 {
-    if (!browser_.HasPendingEdit() && !browser_.HasBlock())
+    const bool givesBack = browser_.HasPendingEdit() || browser_.ShowsResult();
+    if (!givesBack && zoomed_)
+        return ToggleZoom();
+    if (!givesBack && !browser_.HasBlock())
         findLine_->hide();
-    if (!browser_.HasPendingEdit())
+    if (!givesBack)
         browser_.SelectBlock({});
     browser_.RevertEdit();
     ShowState();
-    if (stack_->currentWidget() == zoomEdit_)
-        zoomEdit_->setPlainText(browser_.Edit().Text());
-    else
+    if (stack_->currentWidget() != zoomEdit_)
         grid_->setFocus();
 }
 
@@ -83,6 +90,10 @@ void CTableView::Paste()
     const bool isOwn = copied->hasFormat(kCellsFormat);
     if (!isOwn && !copied->hasText())
         return;
+    if (stack_->currentWidget() == zoomEdit_)
+        return zoomEdit_->paste(); // at its caret
+    if (const QString why = browser_.WhyNotEditable(); !why.isEmpty() && !browser_.HasBlock())
+        return Note(why);
     const TextRows rows = RowsOfText(isOwn ? QString::fromUtf8(copied->data(kCellsFormat)) : copied->text());
     const bool isOne = rows.size() == 1 && rows.front().size() == 1;
     if (isOne && !browser_.HasBlock() && browser_.CanEdit() && browser_.Edit().Kind() != EditorKind::Check)
@@ -123,6 +134,12 @@ void CTableView::GoTo()
     }
 }
 
+void CTableView::ChangeSettings(const TableViewSettings& settings)
+{
+    browser_.ChangeSettings(settings);
+    ShowState();
+}
+
 void CTableView::ChooseOptions()
 {
     if (!Settle(browser_.WriteEdit()))
@@ -130,7 +147,7 @@ void CTableView::ChooseOptions()
     COptionsDialog dialog(browser_.Settings(), this);
     if (dialog.exec() != QDialog::Accepted)
         return;
-    Settle(browser_.ChangeSettings(dialog.Chosen()));
+    ChangeSettings(dialog.Chosen());
     Q_EMIT settingsChanged(browser_.Settings());
 }
 

@@ -1,0 +1,339 @@
+// Walks through every window and dialog at a handheld's sizes and at a desktop's: all of it within the window, no
+// text cut without a sign and a way to read it, each control named and reached by the keyboard.
+//
+// With MIREL_PICTURES=<folder> in the environment each of them is painted there, to be looked at.
+#include "app/ui/colors_dialog.h"
+#include "app/ui/fonts_dialog.h"
+#include "app/ui/look.h"
+#include "app/ui/message_box_prompt.h"
+#include "data/filter_condition.h"
+#include "forms/form_store.h"
+#include "forms/ui/form_eng_view.h"
+#include "forms/ui/form_options_dialog.h"
+#include "platform/ui/day_chooser.h"
+#include "platform/ui/window_place.h"
+#include "resources/string_table.h"
+#include "tableview/export_draft.h"
+#include "tableview/people_fixture.h"
+#include "tableview/ui/csv_options_dialog.h"
+#include "tableview/ui/export_wizard.h"
+#include "tableview/ui/filter_dialog.h"
+#include "tableview/ui/go_to_dialog.h"
+#include "tableview/ui/options_dialog.h"
+#include "tableview/ui/query_dialog.h"
+#include "tableview/ui/record_grid.h"
+#include "tableview/ui/sort_dialog.h"
+#include "tableview/ui/statement_dialog.h"
+#include "tableview/ui/table_view.h"
+
+#include <QAbstractButton>
+#include <QAbstractItemView>
+#include <QAbstractSpinBox>
+#include <QAccessible>
+#include <QApplication>
+#include <QCheckBox>
+#include <QComboBox>
+#include <QDialogButtonBox>
+#include <QDir>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QTabWidget>
+#include <QTest>
+#include <QTimer>
+#include <QToolButton>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr QSize kUpright(240, 320);
+constexpr QSize kFlat(320, 240);
+constexpr QSize kDesktop(1100, 700);
+
+class Walk : public PeopleFixture {
+protected:
+    void SetUp() override
+    {
+        before_ = QApplication::palette();
+        ASSERT_TRUE(UsePalette(u"light"));
+    }
+    void TearDown() override
+    {
+        QApplication::setStyle(u"Fusion"_s);
+        QApplication::setPalette(before_);
+    }
+
+    static void Paint(QWidget& shown, const QString& name)
+    {
+        const QString folder = qEnvironmentVariable("MIREL_PICTURES");
+        if (!folder.isEmpty()) {
+            EXPECT_TRUE(shown.grab().save(QDir(folder).filePath(name + u".png"_s)));
+        }
+    }
+
+    // What of a widget has a name for those who do not see it: its own, its text, or the label that leads to it.
+    static QString NameOf(QWidget& widget)
+    {
+        const QAccessibleInterface* read = QAccessible::queryAccessibleInterface(&widget);
+        return read ? read->text(QAccessible::Name) : widget.accessibleName();
+    }
+
+    static bool IsPartOfAnother(const QWidget& widget)
+    {
+        const QWidget* parent = widget.parentWidget();
+        return widget.objectName().startsWith(u"qt_") || qobject_cast<const QComboBox*>(parent) ||
+               qobject_cast<const QAbstractSpinBox*>(parent) || qobject_cast<const QAbstractItemView*>(parent) ||
+               (parent && parent->inherits("QTabBar")) || (parent && parent->inherits("QLineEdit")) ||
+               widget.inherits("QTabBar") || widget.inherits("QScrollBar");
+    }
+
+    static void ExpectWithin(QWidget& part, QWidget& whole, const std::string& where)
+    {
+        const QRect place(part.mapTo(&whole, QPoint()), part.size());
+        EXPECT_GE(place.left(), 0) << where;
+        EXPECT_LE(place.right(), whole.width()) << where << ": " << place.right();
+        bool scrolls = false;
+        for (const QWidget* over = part.parentWidget(); over && over != &whole; over = over->parentWidget())
+            scrolls = scrolls || qobject_cast<const QAbstractScrollArea*>(over);
+        if (!scrolls) {
+            EXPECT_LE(place.bottom(), whole.height()) << where << ": " << place.bottom();
+        }
+    }
+
+    static void ExpectWholeText(QWidget& part, const QString& text, int widthPx, const std::string& where)
+    {
+        if (text.isEmpty() || text.contains(u'…'))
+            return;
+        EXPECT_GE(part.width() + 1, widthPx) << where << " cuts \"" << text.toStdString() << "\"";
+    }
+
+    static void ExpectReachable(QWidget& part, const std::string& where)
+    {
+        const bool button = qobject_cast<QAbstractButton*>(&part);
+        const bool operated = button || qobject_cast<QLineEdit*>(&part) || qobject_cast<QComboBox*>(&part) ||
+                              qobject_cast<QAbstractItemView*>(&part) || qobject_cast<QPlainTextEdit*>(&part);
+        const auto* line = qobject_cast<QLineEdit*>(&part);
+        if (!operated || !part.isEnabled() || (line && line->isReadOnly()))
+            return;
+        EXPECT_FALSE(NameOf(part).isEmpty()) << where << " has no name";
+        // The button of a date has its keys in the date's line.
+        const bool hasKeyElsewhere = button && part.parentWidget()->inherits("mirel::DateField");
+        EXPECT_TRUE((part.focusPolicy() & Qt::TabFocus) || hasKeyElsewhere) << where << " is out of Tab's way";
+    }
+
+    static void ExpectFits(QWidget& whole, const QString& name, QSize screen)
+    {
+        QApplication::processEvents();
+        Paint(whole, u"%1-%2x%3"_s.arg(name, QString::number(screen.width()), QString::number(screen.height())));
+        EXPECT_LE(whole.width(), screen.width()) << name.toStdString();
+        EXPECT_LE(whole.height(), screen.height()) << name.toStdString();
+        for (QWidget* part : whole.findChildren<QWidget*>()) {
+            if (!part->isVisibleTo(&whole) || part->isWindow() || IsPartOfAnother(*part))
+                continue;
+            const std::string where =
+                (name + u": "_s + QString::fromLatin1(part->metaObject()->className()) + u' ' + NameOf(*part))
+                    .toStdString();
+            ExpectWithin(*part, whole, where);
+            ExpectReachable(*part, where);
+            if (const auto* label = qobject_cast<QLabel*>(part); label && !label->wordWrap())
+                ExpectWholeText(*part, label->text(), label->sizeHint().width(), where);
+            if (const auto* box = qobject_cast<QAbstractButton*>(part); box && !qobject_cast<QToolButton*>(part))
+                ExpectWholeText(*part, box->text(),
+                                box->fontMetrics().size(Qt::TextShowMnemonic, box->text()).width() + 8, where);
+        }
+    }
+
+    // A dialog over a window of each size, as its command brings it up.
+    template <typename Make>
+    void ExpectDialogFits(const QString& name, Make make)
+    {
+        for (const QSize size : {kUpright, kFlat, kDesktop}) {
+            QWidget window;
+            window.resize(size);
+            window.show();
+            const std::unique_ptr<QDialog> dialog(make(window));
+            FillSmallWindow(*dialog, window);
+            dialog->show();
+            ExpectFits(*dialog, name, size);
+        }
+    }
+
+    void MakeLongNames()
+    {
+        Run(u"CREATE TABLE [Long names] ([The first of two very long field names, of which the end tells] Float,"
+            "[The first of two very long field names, of which the other end tells] Varchar(200),[Photo] Long Varbinary)"_s);
+        for (const QString& values :
+             {u"1234.5,'%1',NULL"_s.arg(QString(180, u'x')), u"7,NULL,NULL"_s, u"-0.125,'two\nlines',NULL"_s})
+            Run(u"INSERT INTO [Long names] VALUES(%1)"_s.arg(values));
+    }
+
+    QPalette before_;
+};
+
+TEST_F(Walk, GoesThroughTheDialogs)
+{
+    FieldLists lists(connection, path, prompt);
+    FormStore store(folder.filePath(u"walk.raf"_s));
+    ExportDraft draft(connection, path, prompt);
+    ASSERT_TRUE(draft.SetSource(u"SELECT * FROM People"_s));
+    const auto apply = [](const QString&) { return true; };
+    ExpectDialogFits(u"table-options"_s, [](QWidget& window) { return new COptionsDialog({}, &window); });
+    ExpectDialogFits(u"form-options"_s, [](QWidget& window) { return new CFormOptionsDialog({}, &window); });
+    ExpectDialogFits(u"go"_s, [](QWidget& window) { return new CGoToDialog(9999999, &window); });
+    ExpectDialogFits(u"sort"_s,
+                     [&](QWidget& window) { return new CSortDialog(lists, u"People"_s, u"Name"_s, &window); });
+    ExpectDialogFits(u"query"_s, [](QWidget& window) {
+        return new CQueryDialog({QString(200, u'q'), u"Second"_s}, &window);
+    });
+    ExpectDialogFits(u"statement"_s, [](QWidget& window) {
+        return new CStatementDialog(u"SELECT "_s + QString(5000, u'x'), &window);
+    });
+    ExpectDialogFits(u"colors"_s, [](QWidget& window) {
+        return new CColorsDialog({}, CColorsDialog::Unset::Offered, &window);
+    });
+    ExpectDialogFits(u"fonts"_s, [](QWidget& window) { return new CFontsDialog({}, &window); });
+    ExpectDialogFits(u"csv-options"_s, [](QWidget& window) { return new CCsvOptionsDialog({}, &window); });
+    ExpectDialogFits(u"export"_s,
+                     [&](QWidget& window) { return new CExportWizard(draft, u"People"_s, path, &window); });
+    for (const QString& field : {u"Name"_s, u"Born"_s, u"Member"_s}) {
+        ExpectDialogFits(u"filter-"_s + field, [&](QWidget& window) {
+            auto* dialog = new CFilterDialog(lists, u"People"_s, field, u"7/4/2001"_s, apply, &window);
+            dialog->findChild<QCheckBox*>()->setChecked(field == u"Born");
+            return dialog;
+        });
+    }
+    ExpectDialogFits(u"filter-advanced"_s, [&](QWidget& window) {
+        auto* dialog = new CFilterDialog(lists, u"People"_s, u"Name"_s, u"x"_s, apply, &window);
+        dialog->findChild<QTabWidget*>()->setCurrentIndex(1);
+        dialog->findChild<QPlainTextEdit*>()->setPlainText(u"Age >> 5"_s);
+        dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click();
+        return dialog;
+    });
+}
+
+TEST_F(Walk, GoesThroughTheTableView)
+{
+    MakeLongNames();
+    for (const QSize size : {QSize(200, 200), kUpright, kFlat, kDesktop}) {
+        CTableView view(connection, path, prompt, {});
+        view.resize(size);
+        ASSERT_TRUE(view.OpenTable(u"Long names"_s));
+        view.show();
+        auto* grid = view.findChild<RecordGrid*>();
+        const auto command = [&](Str text) {
+            for (QAction* action : view.actions()) {
+                if (action->text() == StringText(text))
+                    action->trigger();
+            }
+        };
+        ExpectFits(view, u"table"_s, size);
+        grid->setFocus();
+        QTest::keyClicks(grid, u"abc"_s);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+        ExpectFits(view, u"table-refused"_s, size);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+        command(Str::ActionFind);
+        ExpectFits(view, u"table-find"_s, size);
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+        command(Str::ActionDetail);
+        ExpectFits(view, u"table-detail"_s, size);
+        command(Str::ActionList);
+        grid->setFocus();
+        QTest::keyClick(grid, Qt::Key_Right);
+        command(Str::ZoomIn);
+        ExpectFits(view, u"table-zoom"_s, size);
+        command(Str::ZoomBack);
+        command(Str::ActionFilterBy);
+        ExpectFits(view, u"table-filtered"_s, size);
+    }
+}
+
+// Fonts of any size, the other direction of reading, the most columns and the longest names that a table has: all
+// of it is drawn, and the selection comes into sight.
+TEST_F(Walk, BearsOddFontsDirectionsAndTables)
+{
+    QStringList columns;
+    for (int i = 0; i < 2000; ++i)
+        columns += u"[%1 %2] Varchar(9)"_s.arg(QString(240, u'n'), QString::number(i));
+    Run(u"CREATE TABLE Wide (%1)"_s.arg(columns.join(u',')));
+    Run(u"INSERT INTO Wide ([%1 0]) VALUES('x')"_s.arg(QString(240, u'n')));
+    Run(u"UPDATE People SET Note='%1' WHERE Name='P2'"_s.arg(QString(1'000'000, u'm')));
+    const QFont usual = QApplication::font();
+    for (const int points : {6, 9, 36}) {
+        for (const Qt::LayoutDirection direction : {Qt::LeftToRight, Qt::RightToLeft}) {
+            QFont font = usual;
+            font.setPointSize(points);
+            QApplication::setFont(font);
+            QApplication::setLayoutDirection(direction);
+            for (const QString& table : {u"Wide"_s, u"People"_s}) {
+                CTableView view(connection, path, prompt, {.maxColumnChars = TableViewSettings::kNoColumnLimit});
+                view.resize(kUpright);
+                ASSERT_TRUE(view.OpenTable(table));
+                view.show();
+                auto* grid = view.findChild<RecordGrid*>();
+                grid->setFocus();
+                QTest::keyClick(grid, Qt::Key_End);
+                QApplication::processEvents();
+                const RecordBrowser& browser = view.Browser();
+                const QRect cell = grid->CellRect(0, browser.SelectedColumn());
+                EXPECT_TRUE(cell.intersects(grid->viewport()->rect())) << table.toStdString() << " " << points;
+                EXPECT_LE(cell.width(), grid->viewport()->width()) << table.toStdString() << " " << points;
+                Paint(view, u"odd-%1-%2-%3"_s.arg(table, QString::number(points),
+                                                  direction == Qt::LeftToRight ? u"left"_s : u"right"_s));
+            }
+        }
+    }
+    QApplication::setFont(usual);
+    QApplication::setLayoutDirection(Qt::LeftToRight);
+}
+
+TEST_F(Walk, GoesThroughTheMessageBoxes)
+{
+    MessageBoxPrompt boxes;
+    for (const QSize size : {kUpright, kFlat, kDesktop}) {
+        QWidget window;
+        window.resize(size);
+        window.show();
+        ASSERT_TRUE(QTest::qWaitForWindowActive(&window));
+        int met = 0;
+        const auto look = [&](const QString& name) {
+            QTimer::singleShot(0, &window, [&met, name, size] {
+                QWidget* box = QApplication::activeModalWidget();
+                ASSERT_TRUE(box);
+                ++met;
+                ExpectFits(*box, name, size);
+                box->close();
+            });
+        };
+        look(u"box-error"_s);
+        boxes.ShowErrorWithReason(u"Error: (80040E07)the field \"Flight Date\""_s,
+                                  u"Flight Date: not a date: 31.31.99"_s);
+        look(u"box-long"_s);
+        boxes.ShowError(QString(u"A path without a blank: "_s) + QString(3000, u'p'));
+        look(u"box-question"_s);
+        (void)boxes.AskYesNoWithNote({Str::DeleteAllReally, {u"10000"_s}}, u"Undo takes this back."_s);
+        EXPECT_EQ(met, 3);
+    }
+}
+
+TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
+{
+    QWidget window;
+    window.resize(kUpright);
+    window.show();
+    QTimer::singleShot(0, &window, [&window] {
+        QWidget* popup = QApplication::activePopupWidget();
+        ASSERT_TRUE(popup);
+        Paint(*popup, u"calendar"_s);
+        EXPECT_LE(popup->sizeHint().width(), kUpright.width());
+        EXPECT_LE(popup->sizeHint().height(), kUpright.height());
+        popup->close();
+    });
+    EXPECT_FALSE(ChooseDay(u"2/3/1499"_s, window.pos(), window));
+}
+
+} // namespace
+} // namespace mirel
