@@ -1,6 +1,7 @@
 #include "app/main_view_commands.h"
 
 #include "app/shell_commands.h"
+#include "data/table_statements.h"
 #include "forms/default_form.h"
 #include "resources/string_table.h"
 
@@ -168,7 +169,7 @@ bool MainViewCommands::DeleteSelected()
 bool MainViewCommands::DropTable(const QString& name)
 {
     return session_.Prompt().AskYesNo({Str::DropTable, {name}}) &&
-           session_.GetCatalog().ExecuteStatement(session_.Path(), u"DROP TABLE [%1]"_s.arg(name));
+           session_.GetCatalog().ExecuteStatement(session_.Path(), DropTableStatement(name));
 }
 
 bool MainViewCommands::DeleteFromStore(const MainEntry& entry)
