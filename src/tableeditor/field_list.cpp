@@ -9,7 +9,7 @@
 
 #include <algorithm>
 #include <array>
-#include <limits>
+#include <cmath>
 
 namespace mirel {
 namespace {
@@ -41,7 +41,7 @@ bool ReadSize(const QJsonValue& value, ListedField& listed)
     if (value.isNull())
         return true;
     listed.field.size = int(std::clamp(size, -1.0, double(kMaxTextSize) + 1)); // the rule of sizes refuses both
-    return size == double(qint64(std::clamp(size, -1e15, 1e15)));
+    return size == std::trunc(size);
 }
 
 bool ReadIndex(const QJsonValue& value, ListedField& listed)
