@@ -168,8 +168,37 @@ bool MainViewCommands::DeleteSelected()
 
 bool MainViewCommands::DropTable(const QString& name)
 {
-    return session_.Prompt().AskYesNo({Str::DropTable, {name}}) &&
-           session_.GetCatalog().ExecuteStatement(session_.Path(), u"DROP TABLE [%1]"_s.arg(name));
+    if (!views_->WritePending(name))
+        return false;
+    DesignRun run(session_.Connection(), session_.Path(), session_.Prompt());
+    if (run.DropTable(name) != DesignRun::Outcome::Done)
+        return false;
+    views_->TableDropped(name);
+    return true;
+}
+
+bool MainViewCommands::RenameSelected()
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry || entry->missing)
+        return false;
+    const std::optional<QString> name =
+        session_.Prompt().AskText({Str::RenameTitle, {}}, {Str::RenameLabel, {entry->name}}, entry->name);
+    if (!name)
+        return false;
+    const bool renamed = entry->kind == EntryKind::Table
+                             ? RenameTable(entry->name, *name)
+                             : Renaming(session_).RenameInStore(entry->kind, entry->name, *name);
+    Refill();
+    if (renamed)
+        state_.Select({entry->kind, name->trimmed(), entry->table, false});
+    return renamed;
+}
+
+bool MainViewCommands::RenameTable(const QString& name, const QString& newName)
+{
+    TableDesigner designer(session_.Connection(), session_.Path(), session_.Prompt(), *views_);
+    return designer.Open(name) && designer.RenameTable(newName);
 }
 
 bool MainViewCommands::DeleteFromStore(const MainEntry& entry)

@@ -2,6 +2,7 @@
 
 #include "app/database_session.h"
 #include "app/main_view_state.h"
+#include "app/renaming.h"
 #include "app/sample_database.h"
 #include "app/settings.h"
 #include "forms/form_host.h"
@@ -37,6 +38,10 @@ public:
     void RestoreLastRun(const QString& database);
     void KeepForNextRun();
 
+    // The views that are open, for what changes tables under them; must outlive this. Null: there are none.
+    void SetOpenViews(DesignHost* views) { views_ = views ? views : &noViews_; }
+    DesignHost& Views() { return *views_; }
+
     // Reads the lists of the open database anew.
     void Refill();
 
@@ -50,6 +55,7 @@ public:
     bool AddFavorite();
     bool RemoveFavorite();
     bool DeleteSelected(); // asks; on the favorites it removes the favorite alone
+    bool RenameSelected(); // asks for the name, and offers to mend what refers to the old one
 
     // On the tab in front: asks, makes the default form of the selected table and selects it; or says what must be
     // chosen first.
@@ -66,6 +72,7 @@ public:
 private:
     bool RemoveFavorite(const MainEntry& entry);
     bool DropTable(const QString& name);
+    bool RenameTable(const QString& name, const QString& newName);
     bool DeleteFromStore(const MainEntry& entry);
     void NewForm(const QString& table);
 
@@ -73,6 +80,8 @@ private:
     MainViewState& state_;
     Settings& settings_;
     SampleDatabase sample_;
+    MendingHost noViews_{session_};
+    DesignHost* views_ = &noViews_;
 };
 
 } // namespace mirel

@@ -2,6 +2,7 @@
 
 #include "app/sample_forms.h"
 #include "csvimport/csv_import.h"
+#include "data/table_statements.h"
 #include "resources/string_table.h"
 
 #include <QDir>
@@ -114,12 +115,12 @@ private:
 
     bool Index(const SampleTable& table)
     {
-        for (const QStringView field : table.indexes) {
-            if (!field.isEmpty() &&
-                !Execute(u"CREATE INDEX [%1_%2_idx] ON [%1] ([%2] ASC)"_s.arg(table.name, field)))
-                return false;
-        }
-        return true;
+        const QString name = table.name.toString();
+        return std::ranges::all_of(table.indexes, [&](QStringView indexed) {
+            const QString field = indexed.toString();
+            return field.isEmpty() ||
+                   Execute(CreateIndexStatement(name, {IndexNameOfField(name, field), {{field}}}));
+        });
     }
 
     DatabaseSession& session_;

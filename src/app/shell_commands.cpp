@@ -51,6 +51,7 @@ constexpr std::array kCommands = {
     ShellCommandDef{Open, ShellMenu::Entry, Str::CommandOpen, Str::TipOpen, u"mirel-open", u""},
     ShellCommandDef{New, ShellMenu::Entry, Str::CommandNew, Str::TipNew, u"list-add", u"Ctrl+N"},
     ShellCommandDef{Edit, ShellMenu::Entry, Str::CommandEdit, Str::TipEdit, u"document-edit", u"F2"},
+    ShellCommandDef{Rename, ShellMenu::Entry, Str::CommandRename, Str::TipRename, u"", u"Shift+F2"},
     ShellCommandDef{Delete, ShellMenu::Entry, Str::CommandDelete, Str::TipDelete, u"edit-delete", u"Del"},
 };
 
@@ -91,8 +92,8 @@ Availability AvailabilityOfNew(const MainViewState& state)
     const NewOutcome outcome = OutcomeOfNew(state);
     if (outcome.message)
         return {true, Str::TipNew};
-    if (outcome.make == EntryKind::Form)
-        return {true, Str::TipNewForm};
+    if (outcome.make == EntryKind::Form || outcome.make == EntryKind::Table)
+        return {true, ToolsOf(*outcome.make).newTip};
     return {false, outcome.make ? ToolsOf(*outcome.make).newTip : Str::TipNewFavorite};
 }
 
@@ -109,7 +110,9 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
     case ExportCsv:
         return {entry.kind != EntryKind::Form && !entry.missing, Str::TipExportCsv};
     case Edit:
-        return {false, ToolsOf(entry.kind).editTip};
+        return {entry.kind == EntryKind::Table && !entry.missing, ToolsOf(entry.kind).editTip};
+    case Rename:
+        return {!entry.missing, Str::TipRename};
     default:
         break;
     }
@@ -119,7 +122,7 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
 bool ActsOnEntry(ShellCommand id)
 {
     return id == AddFavorites || id == RemoveFavorites || id == ExportCsv || id == Open || id == Edit ||
-           id == Delete;
+           id == Rename || id == Delete;
 }
 
 } // namespace

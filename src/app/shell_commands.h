@@ -33,6 +33,7 @@ enum class ShellCommand {
     Open,
     New,
     Edit,
+    Rename,
     Delete,
 };
 

@@ -18,6 +18,9 @@ ExitStatus RunSql(Run& run);
 // import_command.cpp
 ExitStatus RunImport(Run& run);
 
+// design_command.cpp
+ExitStatus RunDesign(Run& run);
+
 // export_command.cpp
 ExitStatus RunExport(Run& run);
 

@@ -3,6 +3,7 @@
 #include "cli/run.h"
 #include "data/field_names.h"
 #include "data/provider_error.h"
+#include "data/table_statements.h"
 
 #include <array>
 #include <vector>
@@ -22,8 +23,8 @@ QString IndexWord(const QString& index, int flags)
 {
     constexpr int kDescending = 1;
     if (index.isEmpty())
-        return u"NO"_s;
-    return (flags & kDescending) != 0 ? u"DESC"_s : u"ASC"_s;
+        return WordOfIndexOrder(IndexOrder::None);
+    return WordOfIndexOrder((flags & kDescending) != 0 ? IndexOrder::Descending : IndexOrder::Ascending);
 }
 
 ResultField TextColumn(const QString& name)

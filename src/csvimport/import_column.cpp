@@ -1,6 +1,7 @@
 #include "csvimport/import_column.h"
 
 #include "data/field_names.h"
+#include "data/table_statements.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
@@ -216,12 +217,12 @@ bool CheckNewColumns(const ImportColumns& columns, UserMessage& fault)
 
 QString CreateTableStatement(const QString& table, const ImportColumns& columns)
 {
-    QStringList definitions;
+    std::vector<FieldDefinition> fields;
     for (const ImportColumn& column : columns) {
         if (!column.ignored)
-            definitions += u'[' + column.field + u"] "_s + DdlTypeOfName(NameOf(column.type), column.size);
+            fields.push_back({column.field, column.type, column.size});
     }
-    return u"CREATE TABLE ["_s + table + u"] ("_s + definitions.join(u',') + u')';
+    return CreateTableStatement(table, fields);
 }
 
 } // namespace mirel

@@ -7,8 +7,10 @@
 
 #include <QDateTime>
 #include <QFileInfo>
+#include <QHash>
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
 #include <utility>
 
@@ -124,7 +126,7 @@ bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOf
         moment = moment.addSecs(1);
     } while (QFileInfo::exists(SideFilePath(folderOfSideFiles, wanted)));
     DbRecordset statement(connection_);
-    if (!Run(statement, u"CREATE TABLE MirelSys%1 (SysParam Varchar(255))"_s.arg(wanted), database))
+    if (!Run(statement, CreateStampTableStatement(wanted), database))
         return ReadStamp(statement, database, stamp) && !stamp.isEmpty(); // another program was faster
     stamp = wanted;
     return true;
@@ -171,6 +173,38 @@ bool Catalog::FindFieldIndex(const QString& table, const QString& field, const Q
         flags = rows.ValueText(1).toInt();
     }
     return true;
+}
+
+bool Catalog::ListIndexes(const QString& table, const QString& database, std::vector<IndexDefinition>& indexes)
+{
+    constexpr int kDescending = 1;
+    constexpr int kUnique = 2;
+    indexes.clear();
+    DbRecordset rows(connection_);
+    if (!RunOrReport(prompt_, rows, u"SELECT TableID FROM MSysTables WHERE TableName="_s + QuoteText(table),
+                     database))
+        return false;
+    if (rows.IsEof())
+        return true;
+    const QString tableId = rows.ValueText(0);
+    const auto read = [&](const QString& statement, const std::function<void()>& row) {
+        bool reads = RunOrReport(prompt_, rows, statement.arg(tableId), database);
+        while (reads && !rows.IsEof()) {
+            row();
+            reads = rows.MoveNext();
+        }
+        return reads;
+    };
+    QHash<QString, QString> fields; // by their numbers
+    const bool named = read(u"SELECT FieldID,FieldName FROM MSysFields WHERE TableID=%1"_s,
+                            [&] { fields.insert(rows.ValueText(0), rows.ValueText(1)); });
+    return named && read(u"SELECT IndexName,FieldID,IndexFlags FROM MSysIndexes WHERE TableID=%1"_s, [&] {
+               const QString name = rows.ValueText(0);
+               const int flags = rows.ValueText(2).toInt();
+               if (indexes.empty() || indexes.back().name != name)
+                   indexes.push_back({name, {}, (flags & kUnique) != 0});
+               indexes.back().parts.push_back({fields.value(rows.ValueText(1)), (flags & kDescending) != 0});
+           });
 }
 
 bool Catalog::ExecuteStatement(const QString& database, const QString& statement)

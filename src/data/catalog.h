@@ -1,10 +1,13 @@
 #pragma once
 
 #include "data/db_connection.h"
+#include "data/table_statements.h"
 #include "platform/user_prompt.h"
 
 #include <QString>
 #include <QStringList>
+
+#include <vector>
 
 namespace mirel {
 
@@ -36,6 +39,8 @@ public:
     // index the call succeeds too, with an empty name and flags 0.
     bool FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
                         int& flags);
+    // All indexes of a table, each with its fields in their order.
+    bool ListIndexes(const QString& table, const QString& database, std::vector<IndexDefinition>& indexes);
     // Runs a statement that yields no rows.
     bool ExecuteStatement(const QString& database, const QString& statement);
 

@@ -1,5 +1,7 @@
 #include "data/db_transaction.h"
 
+#include "data/provider_error.h"
+
 namespace mirel {
 
 bool DbTransaction::Begin()
@@ -17,6 +19,12 @@ bool DbTransaction::Commit()
     context_ = transaction_ ? transaction_->ErrorContext() : QString();
     transaction_.reset();
     return !Failed(lastResult_);
+}
+
+void DbTransaction::Report(UserPrompt& prompt) const
+{
+    if (Failed(lastResult_))
+        prompt.ShowError(ProviderErrorText(nullptr, lastResult_, context_));
 }
 
 } // namespace mirel

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "data/db_connection.h"
+#include "platform/user_prompt.h"
 
 #include <QString>
 
@@ -26,6 +27,8 @@ public:
 
     Hr LastResult() const { return lastResult_; }
     const QString& ErrorContext() const { return context_; }
+    // Why Begin or Commit failed, as every failure of the provider is told. Nothing when neither did.
+    void Report(UserPrompt& prompt) const;
 
 private:
     DbConnection& connection_;

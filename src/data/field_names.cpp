@@ -44,6 +44,23 @@ bool TypeNameOfField(FieldType type, QString& name)
     return true;
 }
 
+FieldType FieldTypeOfName(QStringView name)
+{
+    if (name.compare(u"Boolean", Qt::CaseInsensitive) == 0)
+        return FieldType::YesNo;
+    const auto row = std::ranges::find_if(
+        kTypes, [name](const TypeRow& each) { return name.compare(Text(each.name), Qt::CaseInsensitive) == 0; });
+    return row == kTypes.end() ? FieldType::None : row->type;
+}
+
+QStringList FieldTypeNames()
+{
+    QStringList names;
+    for (const TypeRow& row : kTypes)
+        names += Text(row.name);
+    return names;
+}
+
 QString DdlTypeOfName(QStringView name, int size)
 {
     if (name == u"Boolean")

@@ -6,6 +6,7 @@
 #include <charconv>
 #include <cmath>
 #include <limits>
+#include <optional>
 
 namespace mirel {
 namespace {
@@ -81,19 +82,41 @@ bool Fits(qint64 number, FieldType type)
                : number >= std::numeric_limits<qint32>::min() && number <= std::numeric_limits<qint32>::max();
 }
 
+// The whole text as a number: as numbers are shown here, and only then as the user's locale writes them, with its
+// groups of three. "12.7" is no integer, and "abc" no 0: what was typed would be lost.
+std::optional<qint64> WholeInteger(const QString& text)
+{
+    if (const NumberRead<qint64> read = ReadNumber<qint64>(text); read.whole)
+        return read.number;
+    bool isNumber = false;
+    const qint64 number = UserLocale::Current().Locale().toLongLong(text.trimmed(), &isNumber);
+    return isNumber ? std::optional(number) : std::nullopt;
+}
+
+std::optional<double> WholeDouble(const QString& text)
+{
+    NumberRead<double> read = ReadNumber<double>(text);
+    if (!read.whole && read.fits)
+        read.number = UserLocale::Current().Locale().toDouble(text.trimmed(), &read.whole);
+    return read.whole && std::isfinite(read.number) ? std::optional(read.number) : std::nullopt;
+}
+
 Value TypedInteger(const QString& text, FieldType type)
 {
-    const NumberRead<qint64> read = ReadNumber<qint64>(text);
-    if (!read.fits || !Fits(read.number, FieldType::Integer))
-        return Value::Text(text); // too large for any integer field: the store refuses it as such
-    return type == FieldType::SmallInt && Fits(read.number, type) ? Value::SmallInt(qint16(read.number))
-                                                                  : Value::Integer(qint32(read.number));
+    const std::optional<qint64> number = WholeInteger(text);
+    if (!number)
+        return Value::Text(text);
+    if (type == FieldType::SmallInt && Fits(*number, type))
+        return Value::SmallInt(qint16(*number));
+    // One that is too large for the field is passed on as its digits: the store knows what the field takes.
+    return Fits(*number, FieldType::Integer) ? Value::Integer(qint32(*number))
+                                             : Value::Text(QString::number(*number));
 }
 
 Value TypedDouble(const QString& text)
 {
-    const NumberRead<double> read = ReadNumber<double>(text);
-    return read.fits && std::isfinite(read.number) ? Value::Double(read.number) : Value::Text(text);
+    const std::optional<double> number = WholeDouble(text);
+    return number ? Value::Double(*number) : Value::Text(text);
 }
 
 Value TypedDate(const QString& text)
@@ -147,13 +170,11 @@ bool IsKeptWhole(const QString& text, FieldType type, int size)
     if (text.isEmpty())
         return true;
     if (IsInteger(type)) {
-        const NumberRead<qint64> read = ReadNumber<qint64>(text);
-        return read.whole && Fits(read.number, type);
+        const std::optional<qint64> number = WholeInteger(text);
+        return number && (size == kWideIntegerSize || Fits(*number, type));
     }
-    if (type == FieldType::Double) {
-        const NumberRead<double> read = ReadNumber<double>(text);
-        return read.whole && std::isfinite(read.number);
-    }
+    if (type == FieldType::Double)
+        return WholeDouble(text).has_value();
     if (type == FieldType::Date)
         return UserLocale::Current().ParseDateTime(text).has_value();
     return size < 0 || text.size() <= size;

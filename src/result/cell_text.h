@@ -27,9 +27,9 @@ constexpr bool IsRightAligned(FieldType type)
     return IsNumber(type);
 }
 
-// What a text that the user typed stores in a field of that type: nothing is NULL; an integer is the digits in
-// front, 0 when there are none; a double likewise; a date as the user writes it. A text that is no date, and a
-// number that does not fit, are passed on as they are, for the store to refuse. Not for Yes/No.
+// What a text that the user typed stores in a field of that type: nothing is NULL; a number is the whole text, as
+// numbers are shown here or as the user's locale writes them; a date as the user writes it. What reads as neither,
+// and a number that does not fit, are passed on as text, for the store to refuse. Not for Yes/No.
 Value TypedValue(const QString& text, FieldType type);
 
 // Whether TypedValue keeps all of the text: what an editor marks before anything is written. `size` is the

@@ -159,6 +159,25 @@ TEST_F(MainViewCommandsTest, DeletingATableTakesItsFavoriteAlong)
     EXPECT_TRUE(program_->Names(MainTab::Favorites).isEmpty());
 }
 
+TEST_F(MainViewCommandsTest, ARenamedEntryStaysSelectedAndAFavorite)
+{
+    ASSERT_TRUE(MakeShop());
+    program_->SelectOn(MainTab::Table, u"Birds");
+    ASSERT_TRUE(program_->commands.AddFavorite());
+    prompt_.texts = {std::nullopt, u"Order Details"_s, u" Bees "_s};
+    EXPECT_FALSE(program_->commands.RenameSelected()) << "Cancel";
+    prompt_.answers = {true};
+    EXPECT_FALSE(program_->commands.RenameSelected()) << "taken";
+    EXPECT_EQ(program_->state.Selected()->name, u"Birds"_s);
+    prompt_.answers = {true};
+    EXPECT_TRUE(program_->commands.RenameSelected());
+    EXPECT_EQ(prompt_.questions.last(),
+              u"\"Birds\" is used here:\r\nFavorites\r\nShall all of these say \"Bees\" from now on?"_s);
+    EXPECT_EQ(program_->state.Selected()->name, u"Bees"_s);
+    EXPECT_EQ(program_->Names(MainTab::Favorites), QStringList{u"Bees"_s});
+    EXPECT_FALSE(program_->state.Entries(MainTab::Favorites)[0].missing);
+}
+
 TEST_F(MainViewCommandsTest, DeletingAFavoriteKeepsTheTable)
 {
     ASSERT_TRUE(MakeShop());

@@ -23,9 +23,13 @@ namespace {
 
 constexpr std::array kEntryButtons = {ShellCommand::Open, ShellCommand::New, ShellCommand::Edit,
                                       ShellCommand::Delete};
-constexpr std::array kPopupCommands = {ShellCommand::Open,         ShellCommand::Edit,
-                                       ShellCommand::AddFavorites, ShellCommand::RemoveFavorites,
-                                       ShellCommand::Delete,       ShellCommand::New};
+constexpr std::array kPopupCommands = {ShellCommand::Open,
+                                       ShellCommand::Edit,
+                                       ShellCommand::Rename,
+                                       ShellCommand::AddFavorites,
+                                       ShellCommand::RemoveFavorites,
+                                       ShellCommand::Delete,
+                                       ShellCommand::New};
 
 QStringView IconOf(EntryKind kind)
 {

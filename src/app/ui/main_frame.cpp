@@ -6,12 +6,14 @@
 #include "app/ui/display_look.h"
 #include "app/ui/keys_dialog.h"
 #include "app/ui/lumo_view.h"
+#include "app/ui/open_views.h"
 #include "app/ui/shell_actions.h"
 #include "forms/ui/form_eng_view.h"
 #include "platform/ui/file_choice.h"
 #include "platform/ui/menu_keys.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
+#include "tableeditor/ui/table_dialog.h"
 #include "tableview/ui/export_wizard.h"
 #include "tableview/ui/table_view.h"
 
@@ -75,7 +77,10 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     , profile_(profile)
     , actions_(new ShellActions(this))
     , view_(new CLumoView(state, *actions_, this))
+    , openViews_(std::make_unique<OpenViews>(
+          session, OpenViews::Lists{[this] { return Tables(); }, [this] { return Forms(); }}))
 {
+    commands.SetOpenViews(openViews_.get());
     MakeMenus();
     setCentralWidget(view_);
     setAcceptDrops(true);
@@ -87,6 +92,11 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     ShowState();
     ShowLook();
     view_->setFocus();
+}
+
+CMainFrame::~CMainFrame()
+{
+    commands_.SetOpenViews(nullptr);
 }
 
 void CMainFrame::MakeMenus()
@@ -188,7 +198,17 @@ void CMainFrame::Run(ShellCommand id)
         }
         return;
     case ShellCommand::New:
-        commands_.New();
+        if (OutcomeOfNew(state_).make == EntryKind::Table)
+            DesignTable({});
+        else
+            commands_.New();
+        break;
+    case ShellCommand::Edit:
+        if (const std::optional<MainEntry> entry = state_.Selected(); entry && entry->kind == EntryKind::Table)
+            DesignTable(entry->name);
+        break;
+    case ShellCommand::Rename:
+        commands_.RenameSelected();
         break;
     case ShellCommand::Delete:
         commands_.DeleteSelected();
@@ -205,10 +225,19 @@ void CMainFrame::Run(ShellCommand id)
         return;
     case ShellCommand::ImportCsv:
     case ShellCommand::Help:
-    case ShellCommand::Edit:
         return; // disabled: not built yet
     }
     ShowState();
+}
+
+void CMainFrame::DesignTable(const QString& table)
+{
+    TableDesigner designer(session_.Connection(), session_.Path(), session_.Prompt(), *openViews_);
+    if (table.isEmpty() || designer.Open(table))
+        CTableDialog(designer, this).exec();
+    commands_.Refill();
+    if (!designer.IsNew() && state_.Tab() == MainTab::Table)
+        state_.Select({EntryKind::Table, designer.Table(), {}, false});
 }
 
 void CMainFrame::ChooseLayout(ShellCommand id)

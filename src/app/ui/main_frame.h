@@ -6,12 +6,15 @@
 
 #include <QMainWindow>
 
+#include <memory>
+
 class QMenu;
 
 namespace mirel {
 
 class CFormEngView;
 class CLumoView;
+class OpenViews;
 class CTableView;
 class ShellActions;
 
@@ -24,6 +27,7 @@ class CMainFrame : public QMainWindow {
 public:
     CMainFrame(DatabaseSession& session, MainViewState& state, MainViewCommands& commands, Settings& settings,
                Profile& profile);
+    ~CMainFrame() override;
 
     // Shows the state as it is now, after somebody else changed it.
     void ShowState();
@@ -45,6 +49,7 @@ private:
     void FillRecentMenu();
     void Run(ShellCommand id);
     void ChooseLayout(ShellCommand id);
+    void DesignTable(const QString& table); // empty: a new one
     void ShowLook();
     QString WidthsKey(const QString& statement) const;
     void KeepWidths(const CTableView& table);
@@ -69,6 +74,7 @@ private:
     Profile& profile_;
     ShellActions* actions_;
     CLumoView* view_;
+    std::unique_ptr<OpenViews> openViews_;
     QMenu* recentMenu_ = nullptr;
 };
 

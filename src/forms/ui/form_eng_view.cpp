@@ -120,6 +120,13 @@ bool CFormEngView::Open()
     return opened;
 }
 
+void CFormEngView::RunAgain()
+{
+    if (form_.HasResult())
+        (void)form_.RunAgain();
+    ShowState();
+}
+
 QSize CFormEngView::PreferredSize() const
 {
     const QSize form = (QSizeF(surface_->FormSize()) * kPreferredScale).toSize();

@@ -51,6 +51,8 @@ public:
     // A window for which the whole form is in sight.
     QSize PreferredSize() const;
     void ChangeSettings(const FormViewSettings& settings);
+    // When others have changed the structure of what it shows.
+    void RunAgain();
 
 Q_SIGNALS:
     void formCalled(const mirel::FormCall& call);                  // CALL FORM: to run in a window of its own

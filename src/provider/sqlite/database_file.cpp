@@ -320,6 +320,7 @@ void DatabaseFile::RollBackTransaction()
     if (--depth_ > 0)
         return;
     ++rollbacks_;
+    schemaVersion_ = -1; // the next change of the structure may get the number of one that is taken back
     if (!InTransaction())
         return;
     (void)Execute(isJoined_ ? "ROLLBACK TO changes" : "ROLLBACK");

@@ -20,6 +20,8 @@
 #include <QStackedWidget>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 namespace mirel {
 namespace {
 
@@ -171,6 +173,29 @@ bool CTableView::OpenStatement(const QString& title, const QString& statement)
     SetTitle(title);
     const WaitCursor waiting;
     return Settle(browser_.Open(statement));
+}
+
+bool CTableView::Shows(const QString& table) const
+{
+    return std::ranges::any_of(browser_.Fields(), [&table](const ResultField& field) {
+        return field.table.compare(table, Qt::CaseInsensitive) == 0;
+    });
+}
+
+bool CTableView::RunAgain()
+{
+    const WaitCursor waiting;
+    return Settle(browser_.RunAgain());
+}
+
+bool CTableView::RunRenamed(const QString& title, const std::function<QString(const QString&)>& renamed)
+{
+    const WaitCursor waiting;
+    const QString base = browser_.BaseStatement();
+    const QString current = browser_.Statement();
+    SetTitle(title);
+    const bool opened = browser_.Open(renamed(base)) && (current == base || browser_.Rewrite(renamed(current)));
+    return Settle(opened);
 }
 
 void CTableView::SetLook(const ViewLook& look)

@@ -10,6 +10,8 @@
 #include <QMainWindow>
 #include <QTimer>
 
+#include <functional>
+
 class QAction;
 class QMenu;
 class QStackedWidget;
@@ -50,6 +52,13 @@ public:
 
     // Options that were confirmed in another view.
     void ChangeSettings(const TableViewSettings& settings);
+    // For those who change the structure of what it shows.
+    const QString& Title() const { return title_; }
+    bool Shows(const QString& table) const;
+    bool WritePending() { return Settle(browser_.WriteEdit()); } // false: it was refused, and why was told
+    bool RunAgain();
+    // The same when names have become others: `renamed` makes a statement say the new ones.
+    bool RunRenamed(const QString& title, const std::function<QString(const QString&)>& renamed);
 
     void SetLook(const ViewLook& look);
     ColumnWidths WidthsByHand() const;
