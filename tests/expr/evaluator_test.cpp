@@ -287,7 +287,7 @@ TEST_F(Expressions, MatchPatterns)
                       {u"[Empty] LIKE '%%'"_s, u"1"_s},
                       {u"[Empty] LIKE ''"_s, u"0"_s},
                       {u"[Qty] LIKE '4%'"_s, u"0"_s},
-                      {u"[Qty] LIKE '%'"_s, u"0"_s}, // a number has no text to match
+                      {u"[Qty] LIKE '%%'"_s, u"0"_s}, // a number has no text to match
                       {u"'%' LIKE 5"_s, u"0"_s},
                       {u"NOT [Name] LIKE 'X%'"_s, u"1"_s}});
 }

@@ -4,6 +4,9 @@
 #include "support/test_database.h"
 #include "tableeditor/table_designer.h"
 
+#include <algorithm>
+#include <cstring>
+
 namespace mirel {
 
 // A database with a table of records, and what is needed to see that a change of its structure kept them.
@@ -38,7 +41,10 @@ protected:
         DbRecordset rows(connection_);
         EXPECT_TRUE(Open(rows, statement)) << statement.toStdString();
         while (!rows.IsEof()) {
-            QStringList texts = {QString::fromLatin1(rows.IdInTable().Key().toHex())};
+            qint64 rowId = 0;
+            const QByteArray key = rows.IdInTable().Key();
+            memcpy(&rowId, key.constData(), std::min(size_t(key.size()), sizeof rowId));
+            QStringList texts = {QString::number(rowId)};
             for (int field = 0; field < rows.FieldCount(); ++field)
                 texts += rows.FieldValue(field).IsNull() ? QStringLiteral("NULL") : rows.ValueText(field);
             records += texts.join(QLatin1Char('|'));

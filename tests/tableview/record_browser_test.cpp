@@ -115,7 +115,7 @@ TEST_F(Browser, WritesAnEditWhenTheSelectionLeaves)
         QString stored;
     } rows[] = {
         {u"Name"_s, u"O'Brien"_s, u"O'Brien"_s, u"O'Brien"_s},
-        {u"Age"_s, u"12.7"_s, u"12"_s, u"12"_s},
+        {u"Age"_s, u"1,234"_s, u"1234"_s, u"1234"_s},
         {u"Age"_s, u""_s, u""_s, u""_s},
         {u"Born"_s, u"2001-12-31 9:05"_s, u"12/31/2001 9:05:00 AM"_s, u"12/31/2001 9:05:00 AM"_s},
         {u"Note"_s, longNote + u'!', longNote.left(50) + u'~', longNote + u'!'},
