@@ -45,50 +45,90 @@ DatabaseSession::~DatabaseSession()
 
 bool DatabaseSession::Open(const QString& path)
 {
-    Close();
+    if (path.isEmpty() || IsCurrent(path))
+        Close();
     if (path.isEmpty())
         return true;
-    path_ = FullPath(path);
-    if (!FindOrMakeStamp()) {
-        Close();
+    std::optional<OpenedDatabase> opened = Prepare(path);
+    if (!opened)
         return false;
-    }
-    LoadStore();
-    if (!stamp_.isEmpty()) {
-        const QByteArray file = ReadWholeFile(folder_.FavoritesFile()).value_or(QByteArray());
-        favorites_ = FavoritesOf(file, stamp_);
-    }
-    settings_.AddRecentDatabase(path_); // a profile that cannot be written costs the list of recent ones alone
+    Adopt(std::move(*opened));
     return true;
 }
 
-bool DatabaseSession::FindOrMakeStamp()
+std::optional<OpenedDatabase> DatabaseSession::Prepare(const QString& path)
 {
-    if (!catalog_.FindDatabaseStamp(path_, stamp_))
-        return false;
-    if (!stamp_.isEmpty() || !catalog_.EnsureSystemTable(path_, folder_.FormsFolder(), stamp_))
-        return true;
-    // Another program may have had the same thought: both then go by the older stamp.
-    return catalog_.FindDatabaseStamp(path_, stamp_);
+    OpenedDatabase opened;
+    opened.path = FullPath(path);
+    opened.store = std::make_unique<FormStore>();
+    if (!FindOrMakeStamp(opened.path, opened.stamp)) {
+        Dismiss(opened);
+        return std::nullopt;
+    }
+    LoadStore(opened);
+    if (!opened.stamp.isEmpty()) {
+        const QByteArray file = ReadWholeFile(folder_.FavoritesFile()).value_or(QByteArray());
+        opened.favorites = FavoritesOf(file, opened.stamp);
+    }
+    return opened;
 }
 
-void DatabaseSession::LoadStore()
+void DatabaseSession::Adopt(OpenedDatabase opened)
 {
-    if (stamp_.isEmpty())
+    if (!IsCurrent(opened.path))
+        Close();
+    path_ = std::move(opened.path);
+    stamp_ = std::move(opened.stamp);
+    sideFile_ = std::move(opened.sideFile);
+    favorites_ = std::move(opened.favorites);
+    store_ = std::move(opened.store);
+    settings_.AddRecentDatabase(path_); // a profile that cannot be written costs the list of recent ones alone
+}
+
+void DatabaseSession::Dismiss(const OpenedDatabase& opened)
+{
+    if (!IsCurrent(opened.path) && connection_.Provider())
+        connection_.Provider()->CloseDatabase(opened.path);
+}
+
+bool DatabaseSession::IsCurrent(const QString& path) const
+{
+    return IsOpen() && SameFile(FullPath(path), path_);
+}
+
+void DatabaseSession::TellRecordsChanged()
+{
+    for (SessionListener* listener : std::vector(listeners_))
+        listener->RecordsChanged();
+}
+
+bool DatabaseSession::FindOrMakeStamp(const QString& path, QString& stamp)
+{
+    if (!catalog_.FindDatabaseStamp(path, stamp))
+        return false;
+    if (!stamp.isEmpty() || !catalog_.EnsureSystemTable(path, folder_.FormsFolder(), stamp))
+        return true;
+    // Another program may have had the same thought: both then go by the older stamp.
+    return catalog_.FindDatabaseStamp(path, stamp);
+}
+
+void DatabaseSession::LoadStore(OpenedDatabase& opened)
+{
+    if (opened.stamp.isEmpty())
         return;
     QDir().mkpath(folder_.FormsFolder());
-    sideFile_ = SideFilePath(folder_.FormsFolder(), stamp_);
-    store_ = std::make_unique<FormStore>(sideFile_);
-    if (store_->Load())
+    opened.sideFile = SideFilePath(folder_.FormsFolder(), opened.stamp);
+    opened.store = std::make_unique<FormStore>(opened.sideFile);
+    if (opened.store->Load())
         return;
-    if (!QFileInfo::exists(sideFile_)) {
-        if (!store_->Save())
-            prompt_.ShowError(store_->LastError());
+    if (!QFileInfo::exists(opened.sideFile)) {
+        if (!opened.store->Save())
+            prompt_.ShowError(opened.store->LastError());
         return;
     }
     // It is there and cannot be read now: an empty store in its place would cost the user's forms.
-    prompt_.ShowError(store_->LastError());
-    store_ = std::make_unique<FormStore>();
+    prompt_.ShowError(opened.store->LastError());
+    opened.store = std::make_unique<FormStore>();
 }
 
 void DatabaseSession::Close()
@@ -115,7 +155,7 @@ bool DatabaseSession::Drop(const QString& path)
     if (!catalog_.FindDatabaseStamp(full, stamp))
         return false;
     const QString current = path_;
-    const bool isCurrent = IsOpen() && SameFile(full, current);
+    const bool isCurrent = IsCurrent(full);
     if (isCurrent)
         Close();
     if (connection_.Provider())

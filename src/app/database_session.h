@@ -11,8 +11,26 @@
 #include <QStringList>
 
 #include <memory>
+#include <optional>
+#include <vector>
 
 namespace mirel {
+
+// A database that was opened and is not yet the session's.
+struct OpenedDatabase {
+    QString path;
+    QString stamp;
+    QString sideFile;
+    QStringList favorites;
+    std::unique_ptr<FormStore> store;
+};
+
+// Hears at once what changes in the session's database, whoever changed it here.
+class SessionListener {
+public:
+    virtual ~SessionListener() = default;
+    virtual void RecordsChanged() = 0;
+};
 
 // The one database that is open in the program, with what belongs to it: its stamp, the side file with its
 // forms and saved queries, its favourites. The window and the command line open databases through this class.
@@ -24,10 +42,17 @@ public:
     ~DatabaseSession();
     Q_DISABLE_COPY_MOVE(DatabaseSession)
 
-    // Closes the current database and opens `path`; an empty path only closes. A database that has no stamp
-    // gets one with its first opening; one that cannot be written is opened without stamp and store. False,
-    // with nothing open and the reason reported, when the file is no database.
+    // Opens `path` and closes the database before it; an empty path only closes. A database that has no stamp
+    // gets one with its first opening; one that cannot be written is opened without stamp and store. When the file
+    // is no database: false, the reason is reported, and the current one stays open.
     bool Open(const QString& path);
+    // The two halves of Open, for whoever has something to close between them. What is neither adopted nor
+    // dismissed keeps its file open.
+    std::optional<OpenedDatabase> Prepare(const QString& path);
+    void Adopt(OpenedDatabase opened);
+    void Dismiss(const OpenedDatabase& opened);
+    // Whether `path` names the file that is open.
+    bool IsCurrent(const QString& path) const;
     // Results that are open on the database end with it.
     void Close();
     // CREATE DATABASE, then Open. On failure the current database stays open.
@@ -53,9 +78,15 @@ public:
     DbConnection& Connection() { return connection_; }
     UserPrompt& Prompt() { return prompt_; }
 
+    // Each must be removed before it goes.
+    void AddListener(SessionListener& listener) { listeners_.push_back(&listener); }
+    void RemoveListener(SessionListener& listener) { std::erase(listeners_, &listener); }
+    // Whoever wrote records calls this.
+    void TellRecordsChanged();
+
 private:
-    bool FindOrMakeStamp();
-    void LoadStore();
+    bool FindOrMakeStamp(const QString& path, QString& stamp);
+    void LoadStore(OpenedDatabase& opened);
     bool HasKnownCopy(const QString& path, const QString& stamp);
 
     DbConnection& connection_;
@@ -68,6 +99,7 @@ private:
     QString sideFile_;
     QStringList favorites_;
     std::unique_ptr<FormStore> store_;
+    std::vector<SessionListener*> listeners_;
 };
 
 } // namespace mirel

@@ -22,6 +22,16 @@ std::vector<MainEntry> EntriesOf(const std::vector<Record>& records, EntryKind k
     return entries;
 }
 
+// For what nobody asked for: when it fails, nothing is told.
+class SilentPrompt : public UserPrompt {
+public:
+    bool AskYesNo(const UserMessage&) override { return false; }
+    void Show(const UserMessage&) override {}
+    void ShowError(const QString&) override {}
+    std::optional<QString> AskText(const UserMessage&, const UserMessage&, const QString&) override { return {}; }
+    std::unique_ptr<Progress> StartProgress(const UserMessage&, qint64) override { return {}; }
+};
+
 // Where the selection of each tab stands in the profile, and the tab's name there.
 struct TabMemory {
     MainTab tab;
@@ -62,60 +72,111 @@ void MainViewCommands::KeepForNextRun()
     settings_.SetText(Setting::ActiveDb, session_.Path());
 }
 
+bool MainViewCommands::ReadContents(UserPrompt& prompt, DatabaseContents& contents)
+{
+    contents.path = session_.Path();
+    if (!session_.IsOpen())
+        return true;
+    QStringList tables;
+    if (!Catalog(session_.Connection(), prompt).ListTables(session_.Path(), tables))
+        return false;
+    for (const QString& table : std::as_const(tables))
+        contents.tables.push_back({EntryKind::Table, table, {}, false});
+    contents.forms = EntriesOf(session_.Store().Forms(), EntryKind::Form);
+    contents.queries = EntriesOf(session_.Store().Queries(), EntryKind::Query);
+    for (const QString& text : session_.Favorites()) {
+        if (const std::optional<MainEntry> favorite = FavoriteOfText(text))
+            contents.favorites.push_back(*favorite);
+    }
+    return true;
+}
+
 void MainViewCommands::Refill()
 {
     // Also now, not at the end alone: a program that is killed comes back to its database.
     if (settings_.Text(Setting::ActiveDb) != session_.Path())
         settings_.SetText(Setting::ActiveDb, session_.Path());
     DatabaseContents contents;
-    contents.path = session_.Path();
-    if (session_.IsOpen()) {
-        QStringList tables;
-        session_.ListTables(tables);
-        for (const QString& table : std::as_const(tables))
-            contents.tables.push_back({EntryKind::Table, table, {}, false});
-        contents.forms = EntriesOf(session_.Store().Forms(), EntryKind::Form);
-        contents.queries = EntriesOf(session_.Store().Queries(), EntryKind::Query);
-        for (const QString& text : session_.Favorites()) {
-            if (const std::optional<MainEntry> favorite = FavoriteOfText(text))
-                contents.favorites.push_back(*favorite);
-        }
-    }
+    (void)ReadContents(session_.Prompt(), contents);
     state_.Show(std::move(contents));
+}
+
+bool MainViewCommands::RefillIfChanged()
+{
+    SilentPrompt silent;
+    DatabaseContents contents;
+    return ReadContents(silent, contents) && state_.ShowIfChanged(std::move(contents));
 }
 
 bool MainViewCommands::OpenDatabase(const QString& path)
 {
-    const bool opened = session_.Open(path);
+    if (session_.IsCurrent(path) && QFileInfo::exists(path)) {
+        Refill();
+        return true;
+    }
+    std::optional<OpenedDatabase> opened = session_.Prepare(path);
     if (!opened && !QFileInfo::exists(path))
         settings_.ForgetDatabase(path);
+    return opened && TakeOver(std::move(*opened));
+}
+
+bool MainViewCommands::TakeOver(OpenedDatabase opened)
+{
+    if (host_ && !host_->MayCloseViews()) {
+        session_.Dismiss(opened);
+        return false;
+    }
+    if (host_)
+        host_->CloseViews();
+    session_.Adopt(std::move(opened));
     Refill();
-    return opened;
+    return true;
 }
 
 bool MainViewCommands::NewDatabase(const QString& path)
 {
     const QString file = QFileInfo(path).suffix().isEmpty() ? path + u".cdb"_s : path;
-    const bool created = session_.Create(file);
-    Refill();
-    return created;
+    if (!session_.GetCatalog().ExecuteStatement({}, u"CREATE DATABASE "_s + QuoteText(file)))
+        return false;
+    std::optional<OpenedDatabase> opened = session_.Prepare(file);
+    if (opened && TakeOver(std::move(*opened)))
+        return true;
+    (void)session_.Drop(file); // the user stays where he is
+    return false;
 }
 
 bool MainViewCommands::DeleteDatabase(const QString& path)
 {
+    if (!QFileInfo(path).isFile())
+        return false; // nothing was chosen
     UserPrompt& prompt = session_.Prompt();
-    if (!prompt.AskYesNo({Str::DeleteDatabase, {path}}) || !prompt.AskYesNo({Str::DeleteDatabaseReally, {path}}))
+    QString stamp;
+    if (!session_.GetCatalog().FindDatabaseStamp(path, stamp) || !prompt.AskYesNo({Str::DeleteDatabase, {path}}) ||
+        !prompt.AskYesNo({Str::DeleteDatabaseReally, {path}}))
         return false;
+    const bool closes = host_ && session_.IsCurrent(path);
+    if (closes && !host_->MayCloseViews())
+        return false;
+    const ViewList before = closes ? host_->CloseViews() : ViewList{};
     const bool dropped = session_.Drop(path);
     Refill();
+    if (!dropped && closes)
+        host_->OpenAgain(before);
     return dropped;
 }
 
 bool MainViewCommands::OpenSample()
 {
-    const bool opened = sample_.Open(session_);
-    Refill();
-    return opened;
+    if (session_.IsCurrent(sample_.Path()))
+        return true;
+    const bool isNew = !QFileInfo::exists(sample_.Path());
+    if (!sample_.Provide(session_) || !OpenDatabase(sample_.Path()))
+        return false;
+    if (isNew) {
+        sample_.Furnish(session_);
+        Refill();
+    }
+    return true;
 }
 
 bool MainViewCommands::AddFavorite()
@@ -153,15 +214,15 @@ bool MainViewCommands::RemoveFavorite(const MainEntry& entry)
 bool MainViewCommands::DeleteSelected()
 {
     const std::optional<MainEntry> entry = state_.Selected();
-    if (!entry)
+    if (!entry || state_.Tab() == MainTab::Favorites)
         return false;
-    if (state_.Tab() == MainTab::Favorites)
-        return RemoveFavorite(*entry);
     const bool deleted = entry->kind == EntryKind::Table ? DropTable(entry->name) : DeleteFromStore(*entry);
     if (deleted) {
         if (state_.IsFavorite(*entry))
             RemoveFavorite(*entry);
         Refill();
+        if (host_ && entry->kind == EntryKind::Table)
+            host_->CloseViewOf({entry->kind, entry->name});
     }
     return deleted;
 }
@@ -246,15 +307,18 @@ void MainViewCommands::NewForm(const QString& table)
 std::optional<TableRequest> MainViewCommands::RequestOfSelected() const
 {
     const std::optional<MainEntry> entry = state_.Selected();
-    if (!entry || entry->missing)
-        return std::nullopt;
-    switch (entry->kind) {
+    return entry && !entry->missing ? RequestOf({entry->kind, entry->name}) : std::nullopt;
+}
+
+std::optional<TableRequest> MainViewCommands::RequestOf(const ViewKey& view) const
+{
+    switch (view.kind) {
     // Never the bare name: a filter appends its WHERE to the statement.
     case EntryKind::Table:
-        return TableRequest{entry->name, u"SELECT * FROM "_s + FieldReference(entry->name), entry->name};
+        return TableRequest{view.name, u"SELECT * FROM "_s + FieldReference(view.name), view.name};
     case EntryKind::Query:
-        if (const QueryDef* query = session_.Store().FindQuery(entry->name))
-            return TableRequest{entry->name, query->text.Text(), entry->table};
+        if (const QueryDef* query = session_.Store().FindQuery(view.name))
+            return TableRequest{view.name, query->text.Text(), query->tableName.Text(), EntryKind::Query};
         break;
     case EntryKind::Form:
         break;

@@ -48,16 +48,25 @@ std::optional<MainEntry> FavoriteOfText(QStringView text)
 
 void MainViewState::Show(DatabaseContents contents)
 {
-    contents_ = std::move(contents);
-    search_.clear();
-    for (MainEntry& favorite : contents_.favorites) {
-        const auto tab = favorite.kind == EntryKind::Table  ? MainTab::Table
-                         : favorite.kind == EntryKind::Form ? MainTab::Form
-                                                            : MainTab::Query;
-        const std::optional<MainEntry> target = Find(tab, favorite.name);
-        favorite.missing = !target;
-        favorite.table = target ? target->table : QString();
+    (void)ShowIfChanged(std::move(contents));
+}
+
+bool MainViewState::ShowIfChanged(DatabaseContents contents)
+{
+    for (MainEntry& favorite : contents.favorites) {
+        const std::vector<MainEntry>& kind = favorite.kind == EntryKind::Table  ? contents.tables
+                                             : favorite.kind == EntryKind::Form ? contents.forms
+                                                                                : contents.queries;
+        const auto target = std::ranges::find(kind, favorite.name, &MainEntry::name);
+        favorite.missing = target == kind.end();
+        favorite.table = favorite.missing ? QString() : target->table;
     }
+    if (contents == contents_)
+        return false;
+    if (contents.path != contents_.path)
+        search_.clear();
+    contents_ = std::move(contents);
+    return true;
 }
 
 QString MainViewState::DatabaseName() const
@@ -88,12 +97,17 @@ const std::vector<MainEntry>& MainViewState::Entries(MainTab tab) const
 
 std::vector<MainEntry> MainViewState::ShownEntries() const
 {
-    const std::vector<MainEntry>& all = Entries(tab_);
-    if (search_.isEmpty())
+    return EntriesWith(tab_, search_);
+}
+
+std::vector<MainEntry> MainViewState::EntriesWith(MainTab tab, const QString& text) const
+{
+    const std::vector<MainEntry>& all = Entries(tab);
+    if (text.isEmpty())
         return all;
     std::vector<MainEntry> shown;
-    std::ranges::copy_if(all, std::back_inserter(shown), [this](const MainEntry& entry) {
-        return entry.name.contains(search_, Qt::CaseInsensitive);
+    std::ranges::copy_if(all, std::back_inserter(shown), [&text](const MainEntry& entry) {
+        return entry.name.contains(text, Qt::CaseInsensitive);
     });
     return shown;
 }

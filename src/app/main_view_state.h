@@ -33,6 +33,8 @@ struct DatabaseContents {
     std::vector<MainEntry> forms;
     std::vector<MainEntry> queries;
     std::vector<MainEntry> favorites; // `table` and `missing` are filled in by MainViewState
+
+    friend bool operator==(const DatabaseContents&, const DatabaseContents&) = default;
 };
 
 // What the main view shows: four lists, the tab in front, what is selected on each, what is searched for. No
@@ -45,21 +47,26 @@ public:
     // Lists above this length get a line to search in.
     static constexpr int kEntriesWithoutSearch = 12;
 
-    void Show(DatabaseContents contents);
+    void Show(DatabaseContents contents);          // another database ends the search
+    bool ShowIfChanged(DatabaseContents contents); // true: they are others than before
     bool HasDatabase() const { return !contents_.path.isEmpty(); }
     QString DatabasePath() const { return contents_.path; }
     QString DatabaseName() const; // the file's name; empty without a database
 
     MainTab Tab() const { return tab_; }
-    void SetTab(MainTab tab); // ends the search
+    void SetTab(MainTab tab);                    // ends the search
+    void SetSection(MainTab tab) { tab_ = tab; } // the same where one search goes through all of them
 
     const std::vector<MainEntry>& Entries(MainTab tab) const;
     std::vector<MainEntry> ShownEntries() const;
+    // The entries of any tab whose names contain `text`; all of them for an empty one.
+    std::vector<MainEntry> EntriesWith(MainTab tab, const QString& text) const;
     bool OffersSearch() const;
     QString Search() const { return search_; }
     void SetSearch(QString text) { search_ = std::move(text); }
 
     void Select(const MainEntry& entry); // in the tab in front
+    void SelectNothing() { Remember(tab_, {}); }
     int SelectedRow() const;
     // The entry in force on the tab in front; empty when what was selected is not (or no longer) in the list.
     std::optional<MainEntry> Selected() const;

@@ -150,9 +150,18 @@ SampleDatabase::SampleDatabase(const ProgramFolder& folder, QString source)
 
 bool SampleDatabase::Open(DatabaseSession& session) const
 {
+    const bool isNew = !QFileInfo::exists(path_);
+    if (!Provide(session) || !session.Open(path_))
+        return false;
+    if (isNew)
+        Furnish(session);
+    return true;
+}
+
+bool SampleDatabase::Provide(DatabaseSession& session) const
+{
     if (QFileInfo::exists(path_))
-        return session.Open(path_);
-    session.Close();
+        return true;
     // Made under another name: what an interruption leaves behind is never taken for the sample.
     const QString unfinished = path_ + u".new"_s;
     QDir().mkpath(folder_);
@@ -160,16 +169,17 @@ bool SampleDatabase::Open(DatabaseSession& session) const
     const bool made = Make(session, unfinished);
     if (ProviderConnection* provider = session.Connection().Provider())
         provider->CloseDatabase(unfinished);
-    if (!made || !QFile::rename(unfinished, path_)) {
-        QFile::remove(unfinished);
-        return false;
-    }
-    if (!session.Open(path_))
-        return false;
+    if (made && QFile::rename(unfinished, path_))
+        return true;
+    QFile::remove(unfinished);
+    return false;
+}
+
+void SampleDatabase::Furnish(DatabaseSession& session) const
+{
     // Without queries, forms and favorites it is a sample all the same.
     (void)session.Store().Apply([](FormStore& store) { return AddQueries(store), AddSampleForms(store), true; });
     (void)session.SetFavorites(kFavorites);
-    return true;
 }
 
 bool SampleDatabase::Make(DatabaseSession& session, const QString& path) const

@@ -16,9 +16,12 @@ public:
     SampleDatabase(const ProgramFolder& folder, QString source);
 
     QString Path() const { return path_; }
-    // Opens it in the session, and makes it first where it is not there. False, with no database open, when that
-    // fails: why was told to the session's prompt, and nothing half-made is left.
+    // Opens it in the session, and makes it first where it is not there. False, and the session as it was, when
+    // that fails: why was told to the session's prompt, and nothing half-made is left.
     bool Open(DatabaseSession& session) const;
+    // The same in steps: makes the file where it is not there; fills a new one's store once it is the session's.
+    bool Provide(DatabaseSession& session) const;
+    void Furnish(DatabaseSession& session) const;
 
 private:
     bool Make(DatabaseSession& session, const QString& path) const;

@@ -3,11 +3,12 @@
 #include "app/main_view_state.h"
 #include "resources/string_id.h"
 
-#include <span>
+#include <optional>
 
 namespace mirel {
 
-// What the user can do in the main view: the entries of its menus, and the buttons under its lists.
+// What the user can do in the main window: the entries of its menus, and the buttons under its lists. What each is
+// called and does stands in the table in main_frame_commands.cpp.
 enum class ShellCommand {
     AddFavorites,
     RemoveFavorites,
@@ -35,31 +36,21 @@ enum class ShellCommand {
     Edit,
     Rename,
     Delete,
+    SideBar, // these open menus
+    Layout,
+    NextView,
+    PreviousView,
+    CloseView,
+    CloseOtherViews,
+    OpenInWindow,
+    ShowLists,
 };
-
-// Where a command has its place. Entry commands are the buttons under the list and its popup menu.
-enum class ShellMenu { File, Layout, Database, Help, Entry };
-
-struct ShellCommandDef {
-    ShellCommand id;
-    ShellMenu menu;
-    Str text;                 // with its mnemonic
-    Str tip;                  // what it does; for what is not built yet, what it will do
-    std::u16string_view icon; // name for ThemeIcon; empty: none
-    std::u16string_view keys; // in QKeySequence's portable form; empty: none
-    bool built = true;        // false: always disabled
-    bool separated = false;   // a line stands above it in its menu
-};
-
-// Every command once, in the order of the menus.
-std::span<const ShellCommandDef> ShellCommands();
-const ShellCommandDef& DefinitionOf(ShellCommand id);
 
 struct Availability {
     bool enabled = false;
-    Str tip{};
+    std::optional<Str> tip{}; // empty: the command's own
 };
-// Whether the command can be given now, and what its tool tip says.
+// Whether the command can be given now, as far as the lists decide on it, and what its tool tip says.
 Availability AvailabilityOf(ShellCommand id, const MainViewState& state);
 
 // What New does on a tab: a message that something must be chosen first, or the designer of that tab.
@@ -72,5 +63,6 @@ NewOutcome OutcomeOfNew(const MainViewState& state);
 // What stands in place of an empty list.
 Str EmptyListText(MainTab tab);
 Str TabText(MainTab tab);
+Str SectionText(MainTab tab); // the same in the side bar
 
 } // namespace mirel

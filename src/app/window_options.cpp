@@ -29,8 +29,10 @@ const std::array kOptions = {
     OptionDef{u"picture", u"FILE", u"write a picture of the window to a PNG file and end", &WindowOptions::picture,
               nullptr},
     OptionDef{u"size", u"WxH", u"size of that picture; 1100x700 unless given", nullptr, nullptr},
-    OptionDef{u"table", u"NAME", u"a picture of the table view of that table", &WindowOptions::table, nullptr},
-    OptionDef{u"form", u"NAME", u"a picture of that form running", &WindowOptions::form, nullptr},
+    OptionDef{u"table", u"NAME", u"open that table alone; with --picture, show it there", &WindowOptions::table,
+              nullptr},
+    OptionDef{u"form", u"NAME", u"the same with that form", &WindowOptions::form, nullptr},
+    OptionDef{u"query", u"NAME", u"the same with that saved query", &WindowOptions::query, nullptr},
     OptionDef{u"print-sample-path", u"", u"print where the sample database is, making it where it is not there",
               nullptr, &WindowOptions::printSamplePath},
     OptionDef{u"help", u"", u"print this", nullptr, &WindowOptions::help},
@@ -77,12 +79,9 @@ bool ReadOptions(const QCommandLineParser& parser, WindowOptions& options, QStri
         }
         options.size = *size;
     }
-    if (!options.table.isEmpty() && options.picture.isEmpty()) {
-        complaint = u"--table says what --picture shows, and needs it"_s;
-        return false;
-    }
-    if (!options.form.isEmpty() && (options.picture.isEmpty() || !options.table.isEmpty())) {
-        complaint = u"--form says what --picture shows in place of --table"_s;
+    const int views = int(!options.table.isEmpty()) + int(!options.form.isEmpty()) + int(!options.query.isEmpty());
+    if (views > 1) {
+        complaint = u"one of --table, --form and --query at a time"_s;
         return false;
     }
     return true;

@@ -18,8 +18,11 @@ struct WindowOptions {
     // A picture of the window instead of the window.
     QString picture;       // the file to write; empty: none
     QSize size{1100, 700}; // of the picture
-    QString table;         // a picture of the table view of that table
-    QString form;          // a picture of that form running
+
+    // One view alone, by its name; at most one of them.
+    QString table;
+    QString form;
+    QString query;
 
     bool printSamplePath = false;
     bool help = false;

@@ -102,8 +102,9 @@ TEST_F(SessionTest, OpensNothingThatIsNoDatabase)
     ASSERT_TRUE(session_.Create(File(u"a.cdb"_s)));
     for (const QString& name : {u"letter.cdb"_s, u"nothing.cdb"_s, u"home"_s}) {
         EXPECT_FALSE(session_.Open(File(name))) << name.toStdString();
-        EXPECT_FALSE(session_.IsOpen()) << name.toStdString();
+        EXPECT_EQ(session_.Path(), File(u"a.cdb"_s)) << name.toStdString();
     }
+    EXPECT_TRUE(catalog_.ExecuteStatement(session_.Path(), u"CREATE TABLE T (A SmallInt)"_s)) << "it works on";
     EXPECT_EQ(prompt_.shown.size(), 3) << prompt_.shown.join(u'\n').toStdString();
     EXPECT_EQ(QFile(File(u"letter.cdb"_s)).size(), 5000);
 }

@@ -178,13 +178,14 @@ TEST_F(MainViewCommandsTest, ARenamedEntryStaysSelectedAndAFavorite)
     EXPECT_FALSE(program_->state.Entries(MainTab::Favorites)[0].missing);
 }
 
-TEST_F(MainViewCommandsTest, DeletingAFavoriteKeepsTheTable)
+TEST_F(MainViewCommandsTest, RemovingAFavoriteKeepsTheTable)
 {
     ASSERT_TRUE(MakeShop());
     program_->SelectOn(MainTab::Table, u"Birds");
     ASSERT_TRUE(program_->commands.AddFavorite());
     program_->SelectOn(MainTab::Favorites, u"Birds");
-    EXPECT_TRUE(program_->commands.DeleteSelected());
+    EXPECT_FALSE(program_->commands.DeleteSelected());
+    EXPECT_TRUE(program_->commands.RemoveFavorite());
     EXPECT_TRUE(prompt_.questions.isEmpty()) << "nothing is lost";
     EXPECT_TRUE(program_->Names(MainTab::Favorites).isEmpty());
     EXPECT_TRUE(program_->Names(MainTab::Table).contains(u"Birds"_s));

@@ -40,7 +40,7 @@ TEST(WindowOptions, WrongOnesAreNamed)
         {{u"--size"_s, u"99999x99999"_s}, u"99999x99999"_s},
         {{u"--home"_s}, u"home"_s},
         {{u"a.cdb"_s, u"b.cdb"_s}, u"b.cdb"_s},
-        {{u"--table"_s, u"T"_s}, u"--picture"_s},
+        {{u"--table"_s, u"T"_s, u"--query"_s, u"Q"_s}, u"--query"_s},
     };
     for (const Row& row : rows) {
         QString complaint;

@@ -29,7 +29,8 @@ protected:
 
     void SetUp() override
     {
-        QObject::connect(&actions_, &ShellActions::Given, [this](ShellCommand id) { given_.push_back(id); });
+        QObject::connect(&actions_, &CommandActions::given,
+                         [this](int id) { given_.push_back(ShellCommand(id)); });
         Fill({Table(u"Airports"_s), Table(u"Birds"_s), Table(u"Contacts"_s)});
         ShowAt(QSize(400, 500));
     }
@@ -66,7 +67,8 @@ protected:
     QLineEdit* Search() const { return view_.findChild<QLineEdit*>(u"search"_s); }
 
     MainViewState state_;
-    ShellActions actions_;
+    QWidget window_;
+    ShellActions& actions_ = *new ShellActions(window_);
     CLumoView view_{state_, actions_};
     std::vector<ShellCommand> given_;
 };

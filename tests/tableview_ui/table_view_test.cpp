@@ -17,7 +17,6 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
-#include <QMenuBar>
 #include <QMimeData>
 #include <QMouseEvent>
 #include <QPlainTextEdit>
@@ -269,9 +268,9 @@ TEST_F(TableView, FindsWhileTypingAndGoesOnWithEnterAndF3)
 TEST_F(TableView, ShowsItsMenusWithEveryEntryAndLetter)
 {
     QStringList entries;
-    for (const QAction* top : view.menuBar()->actions()) {
+    for (const QMenu* menu : view.Menus()) {
         QSet<QString> letters;
-        for (const QAction* entry : top->menu()->actions()) {
+        for (const QAction* entry : menu->actions()) {
             if (entry->isSeparator())
                 continue;
             const QString letter = entry->text().section(u'&', 1, 1).left(1).toLower();
@@ -290,8 +289,6 @@ TEST_F(TableView, ShowsItsMenusWithEveryEntryAndLetter)
                                  u"Auto Size Column"_s,
                                  u"Options..."_s,
                                  u"Layout"_s,
-                                 u"Help"_s,
-                                 u"Close"_s,
                                  u"Filter By Selection"_s,
                                  u"Filter Excluding Selection"_s,
                                  u"Filter Expression ..."_s,

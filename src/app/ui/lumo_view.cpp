@@ -23,14 +23,6 @@ namespace {
 
 constexpr std::array kEntryButtons = {ShellCommand::Open, ShellCommand::New, ShellCommand::Edit,
                                       ShellCommand::Delete};
-constexpr std::array kPopupCommands = {ShellCommand::Open,
-                                       ShellCommand::Edit,
-                                       ShellCommand::Rename,
-                                       ShellCommand::AddFavorites,
-                                       ShellCommand::RemoveFavorites,
-                                       ShellCommand::Delete,
-                                       ShellCommand::New};
-
 QStringView IconOf(EntryKind kind)
 {
     switch (kind) {
@@ -83,6 +75,7 @@ CLumoView::CLumoView(MainViewState& state, ShellActions& actions, QWidget* paren
     tabs_->setUsesScrollButtons(false);
     tabs_->setDocumentMode(true);
     tabs_->setDrawBase(false);
+    tabs_->setAccessibleName(StringText(Str::SideBarName));
     search_->setPlaceholderText(StringText(Str::SearchEntries));
     search_->setAccessibleName(StringText(Str::SearchEntries));
     search_->setClearButtonEnabled(true);
@@ -170,13 +163,8 @@ void CLumoView::Connect()
     connect(welcome_, &WelcomePage::RecentChosen, this, &CLumoView::RecentChosen);
     list_->viewport()->grabGesture(Qt::TapAndHoldGesture);
     list_->viewport()->installEventFilter(this);
-    // Keys of the entries work while the view has the focus, not over other windows.
-    for (const ShellCommandDef& definition : ShellCommands()) {
-        if (definition.menu != ShellMenu::Entry)
-            continue;
-        actions_.Of(definition.id)->setShortcutContext(Qt::WidgetWithChildrenShortcut);
-        addAction(actions_.Of(definition.id));
-    }
+    for (QAction* action : actions_.OfEntries())
+        addAction(action); // their keys work while the view has the focus
 }
 
 void CLumoView::ShowState()
@@ -187,8 +175,11 @@ void CLumoView::ShowState()
         ThemeIcon(u"mirel-database").pixmap(iconSize, open ? QIcon::Normal : QIcon::Disabled));
     databaseLine_->SetText(open ? state_.DatabaseName() : StringText(Str::NoDatabase));
     databaseLine_->setToolTip(QDir::toNativeSeparators(state_.DatabasePath()));
-    tabs_->setCurrentIndex(int(state_.Tab()));
-    search_->setVisible(state_.OffersSearch());
+    {
+        const QSignalBlocker quiet(tabs_); // changing the tab by hand ends the search
+        tabs_->setCurrentIndex(int(state_.Tab()));
+    }
+    search_->setVisible(state_.OffersSearch() || !state_.Search().isEmpty());
     if (search_->text() != state_.Search())
         search_->setText(state_.Search());
     list_->setAccessibleName(StringText(Str::EntriesOf, {StringText(TabText(state_.Tab())).remove(u'&')}));
@@ -227,6 +218,11 @@ void CLumoView::ShowList()
                                                       : StringText(Str::NothingFound, {state_.Search()}));
         pages_->setCurrentWidget(emptyText_);
     }
+    // One way each: off the list on the favorites, deleted on the other tabs.
+    const bool favorites = state_.Tab() == MainTab::Favorites;
+    buttons_.back()->setDefaultAction(
+        actions_.Of(favorites ? ShellCommand::RemoveFavorites : ShellCommand::Delete));
+    FitButtons();
     actions_.Follow(state_);
 }
 
@@ -260,9 +256,7 @@ void CLumoView::FitButtons()
 void CLumoView::PopUpMenu(QPoint globalPosition)
 {
     QMenu menu(this);
-    menu.setToolTipsVisible(true);
-    for (const ShellCommand id : kPopupCommands)
-        menu.addAction(actions_.Of(id));
+    actions_.FillMenu(menu, state_.Tab() == MainTab::Favorites ? ShellFavoritePopup : ShellEntryPopup);
     menu.exec(globalPosition);
 }
 

@@ -4,7 +4,6 @@
 #include "app/ui/message_box_prompt.h"
 #include "app/window_options.h"
 #include "cli/console_prompt.h"
-#include "forms/ui/form_eng_view.h"
 
 #include <QApplication>
 
@@ -67,6 +66,36 @@ bool Open(Core& core, const WindowOptions& options)
     return options.database.isEmpty() || core.session.IsOpen();
 }
 
+QString KindName(EntryKind kind)
+{
+    switch (kind) {
+    case EntryKind::Table:
+        return u"table"_s;
+    case EntryKind::Form:
+        return u"form"_s;
+    case EntryKind::Query:
+        break;
+    }
+    return u"query"_s;
+}
+
+// The view that was asked for, alone in the window. False when there is no such view; why was told then.
+bool ShowAlone(CMainFrame& frame, const WindowOptions& options)
+{
+    for (const auto& [kind, name] :
+         {std::pair(EntryKind::Table, options.table), std::pair(EntryKind::Form, options.form),
+          std::pair(EntryKind::Query, options.query)}) {
+        if (name.isEmpty())
+            continue;
+        frame.BeAlone();
+        if (frame.OpenView({kind, name}))
+            return true;
+        Say(stderr, u"mirel: it has no %1 \"%2\"\n"_s.arg(KindName(kind), name));
+        return false;
+    }
+    return true;
+}
+
 int TakePicture(const WindowOptions& options)
 {
     cli::ConsolePrompt prompt(kAnswerNo); // nobody is there to press a button
@@ -75,22 +104,13 @@ int TakePicture(const WindowOptions& options)
     if (!Open(core, options))
         return kFailed;
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
-    QWidget* shown = &frame;
-    if (!options.table.isEmpty()) {
-        const QString statement = u"SELECT * FROM "_s + FieldReference(options.table);
-        shown = frame.OpenTable({options.table, statement, options.table});
-    }
-    if (!options.form.isEmpty()) {
-        const std::optional<FormCall> call = core.commands.CallOfForm(options.form);
-        shown = call ? frame.OpenForm(*call) : nullptr;
-    }
-    if (!shown)
+    if (!ShowAlone(frame, options))
         return kFailed;
-    shown->setWindowState(Qt::WindowNoState);
-    shown->resize(options.size);
-    shown->show();
+    frame.setWindowState(Qt::WindowNoState);
+    frame.resize(options.size);
+    frame.show();
     QCoreApplication::processEvents();
-    if (shown->grab().save(options.picture, "PNG"))
+    if (frame.grab().save(options.picture, "PNG"))
         return kDone;
     Say(stderr, u"mirel: cannot write %1\n"_s.arg(options.picture));
     return kFailed;
@@ -104,6 +124,10 @@ int ShowWindow(const WindowOptions& options)
     frame.show();
     (void)Open(core, options); // after show: what it has to say stands over the window
     frame.ShowState();
+    if (!ShowAlone(frame, options))
+        return kFailed;
+    if (!frame.IsAlone())
+        frame.RestoreViews();
     const int result = QApplication::exec();
     core.commands.KeepForNextRun();
     return result;

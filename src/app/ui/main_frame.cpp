@@ -1,32 +1,39 @@
 #include "app/ui/main_frame.h"
 
-#include "app/form_view_options.h"
-#include "app/table_view_options.h"
-#include "app/ui/about_box.h"
 #include "app/ui/display_look.h"
-#include "app/ui/keys_dialog.h"
+#include "app/ui/empty_page.h"
+#include "app/ui/entry_panel.h"
 #include "app/ui/lumo_view.h"
 #include "app/ui/open_views.h"
 #include "app/ui/shell_actions.h"
+#include "app/ui/side_bar.h"
+#include "app/ui/view_tabs.h"
+#include "app/ui/view_window.h"
 #include "forms/ui/form_eng_view.h"
-#include "platform/ui/file_choice.h"
-#include "platform/ui/menu_keys.h"
+#include "platform/ui/keys_dialog.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
+#include "resources/ui/theme_icon.h"
 #include "tableeditor/ui/table_dialog.h"
-#include "tableview/ui/export_wizard.h"
 #include "tableview/ui/table_view.h"
 
 #include <QApplication>
 #include <QDir>
 #include <QDragEnterEvent>
 #include <QFileInfo>
+#include <QFrame>
+#include <QLabel>
 #include <QMenuBar>
 #include <QMimeData>
+#include <QSplitter>
+#include <QToolButton>
 #include <QUrl>
+#include <QVBoxLayout>
 
 #include <algorithm>
-#include <array>
+
+// The main window: its parts, its menus, and what it does with databases. What it does with views stands in
+// main_frame_views.cpp, its commands in main_frame_commands.cpp.
 
 namespace mirel {
 namespace {
@@ -34,27 +41,14 @@ namespace {
 using namespace Qt::StringLiterals;
 
 const QString kFramePlace = u"frame"_s;
-const QString kTablePlace = u"table"_s;
-const QString kWidthsSection = u"Columns"_s;
-const QString kFormPlace = u"form"_s;
-constexpr QSize kFrameFirstSize(760, 560);
-constexpr QSize kTableFirstSize(960, 620);
+const QString kWindowSection = u"Window"_s;
+const QString kSideBarKey = u"sideBar"_s;
+constexpr QSize kFrameFirstSize(1100, 700);
 constexpr QSize kSmallestSize(160, 160);
-
-struct LookCommand {
-    ShellCommand command;
-    LookItem item;
-};
-constexpr std::array kLookItems = {
-    LookCommand{ShellCommand::Font, LookItem::Font},
-    LookCommand{ShellCommand::BackgroundColor, LookItem::LineBackground},
-    LookCommand{ShellCommand::ListBackgroundColor, LookItem::ListBackground},
-    LookCommand{ShellCommand::ButtonBackgroundColor, LookItem::ButtonBackground},
-    LookCommand{ShellCommand::DatabaseTextColor, LookItem::LineText},
-    LookCommand{ShellCommand::ListTextColor, LookItem::ListText},
-    LookCommand{ShellCommand::ButtonTextColor, LookItem::ButtonText},
-    LookCommand{ShellCommand::ResetLayout, LookItem::Reset},
-};
+constexpr int kSideBarFirstWidth = 212;
+constexpr int kSideBarLeastWidth = 140;
+constexpr int kLookAtFileMs = 1000;
+constexpr int kCornerShare = 3; // of the window's width, the most that the name in the corner takes
 
 // The one database file that is dragged; empty when it is anything else.
 QString DraggedDatabase(const QMimeData* data)
@@ -66,6 +60,17 @@ QString DraggedDatabase(const QMimeData* data)
     return path.endsWith(u".cdb"_s, Qt::CaseInsensitive) ? path : QString();
 }
 
+// Between parts of the window.
+QFrame* Line(QFrame::Shape shape, QWidget* parent)
+{
+    auto* line = new QFrame(parent);
+    line->setFrameShape(shape);
+    line->setFrameShadow(QFrame::Plain);
+    line->setForegroundRole(QPalette::Mid);
+    line->setLineWidth(1);
+    return line;
+}
+
 } // namespace
 
 CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewCommands& commands,
@@ -75,59 +80,245 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     , commands_(commands)
     , settings_(settings)
     , profile_(profile)
-    , actions_(new ShellActions(this))
-    , view_(new CLumoView(state, *actions_, this))
-    , openViews_(std::make_unique<OpenViews>(
-          session, OpenViews::Lists{[this] { return Tables(); }, [this] { return Forms(); }}))
+    , actions_(new ShellActions(*this))
+    , openViews_(
+          std::make_unique<OpenViews>(session, OpenViews::Lists{[this] { return ViewsOf<CTableView>(); },
+                                                                [this] { return ViewsOf<CFormEngView>(); }}))
 {
-    commands.SetOpenViews(openViews_.get());
+    MakeParts();
     MakeMenus();
-    setCentralWidget(view_);
+    Connect();
     setAcceptDrops(true);
     setMinimumSize(kSmallestSize);
     setWindowIcon(QIcon(u":/icons/mirel.svg"_s));
-    connect(actions_, &ShellActions::Given, this, &CMainFrame::Run);
-    connect(view_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
     RestorePlace(*this, profile, kFramePlace, kFrameFirstSize);
+    const int sideWidth =
+        std::max(profile.ReadInt(kWindowSection, kSideBarKey, kSideBarFirstWidth), kSideBarLeastWidth);
+    splitter_->setSizes({sideWidth, std::max(width() - sideWidth, 1)});
+    wide_ = !IsWide(); // so that it is fitted
+    FitWidth();
     ShowState();
     ShowLook();
-    view_->setFocus();
+    ShowLists();
+    session_.AddListener(*this);
+    commands_.SetViewHost(this);
+    commands_.SetOpenViews(openViews_.get());
 }
 
 CMainFrame::~CMainFrame()
 {
+    commands_.SetViewHost(nullptr);
     commands_.SetOpenViews(nullptr);
+    session_.RemoveListener(*this);
+}
+
+void CMainFrame::MakeParts()
+{
+    auto* whole = new QWidget(this);
+    notice_ = new QLabel(whole);
+    notice_->setWordWrap(true);
+    notice_->setMargin(8);
+    notice_->setTextFormat(Qt::PlainText);
+    notice_->hide();
+    splitter_ = new QSplitter(whole);
+    splitter_->setChildrenCollapsible(false);
+    splitter_->setHandleWidth(1);
+    sidePane_ = new QWidget(splitter_);
+    sidePane_->setMinimumWidth(kSideBarLeastWidth);
+    sideBar_ = new SideBar(state_, *actions_, sidePane_);
+    panel_ = new EntryPanel(session_, sidePane_);
+    auto* lines = new QVBoxLayout;
+    lines->setSpacing(0);
+    lines->addWidget(sideBar_, 1);
+    lines->addWidget(Line(QFrame::HLine, sidePane_));
+    lines->addWidget(panel_);
+    auto* side = new QHBoxLayout(sidePane_);
+    side->setContentsMargins({});
+    side->setSpacing(0);
+    side->addLayout(lines, 1);
+    side->addWidget(Line(QFrame::VLine, sidePane_));
+    lists_ = new CLumoView(state_, *actions_, this);
+    emptyPage_ = new EmptyPage(*actions_, this);
+    tabs_ = new ViewTabs([this](const ViewKey& key) { return MakeView(key); }, splitter_);
+    tabs_->SetHomes(emptyPage_, lists_);
+    splitter_->addWidget(sidePane_);
+    splitter_->addWidget(tabs_);
+    splitter_->setStretchFactor(0, 0);
+    splitter_->setStretchFactor(1, 1);
+    auto* column = new QVBoxLayout(whole);
+    column->setContentsMargins({});
+    column->setSpacing(0);
+    column->addWidget(notice_);
+    column->addWidget(splitter_, 1);
+    setCentralWidget(whole);
 }
 
 void CMainFrame::MakeMenus()
 {
     menuBar()->setNativeMenuBar(false); // its place in a small window is the window
-    QMenu* file = menuBar()->addMenu(StringText(Str::MenuFile));
-    auto* layout = new QMenu(StringText(Str::MenuLayout), file);
-    QMenu* database = menuBar()->addMenu(StringText(Str::MenuDatabase));
-    QMenu* help = menuBar()->addMenu(StringText(Str::MenuHelp));
-    recentMenu_ = new QMenu(StringText(Str::MenuRecent), database);
+    fileMenu_ = new QMenu(StringText(Str::MenuFile), this);
+    databaseMenu_ = new QMenu(StringText(Str::MenuDatabase), this);
+    windowMenu_ = new QMenu(StringText(Str::MenuWindow), this);
+    helpMenu_ = new QMenu(StringText(Str::MenuHelp), this);
+    recentMenu_ = new QMenu(StringText(Str::MenuRecent), databaseMenu_);
     recentMenu_->setToolTipsVisible(true); // the paths
-    const std::map<ShellMenu, QMenu*> menus = {{ShellMenu::File, file},
-                                               {ShellMenu::Layout, layout},
-                                               {ShellMenu::Database, database},
-                                               {ShellMenu::Help, help}};
-    for (const auto& [id, menu] : menus) {
-        menu->setToolTipsVisible(true); // they say why an entry cannot be chosen
-        LeaveOutKeysWhenSmall(*menu, *this);
-    }
-    for (const ShellCommandDef& definition : ShellCommands()) {
-        const auto menu = menus.find(definition.menu);
-        if (menu == menus.end())
-            continue;
-        if (definition.id == ShellCommand::ImportCsv)
-            file->addMenu(layout);
-        if (definition.separated)
-            menu->second->addSeparator();
-        menu->second->addAction(actions_->Of(definition.id));
-    }
-    database->addMenu(recentMenu_);
+    actions_->FillMenu(*databaseMenu_, ShellDatabaseMenu);
+    databaseMenu_->addMenu(recentMenu_);
+    actions_->FillMenu(*helpMenu_, ShellHelpMenu);
+    windowMenu_->setToolTipsVisible(true);
+    corner_ = new QToolButton(menuBar());
+    corner_->setAutoRaise(true);
+    corner_->setPopupMode(QToolButton::InstantPopup);
+    corner_->setMenu(windowMenu_);
+    corner_->setFocusPolicy(Qt::NoFocus); // the same stands in menus
+    corner_->setAccessibleName(StringText(Str::MenuOfViews));
+    menuBar()->setCornerWidget(corner_);
+}
+
+void CMainFrame::Connect()
+{
+    connect(actions_, &CommandActions::given, this, [this](int id) { RunCommand(CommandTable(), id, *this); });
+    connect(lists_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
+    connect(emptyPage_, &EmptyPage::RecentChosen, this, &CMainFrame::OpenPath);
+    connect(sideBar_, &SideBar::selectionChanged, this, [this] { panel_->LookAt(state_.Selected()); });
+    connect(tabs_, &ViewTabs::frontChanged, this, &CMainFrame::ShowFront);
+    connect(tabs_, &ViewTabs::titleChanged, this, &CMainFrame::ShowTitle);
+    connect(tabs_, &ViewTabs::lastClosed, this, [this] {
+        if (alone_)
+            close();
+        else
+            ShowLists();
+    });
+    connect(tabs_, &ViewTabs::menuRequested, this, [this](const QPoint& globalPosition) {
+        QMenu menu(this);
+        actions_->FillMenu(menu, ShellTabMenu);
+        menu.exec(globalPosition);
+    });
     connect(recentMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
+    connect(windowMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillWindowMenu);
+    connect(&watchTimer_, &QTimer::timeout, this, &CMainFrame::LookAtFile);
+    tellTimer_.setSingleShot(true);
+    connect(&tellTimer_, &QTimer::timeout, this, [this] { session_.TellRecordsChanged(); });
+    watchTimer_.start(kLookAtFileMs);
+}
+
+// --- showing ------------------------------------------------------------------------------------------------
+
+void CMainFrame::ShowState()
+{
+    FollowNames();
+    const QStringList recent = settings_.RecentDatabases();
+    recentMenu_->setEnabled(!recent.isEmpty());
+    lists_->ShowRecent(recent);
+    lists_->ShowState();
+    sideBar_->ShowState();
+    emptyPage_->Show(state_, recent);
+    panel_->LookAt(state_.Selected());
+    panel_->setVisible(state_.HasDatabase());
+    FollowTabs();
+    ShowTitle();
+    if (watchedPath_ == state_.DatabasePath())
+        return;
+    watchedPath_ = state_.DatabasePath();
+    file_ = FileState::Of(watchedPath_);
+    notice_->hide();
+}
+
+void CMainFrame::ShowTitle()
+{
+    const HostedView* front = tabs_->Front();
+    const QString application = QApplication::applicationDisplayName();
+    const QString database = state_.DatabaseName();
+    if (front)
+        setWindowTitle(StringText(Str::TitleOfView, {front->windowTitle(), database}));
+    else
+        setWindowTitle(state_.HasDatabase() ? StringText(Str::WindowTitle, {database}) : application);
+    setWindowModified(front && front->isWindowModified());
+    const QString name = front && !wide_ ? tabs_->TitleAt(tabs_->Current())
+                         : wide_         ? database
+                                         : StringText(Str::OpenViews);
+    corner_->setText(
+        corner_->fontMetrics().elidedText(name, Qt::ElideMiddle, width() / kCornerShare).replace(u'&', u"&&"_s));
+    corner_->setToolTip(wide_ ? QDir::toNativeSeparators(state_.DatabasePath()).toHtmlEscaped()
+                              : name.toHtmlEscaped());
+    corner_->setVisible(state_.HasDatabase() && (wide_ || tabs_->Count() > 0) && !alone_);
+}
+
+void CMainFrame::resizeEvent(QResizeEvent* event)
+{
+    QMainWindow::resizeEvent(event);
+    FitWidth();
+}
+
+void CMainFrame::FitWidth()
+{
+    if (wide_ == IsWide())
+        return;
+    wide_ = IsWide();
+    const bool focusInLists = lists_->isAncestorOf(focusWidget()) || sideBar_->isAncestorOf(focusWidget());
+    sidePane_->setVisible(wide_ && !alone_);
+    FitBar();
+    ShowState();
+    shownFront_ = nullptr;
+    ShowMenus();
+    if (focusInLists && !tabs_->Front())
+        ShowLists();
+}
+
+void CMainFrame::FitBar()
+{
+    tabs_->SetBarShown(alone_ ? tabs_->Count() > 1 : wide_);
+}
+
+void CMainFrame::ShowFront()
+{
+    FitBar();
+    FollowTabs();
+    ShowMenus();
+    ShowTitle();
+    HostedView* front = tabs_->Front();
+    const bool isOther = front != std::exchange(shownFront_, front);
+    if (front && isOther && front->isVisible())
+        front->TakeUpChanges(); // it could not see them while it was hidden
+}
+
+void CMainFrame::FollowTabs()
+{
+    for (const CommandRow<CMainFrame>& row : CommandTable()) {
+        if (row.state)
+            actions_->Show(row.def.id, row.state(*this));
+    }
+}
+
+void CMainFrame::ShowMenus()
+{
+    const HostedView* front = tabs_->Front();
+    if (front == shownFront_ && !menuBar()->actions().isEmpty() && shownFront_)
+        return;
+    const QList<QMenu*> menus = front ? front->Menus() : QList<QMenu*>();
+    menuBar()->clear();
+    fileMenu_->clear();
+    menuBar()->addMenu(fileMenu_);
+    if (!menus.isEmpty()) {
+        fileMenu_->addActions(menus.first()->actions());
+        fileMenu_->addSeparator();
+    }
+    if (front && !wide_ && !alone_) { // on a narrow window the view's own menus have the bar
+        for (QMenu* menu : {databaseMenu_, helpMenu_})
+            fileMenu_->addMenu(menu);
+        fileMenu_->addSeparator();
+    }
+    actions_->FillMenu(*fileMenu_, front ? ShellViewFileMenu : ShellFileMenu);
+    for (qsizetype i = 1; i < menus.size(); ++i)
+        menuBar()->addMenu(menus[i]);
+    if (alone_) {
+        menuBar()->addMenu(helpMenu_);
+    } else if (wide_ || !front) {
+        menuBar()->addMenu(databaseMenu_);
+        if (wide_)
+            menuBar()->addMenu(windowMenu_);
+        menuBar()->addMenu(helpMenu_);
+    }
 }
 
 void CMainFrame::FillRecentMenu()
@@ -142,239 +333,106 @@ void CMainFrame::FillRecentMenu()
     }
 }
 
-void CMainFrame::ShowState()
+void CMainFrame::FillWindowMenu()
 {
-    const QStringList recent = settings_.RecentDatabases();
-    recentMenu_->setEnabled(!recent.isEmpty());
-    view_->ShowRecent(recent);
-    view_->ShowState();
-    const QString application = QApplication::applicationDisplayName();
-    setWindowTitle(state_.HasDatabase() ? StringText(Str::WindowTitle, {state_.DatabaseName()}) : application);
+    windowMenu_->clear();
+    actions_->FillMenu(*windowMenu_, ShellWindowMenu);
+    windowMenu_->addSeparator();
+    for (int tab = 0; tab < tabs_->Count(); ++tab) {
+        const QString title =
+            fontMetrics().elidedText(tabs_->TitleAt(tab), Qt::ElideMiddle, width() / 2).replace(u'&', u"&&"_s);
+        QAction* action = windowMenu_->addAction(StringText(Str::ViewEntry, {QString::number(tab + 1), title}));
+        action->setCheckable(true);
+        action->setChecked(tabs_->Front() && tab == tabs_->Current());
+        action->setToolTip(tabs_->TitleAt(tab).toHtmlEscaped());
+        connect(action, &QAction::triggered, this, [this, tab] { tabs_->BringForward(tab); });
+    }
 }
 
-void CMainFrame::Run(ShellCommand id)
+void CMainFrame::ShowLook()
 {
-    switch (id) {
-    case ShellCommand::AddFavorites:
-        commands_.AddFavorite();
-        break;
-    case ShellCommand::RemoveFavorites:
-        commands_.RemoveFavorite();
-        break;
-    case ShellCommand::OpenByDoubleClicking:
-        state_.SetOpensByDoubleTap(!state_.OpensByDoubleTap());
-        break;
-    case ShellCommand::Exit:
-        close();
-        return;
-    case ShellCommand::OpenDatabase:
-        ChooseAndOpenDatabase();
-        break;
-    case ShellCommand::NewDatabase:
-        ChooseAndCreateDatabase();
-        break;
-    case ShellCommand::DeleteDatabase:
-        ChooseAndDeleteDatabase();
-        break;
-    case ShellCommand::OpenSample:
-        commands_.OpenSample();
-        break;
-    case ShellCommand::Keys:
-        ShowKeys(*this);
-        return;
-    case ShellCommand::About:
-        ShowAbout(session_, *this);
-        return;
-    case ShellCommand::Open:
-        if (const std::optional<TableRequest> request = commands_.RequestToOpen())
-            OpenTable(*request);
-        else if (const std::optional<FormCall> call = commands_.CallOfSelected())
-            OpenForm(*call);
-        return;
-    case ShellCommand::ExportCsv:
-        if (const std::optional<TableRequest> request = commands_.RequestOfSelected()) {
-            RunExport(session_.Connection(), session_.Path(), session_.Prompt(),
-                      {.name = request->title, .statement = request->statement}, *this);
-        }
-        return;
-    case ShellCommand::New:
-        if (OutcomeOfNew(state_).make == EntryKind::Table)
-            DesignTable({});
-        else
-            commands_.New();
-        break;
-    case ShellCommand::Edit:
-        if (const std::optional<MainEntry> entry = state_.Selected(); entry && entry->kind == EntryKind::Table)
-            DesignTable(entry->name);
-        break;
-    case ShellCommand::Rename:
-        commands_.RenameSelected();
-        break;
-    case ShellCommand::Delete:
-        commands_.DeleteSelected();
-        break;
-    case ShellCommand::Font:
-    case ShellCommand::BackgroundColor:
-    case ShellCommand::ListBackgroundColor:
-    case ShellCommand::ButtonBackgroundColor:
-    case ShellCommand::DatabaseTextColor:
-    case ShellCommand::ListTextColor:
-    case ShellCommand::ButtonTextColor:
-    case ShellCommand::ResetLayout:
-        ChooseLayout(id);
-        return;
-    case ShellCommand::ImportCsv:
-    case ShellCommand::Help:
-        return; // disabled: not built yet
+    const ViewLook look = LookOf(DisplayChoice(settings_, DisplayView::Main));
+    lists_->SetLook(look);
+    sideBar_->SetLook(look);
+    for (HostedView* view : Views()) {
+        if (auto* table = qobject_cast<CTableView*>(view))
+            table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
     }
+}
+
+// --- commands -----------------------------------------------------------------------------------------------
+
+void CMainFrame::ChooseMainLook(LookItem item)
+{
+    DisplayChoice choice(settings_, DisplayView::Main);
+    if (ChooseLook(choice, item, *this))
+        ShowLook();
+}
+
+void CMainFrame::OpenSelected()
+{
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (!entry || entry->missing)
+        return;
+    if (const std::optional<FormCall> call = commands_.CallOfSelected())
+        OpenForm(*call);
+    else if (const std::optional<TableRequest> request = commands_.RequestToOpen())
+        (void)OpenTable(*request);
+}
+
+void CMainFrame::MakeNew()
+{
+    if (OutcomeOfNew(state_).make == EntryKind::Table)
+        return DesignTable({});
+    commands_.New();
     ShowState();
+}
+
+void CMainFrame::EditSelected()
+{
+    if (const std::optional<MainEntry> entry = state_.Selected(); entry && entry->kind == EntryKind::Table)
+        DesignTable(entry->name);
 }
 
 void CMainFrame::DesignTable(const QString& table)
 {
+    panel_->StopCounting();
     TableDesigner designer(session_.Connection(), session_.Path(), session_.Prompt(), *openViews_);
     if (table.isEmpty() || designer.Open(table))
         CTableDialog(designer, this).exec();
     commands_.Refill();
     if (!designer.IsNew() && state_.Tab() == MainTab::Table)
         state_.Select({EntryKind::Table, designer.Table(), {}, false});
+    ShowState();
 }
 
-void CMainFrame::ChooseLayout(ShellCommand id)
+void CMainFrame::DeleteSelected()
 {
-    const auto row = std::ranges::find(kLookItems, id, &LookCommand::command);
-    DisplayChoice choice(settings_, DisplayView::Main);
-    if (ChooseLook(choice, row->item, *view_))
-        ShowLook();
+    panel_->StopCounting(); // a table that is read cannot be dropped
+    commands_.DeleteSelected();
+    ShowState();
 }
 
-void CMainFrame::ShowLook()
+void CMainFrame::ShowLists()
 {
-    view_->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Main)));
-    for (CTableView* table : Tables())
-        table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
-}
-
-QWidget* CMainFrame::OpenTable(const TableRequest& request)
-{
-    for (CTableView* open : Tables()) {
-        if (open->Browser().BaseStatement() != request.statement)
-            continue;
-        open->show();
-        open->raise();
-        open->activateWindow();
-        return open;
-    }
-    auto* table = new CTableView(session_.Connection(), session_.Path(), session_.Prompt(),
-                                 ReadTableViewSettings(settings_), this);
-    table->setAttribute(Qt::WA_DeleteOnClose);
-    if (!table->OpenStatement(request.title, request.statement)) {
-        delete table;
-        return nullptr;
-    }
-    table->SetStore(session_.Store());
-    connect(table, &CTableView::queriesChanged, this, [this] {
-        commands_.Refill();
-        ShowState();
-    });
-    table->SetWidthsByHand(ReadColumnWidths(profile_.ReadText(kWidthsSection, WidthsKey(request.statement), {})));
-    table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
-    connect(table, &CTableView::lookRequested, this, [this, table](LookItem item) {
-        DisplayChoice choice(settings_, DisplayView::Table);
-        if (ChooseLook(choice, item, *table))
-            ShowLook();
-    });
-    connect(table, &CTableView::settingsChanged, this, [this](const TableViewSettings& options) {
-        WriteTableViewSettings(settings_, options);
-        SpreadOptions();
-    });
-    Place(*table, kTablePlace, kTableFirstSize);
-    table->installEventFilter(this);
-    table->show();
-    return table;
-}
-
-CFormEngView* CMainFrame::OpenForm(const FormCall& call)
-{
-    auto* form = new CFormEngView(call,
-                                  {.connection = session_.Connection(),
-                                   .database = session_.Path(),
-                                   .store = session_.Store(),
-                                   .prompt = session_.Prompt(),
-                                   .settings = ReadFormViewSettings(settings_),
-                                   .activeTable = state_.CurrentTable()},
-                                  this);
-    form->setAttribute(Qt::WA_DeleteOnClose);
-    connect(form, &CFormEngView::formCalled, this, &CMainFrame::OpenForm);
-    connect(form, &CFormEngView::dataChanged, this, [this] {
-        commands_.Refill();
-        ShowState();
-    });
-    connect(form, &CFormEngView::keysRequested, form, [form] { ShowKeys(*form); });
-    connect(form, &CFormEngView::settingsChanged, this, [this](const FormViewSettings& options) {
-        WriteFormViewSettings(settings_, options);
-        SpreadOptions();
-    });
-    Place(*form, kFormPlace, form->PreferredSize());
-    form->installEventFilter(this);
-    form->show();
-    (void)form->Open(); // after show: what it has to say stands over its window
-    return form;
-}
-
-// The options of one view are those of all, and the words for Yes and No those of both kinds.
-void CMainFrame::SpreadOptions()
-{
-    for (CTableView* open : Tables())
-        open->ChangeSettings(ReadTableViewSettings(settings_));
-    for (CFormEngView* open : Forms())
-        open->ChangeSettings(ReadFormViewSettings(settings_));
-}
-
-// On a handheld the window takes the frame's place.
-void CMainFrame::Place(QWidget& window, const QString& key, QSize firstSize)
-{
-    if (IsHandheldSize(size())) {
-        window.setGeometry(geometry());
-        window.setWindowState(windowState());
-    } else {
-        RestorePlace(window, profile_, key, firstSize);
-    }
-}
-
-void CMainFrame::KeepPlaceOf(QWidget& window)
-{
-    const auto* table = qobject_cast<CTableView*>(&window);
-    if (table)
-        KeepWidths(*table);
-    if (IsHandheldSize(window.size()))
+    if (alone_)
         return;
-    if (table)
-        KeepPlace(window, profile_, kTablePlace);
-    else if (qobject_cast<CFormEngView*>(&window))
-        KeepPlace(window, profile_, kFormPlace);
+    if (wide_) {
+        sideBar_->setFocus();
+    } else {
+        tabs_->ShowHome();
+        lists_->setFocus();
+    }
+    if (!state_.HasDatabase() && wide_)
+        emptyPage_->setFocus();
 }
 
-bool CMainFrame::eventFilter(QObject* watched, QEvent* event)
+void CMainFrame::ShowKeyList()
 {
-    if (event->type() == QEvent::Close && watched->isWidgetType())
-        KeepPlaceOf(*static_cast<QWidget*>(watched));
-    return QMainWindow::eventFilter(watched, event);
-}
-
-// By the file's name and what was opened of it: a copy of a database looks as the first one does.
-QString CMainFrame::WidthsKey(const QString& statement) const
-{
-    const QString place = state_.DatabaseName() + u':' + statement;
-    return QString::fromLatin1(QUrl::toPercentEncoding(place));
-}
-
-void CMainFrame::KeepWidths(const CTableView& table)
-{
-    const QString key = WidthsKey(table.Browser().BaseStatement());
-    const QString text = ColumnWidthsText(table.WidthsByHand());
-    if (profile_.ReadText(kWidthsSection, key, {}) != text)
-        profile_.WriteText(kWidthsSection, key, text);
+    QList<KeyHint> keys = actions_->KeyHints();
+    if (const HostedView* front = tabs_->Front())
+        keys = front->Keys() + keys;
+    ShowKeyHints(*this, keys);
 }
 
 QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)
@@ -390,54 +448,46 @@ QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)
 void CMainFrame::ChooseAndOpenDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandOpenDatabase, Str::CommandOpen, FileUse::Open);
-    if (!path.isEmpty() && CloseWindows())
-        commands_.OpenDatabase(path);
+    if (!path.isEmpty())
+        OpenPath(path);
 }
 
 void CMainFrame::ChooseAndCreateDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandNewDatabase, Str::CommandNew, FileUse::Create);
-    if (!path.isEmpty() && CloseWindows())
-        commands_.NewDatabase(path);
+    if (path.isEmpty())
+        return;
+    commands_.NewDatabase(path);
+    ShowState();
 }
 
 void CMainFrame::ChooseAndDeleteDatabase()
 {
     const QString path = ChooseDatabase(Str::CommandDeleteDatabase, Str::CommandDelete, FileUse::Delete);
-    if (!path.isEmpty() && CloseWindows())
-        commands_.DeleteDatabase(path);
+    if (path.isEmpty())
+        return;
+    panel_->StopCounting();
+    commands_.DeleteDatabase(path);
+    ShowState();
 }
 
 void CMainFrame::OpenPath(const QString& path)
 {
-    if (!CloseWindows())
-        return;
     commands_.OpenDatabase(path);
     ShowState();
 }
 
-bool CMainFrame::CloseWindows()
-{
-    const auto close = [](QWidget* window) { return window->close(); };
-    return std::ranges::all_of(Forms(), close) && std::ranges::all_of(Tables(), close);
-}
-
-QList<CTableView*> CMainFrame::Tables() const
-{
-    return findChildren<CTableView*>(Qt::FindDirectChildrenOnly);
-}
-
-QList<CFormEngView*> CMainFrame::Forms() const
-{
-    return findChildren<CFormEngView*>(Qt::FindDirectChildrenOnly);
-}
+// --- closing and dropping -----------------------------------------------------------------------------------
 
 void CMainFrame::closeEvent(QCloseEvent* event)
 {
-    if (!CloseWindows()) {
+    if (!MayCloseViews()) {
         event->ignore();
         return;
     }
+    CloseViews();
+    if (sidePane_->isVisible())
+        profile_.WriteInt(kWindowSection, kSideBarKey, sidePane_->width());
     KeepPlace(*this, profile_, kFramePlace);
     QMainWindow::closeEvent(event);
 }

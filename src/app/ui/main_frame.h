@@ -1,14 +1,22 @@
 #pragma once
 
+#include "app/file_state.h"
 #include "app/main_view_commands.h"
 #include "app/shell_commands.h"
 #include "platform/ui/file_choice.h"
+#include "platform/ui/hosted_view.h"
+#include "platform/ui/view_command.h"
+#include "platform/ui/view_look.h"
 
 #include <QMainWindow>
+#include <QTimer>
 
 #include <memory>
 
+class QLabel;
 class QMenu;
+class QSplitter;
+class QToolButton;
 
 namespace mirel {
 
@@ -16,56 +24,120 @@ class CFormEngView;
 class CLumoView;
 class OpenViews;
 class CTableView;
+class CViewWindow;
+class EmptyPage;
+class EntryPanel;
+class HostedView;
 class ShellActions;
+class SideBar;
+class ViewTabs;
 
-// The program's window: the menus, and in its middle the main view. Table views and running forms are windows of
-// the frame. Carries the commands of the menus to MainViewCommands; DatabaseSession is the document.
+// The program's window. It hosts all views: on a wide window the lists are a side bar and the views tabs beside
+// it; on a narrow one the lists or one view have the window to themselves. Changing between the two closes
+// nothing. The menus are those of the view in front, then the window's own, with one File menu. A view can also
+// stand in a window of its own.
 //
 // All arguments must outlive the frame.
-class CMainFrame : public QMainWindow {
+class CMainFrame : public QMainWindow, private ViewHost, private SessionListener {
     Q_OBJECT
 public:
+    static constexpr int kLeastWideWidth = 640; // logical pixels
+
     CMainFrame(DatabaseSession& session, MainViewState& state, MainViewCommands& commands, Settings& settings,
                Profile& profile);
     ~CMainFrame() override;
 
+    static std::span<const CommandRow<CMainFrame>> CommandTable();
+
     // Shows the state as it is now, after somebody else changed it.
     void ShowState();
     // Opens the table view on a result, or brings forward the one that shows it already. Null when it does not
-    // open; why was told then. Table views close with the database.
-    QWidget* OpenTable(const TableRequest& request);
+    // open; why was told then.
+    CTableView* OpenTable(const TableRequest& request);
     // The frame's command 5001: runs a form in a form engine of its own, also when one runs that form already.
-    // Form engines close with the database.
     CFormEngView* OpenForm(const FormCall& call);
+    // Opens a table, form or query of the database by its name; null as above.
+    HostedView* OpenView(const ViewKey& key);
+    // The views that were open on this database at the end of the last run. Each is read when it first comes to
+    // the front; what is gone is left out.
+    void RestoreViews();
+    // From here on the window is that of the views opened in it: it shows no lists, and closes with the last view.
+    void BeAlone();
+    bool IsAlone() const { return alone_; }
 
 protected:
     void closeEvent(QCloseEvent* event) override;
     void dragEnterEvent(QDragEnterEvent* event) override;
     void dropEvent(QDropEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
 
 private:
+    struct Commands;
+
+    void MakeParts();
     void MakeMenus();
+    void Connect();
+    bool IsWide() const { return width() >= kLeastWideWidth; }
+    void FitWidth();
+    void FitBar();
+    void ShowFront();
+    void ShowMenus();
     void FillRecentMenu();
-    void Run(ShellCommand id);
-    void ChooseLayout(ShellCommand id);
+    void FillWindowMenu();
+    void FollowTabs();
     void DesignTable(const QString& table); // empty: a new one
     void ShowLook();
-    QString WidthsKey(const QString& statement) const;
-    void KeepWidths(const CTableView& table);
+    void ShowTitle();
+
+    // Commands.
+    void ChooseMainLook(LookItem item);
+    void OpenSelected();
+    void MakeNew();
+    void EditSelected();
+    void DeleteSelected();
+    void ShowLists();
+    void MoveToWindow();
+    void ShowKeyList();
     QString ChooseDatabase(Str title, Str accept, FileUse use);
     void ChooseAndOpenDatabase();
     void ChooseAndCreateDatabase();
     void ChooseAndDeleteDatabase();
     void OpenPath(const QString& path);
-    // The windows on the open database. False when one of them holds an edit that is not to be lost: the user
-    // stays in it.
-    bool CloseWindows();
-    QList<CTableView*> Tables() const;
-    QList<CFormEngView*> Forms() const;
-    void Place(QWidget& window, const QString& key, QSize firstSize);
+
+    // Views.
+    CTableView* MakeTable(const TableRequest& request);
+    CFormEngView* MakeForm(const FormCall& call);
+    HostedView* MakeView(const ViewKey& key);
+    void ConnectView(HostedView& view);
     void SpreadOptions();
-    void KeepPlaceOf(QWidget& window);
+    template <typename View>
+    QList<View*> ViewsOf() const
+    {
+        QList<View*> found;
+        for (HostedView* view : Views()) {
+            if (auto* one = qobject_cast<View*>(view))
+                found += one;
+        }
+        return found;
+    }
+    void FollowNames();
+    QList<CViewWindow*> Windows() const;
+    QList<HostedView*> Views() const;
+    QString WidthsKey(const QString& statement) const;
+    void KeepWidths(const CTableView& table);
+    void KeepViews();
+    QString ViewsKey() const;
+
+    // ViewHost.
+    bool MayCloseViews() override;
+    ViewList CloseViews() override;
+    void OpenAgain(const ViewList& views) override;
+    void CloseViewOf(const ViewKey& view) override;
+
+    // What others change.
+    void RecordsChanged() override;
+    void TakeUpChanges(const HostedView* butNot);
+    void LookAtFile();
 
     DatabaseSession& session_;
     MainViewState& state_;
@@ -73,9 +145,29 @@ private:
     Settings& settings_;
     Profile& profile_;
     ShellActions* actions_;
-    CLumoView* view_;
     std::unique_ptr<OpenViews> openViews_;
-    QMenu* recentMenu_ = nullptr;
+    CLumoView* lists_;
+    QSplitter* splitter_;
+    QWidget* sidePane_;
+    SideBar* sideBar_;
+    EntryPanel* panel_;
+    EmptyPage* emptyPage_;
+    ViewTabs* tabs_;
+    QLabel* notice_;
+    QMenu* fileMenu_;
+    QMenu* databaseMenu_;
+    QMenu* windowMenu_;
+    QMenu* helpMenu_;
+    QMenu* recentMenu_;
+    QToolButton* corner_;
+    const HostedView* shownFront_ = nullptr; // whose menus are shown
+    QTimer watchTimer_;
+    QTimer tellTimer_;
+    QString watchedPath_;
+    FileState file_;
+    bool wide_ = false;
+    bool alone_ = false;
+    bool telling_ = false;
 };
 
 } // namespace mirel

@@ -57,10 +57,14 @@ void OpenViews::TableChanged(const QString& table)
 
 void OpenViews::TableDropped(const QString& table)
 {
-    for (CTableView* view : TablesOn(table))
+    for (CTableView* view : TablesOn(table)) {
+        view->GiveUpEdits();
         view->close();
-    for (CFormEngView* view : FormsOn(table))
+    }
+    for (CFormEngView* view : FormsOn(table)) {
+        view->GiveUpEdits();
         view->close();
+    }
 }
 
 bool OpenViews::Rename(const NameChange& change,

@@ -1,44 +1,40 @@
 #include "app/ui/shell_actions.h"
 
-#include "resources/string_table.h"
-#include "resources/ui/theme_icon.h"
+#include "app/ui/main_frame.h"
 
 namespace mirel {
-namespace {
 
-QString TextOf(std::u16string_view text)
+ShellActions::ShellActions(QWidget& window)
+    : CommandActions(CMainFrame::CommandTable(), window)
 {
-    return QString::fromUtf16(text.data(), qsizetype(text.size()));
+    for (const CommandRow<CMainFrame>& row : CMainFrame::CommandTable()) {
+        QAction* action = CommandActions::Of(row.def.id);
+        action->setIconText(action->text()); // buttons keep the mnemonic
+    }
+    for (QAction* action : OfEntries()) {
+        window.removeAction(action);
+        action->setShortcutContext(Qt::WidgetWithChildrenShortcut);
+    }
 }
 
-} // namespace
-
-ShellActions::ShellActions(QObject* parent)
-    : QObject(parent)
+std::vector<QAction*> ShellActions::OfEntries() const
 {
-    for (const ShellCommandDef& definition : ShellCommands()) {
-        const ShellCommand id = definition.id;
-        auto* action = new QAction(ThemeIcon(TextOf(definition.icon)), StringText(definition.text), this);
-        action->setIconText(action->text()); // buttons keep the mnemonic
-        action->setCheckable(id == ShellCommand::OpenByDoubleClicking);
-        action->setMenuRole(QAction::NoRole);
-        connect(action, &QAction::triggered, this, [this, id] { Q_EMIT Given(id); });
-        action->setShortcut(QKeySequence(TextOf(definition.keys), QKeySequence::PortableText));
-        actions_.emplace(id, action);
-    }
+    return {Of(ShellCommand::Open),   Of(ShellCommand::New),    Of(ShellCommand::Edit),
+            Of(ShellCommand::Rename), Of(ShellCommand::Delete), Of(ShellCommand::RemoveFavorites)};
 }
 
 void ShellActions::Follow(const MainViewState& state)
 {
-    for (const auto& [id, action] : actions_) {
-        const Availability now = AvailabilityOf(id, state);
-        const QString tip = StringText(now.tip);
-        const QString keys = action->shortcut().toString(QKeySequence::NativeText);
-        action->setEnabled(now.enabled);
-        action->setToolTip(keys.isEmpty() ? tip : StringText(Str::TipWithKeys, {tip, keys}));
-        action->setStatusTip(tip);
+    for (const CommandRow<CMainFrame>& row : CMainFrame::CommandTable()) {
+        if (row.state)
+            continue; // the window decides on it
+        const Availability now = AvailabilityOf(ShellCommand(row.def.id), state);
+        Show(row.def.id, {.enabled = now.enabled && row.def.built,
+                          .checked = ShellCommand(row.def.id) == ShellCommand::OpenByDoubleClicking &&
+                                     state.OpensByDoubleTap(),
+                          .tip = now.tip});
     }
-    actions_.at(ShellCommand::OpenByDoubleClicking)->setChecked(state.OpensByDoubleTap());
+    Q_EMIT followed();
 }
 
 } // namespace mirel

@@ -1,14 +1,9 @@
 #pragma once
 
-#include "resources/string_id.h"
-
-#include <optional>
-#include <span>
-#include <string_view>
-
 namespace mirel {
 
-// All that the window of a running form does on a key, a button or a menu entry.
+// All that the view of a running form does on a key, a button or a menu entry. What each is called and does stands
+// in the table in form_view_commands.cpp.
 enum class FormCommand {
     First,
     Previous,
@@ -16,6 +11,8 @@ enum class FormCommand {
     Last,
     AddRecord,
     DeleteRecord,
+    Undo,
+    Redo,
     ScrollUp,
     ScrollDown,
     ScrollBar,
@@ -34,28 +31,6 @@ enum class FormCommand {
     SortDescending,
     Options,
     EditForm,
-    Keys,
-    Help,
-    Close,
 };
-
-struct FormCommandDef {
-    FormCommand id;
-    Str text; // with its mnemonic
-    Str tip;
-    std::u16string_view icon; // name for ThemeIcon; empty: none
-    std::u16string_view keys; // in QKeySequence's portable form; empty: none
-    bool checkable = false;
-    bool built = true; // false: always disabled
-};
-std::span<const FormCommandDef> FormCommands();
-
-// The tool bar and the menus, in groups: an empty entry is a line between two.
-using FormMenuEntry = std::optional<FormCommand>;
-std::span<const FormMenuEntry> FormToolBar();
-std::span<const FormMenuEntry> FormFileMenu();
-std::span<const FormMenuEntry> FormRecordMenu();
-std::span<const FormMenuEntry> FormViewMenu();
-std::span<const FormMenuEntry> FormPopupMenu(); // on a control
 
 } // namespace mirel

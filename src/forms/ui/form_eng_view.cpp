@@ -12,7 +12,6 @@
 #include <QCloseEvent>
 #include <QHeaderView>
 #include <QInputMethod>
-#include <QMenuBar>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QScroller>
@@ -31,7 +30,7 @@ constexpr qreal kPreferredScale = 1.4; // forms are laid out for a handheld's pi
 } // namespace
 
 CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroundings, QWidget* parent)
-    : QMainWindow(parent)
+    : HostedView(parent)
     , form_(call, {.connection = surroundings.connection,
                    .database = surroundings.database,
                    .store = surroundings.store,
@@ -50,7 +49,6 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
 {
     CreateActions();
     chip_ = new FilterChip(ActionOf(FormCommand::RemoveFilter), this);
-    CreateMenus();
     CreateToolBar();
     LayOut();
     connect(surface_, &FormSurface::acted, this, &CFormEngView::ShowState);
@@ -75,10 +73,10 @@ CFormEngView::~CFormEngView() = default;
 
 void CFormEngView::LayOut()
 {
-    auto* center = new QWidget(this);
-    auto* column = new QVBoxLayout(center);
+    auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(0);
+    column->addWidget(toolBar_);
     column->addWidget(stack_, 1);
     column->addWidget(chip_);
     column->addWidget(error_);
@@ -102,7 +100,6 @@ void CFormEngView::LayOut()
     detail_->setAlternatingRowColors(true);
     detail_->setFrameShape(QFrame::NoFrame);
     detail_->setAccessibleName(StringText(Str::GridName));
-    setCentralWidget(center);
     setContextMenuPolicy(Qt::NoContextMenu);
 }
 
@@ -131,8 +128,7 @@ QSize CFormEngView::PreferredSize() const
 {
     const QSize form = (QSizeF(surface_->FormSize()) * kPreferredScale).toSize();
     const int bar = scroller_->verticalScrollBar()->sizeHint().width();
-    return form +
-           QSize(bar, menuBar()->sizeHint().height() + 2 * style()->pixelMetric(QStyle::PM_ButtonIconSize) + bar);
+    return form + QSize(bar, toolBar_->sizeHint().height() + bar);
 }
 
 // --- the form's requests ------------------------------------------------------------------------------------
@@ -162,6 +158,25 @@ void CFormEngView::closeEvent(QCloseEvent* event)
     }
     closing_ = true;
     event->accept();
+    Q_EMIT closed();
+}
+
+bool CFormEngView::MayClose()
+{
+    const bool may = closing_ || form_.LeaveRecordCheck();
+    ShowState();
+    return may;
+}
+
+void CFormEngView::GiveUpEdits()
+{
+    closing_ = true;
+}
+
+void CFormEngView::TakeUpChanges()
+{
+    form_.TakeUpChanges();
+    ShowState();
 }
 
 // --- showing ------------------------------------------------------------------------------------------------
@@ -173,6 +188,8 @@ void CFormEngView::ShowState()
     setWindowTitle(StringText(readOnly ? Str::TableViewTitleReadOnly : Str::TableViewTitle, {form_.Title()}));
     setWindowModified(form_.IsDirty());
     chip_->ShowConditions(form_.Conditions());
+    if (!form_.IsDirty())
+        Q_EMIT recordsChanged(); // or it was looked at only; whoever hears it looks for himself
     if (CurrentPage() == Page::Detail)
         ShowDetail();
     if (CurrentPage() == Page::List)
@@ -274,7 +291,12 @@ void CFormEngView::FitSurface()
 void CFormEngView::ShowScrollBar(bool shown)
 {
     scroller_->setVerticalScrollBarPolicy(shown ? Qt::ScrollBarAsNeeded : Qt::ScrollBarAlwaysOff);
-    ActionOf(FormCommand::ScrollBar)->setChecked(shown);
+    ShowActions();
+}
+
+bool CFormEngView::HasScrollBar() const
+{
+    return scroller_->verticalScrollBarPolicy() != Qt::ScrollBarAlwaysOff;
 }
 
 void CFormEngView::Scroll(int steps)
@@ -294,22 +316,22 @@ bool CFormEngView::eventFilter(QObject* watched, QEvent* event)
             return true;
         }
     }
-    return QMainWindow::eventFilter(watched, event);
+    return HostedView::eventFilter(watched, event);
 }
 
 void CFormEngView::resizeEvent(QResizeEvent* event)
 {
-    QMainWindow::resizeEvent(event);
+    HostedView::resizeEvent(event);
     // On a handheld every pixel of the bar is a button's.
     for (QAction* action : toolBar_->actions()) {
         if (action->isSeparator())
-            action->setVisible(!IsHandheldSize(size()));
+            action->setVisible(!IsHandheldSize(window()->size()));
     }
 }
 
 void CFormEngView::changeEvent(QEvent* event)
 {
-    QMainWindow::changeEvent(event);
+    HostedView::changeEvent(event);
     if (event->type() == QEvent::ApplicationFontChange)
         surface_->SetScale(surface_->Scale());
 }
@@ -317,7 +339,7 @@ void CFormEngView::changeEvent(QEvent* event)
 void CFormEngView::timerEvent(QTimerEvent* event)
 {
     if (event->timerId() != clock_.timerId()) {
-        QMainWindow::timerEvent(event);
+        HostedView::timerEvent(event);
         return;
     }
     form_.Tick();

@@ -3,9 +3,9 @@
 #include "forms/running_form.h"
 #include "forms/ui/form_command.h"
 
+#include "platform/ui/hosted_view.h"
+
 #include <QBasicTimer>
-#include <QHash>
-#include <QMainWindow>
 
 class QAction;
 class QMenu;
@@ -16,6 +16,7 @@ class QTreeWidget;
 
 namespace mirel {
 
+class CommandActions;
 class ErrorLine;
 class FilterChip;
 class FormSurface;
@@ -31,12 +32,12 @@ struct FormSurroundings {
     QString activeTable; // as in FormEnvironment
 };
 
-// The form engine's window: the surface of a running form, with its menus, tool bar and keys. Behaviour is the
+// The form engine's view: the surface of a running form, with its menus, tool bar and keys. Behaviour is the
 // running form's; the view shows its state and hands it the user's actions.
 //
-// Closing asks about unsaved changes, and the window stays when the user says No. A form that is done closes its
-// window by itself, after the call that ended it.
-class CFormEngView : public QMainWindow, private FormHost {
+// Closing asks about unsaved changes, and the view stays when the user says No. A form that is done closes its
+// view by itself, after the call that ended it.
+class CFormEngView : public HostedView, private FormHost {
     Q_OBJECT
 
 public:
@@ -48,17 +49,20 @@ public:
 
     const RunningForm& Form() const { return form_; }
     FormSurface& Surface() { return *surface_; }
-    // A window for which the whole form is in sight.
-    QSize PreferredSize() const;
+    QSize PreferredSize() const override;
+    QList<QMenu*> Menus() const override { return menus_; }
+    QList<KeyHint> Keys() const override;
+    bool MayClose() override;
+    void GiveUpEdits() override;
+    void TakeUpChanges() override;
     void ChangeSettings(const FormViewSettings& settings);
     // When others have changed the structure of what it shows.
     void RunAgain();
 
 Q_SIGNALS:
-    void formCalled(const mirel::FormCall& call);                  // CALL FORM: to run in a window of its own
+    void formCalled(const mirel::FormCall& call);                  // CALL FORM: to run in a view of its own
     void dataChanged();                                            // data of the database are not what they were
     void settingsChanged(const mirel::FormViewSettings& settings); // by the user; in force here already
-    void keysRequested();
 
 protected:
     void closeEvent(QCloseEvent* event) override;
@@ -73,14 +77,11 @@ private:
     void DataChanged() override;
 
     void CreateActions();
-    void CreateMenus();
     void CreateToolBar();
-    void FillMenu(QMenu* menu, std::span<const FormMenuEntry> entries);
     void LayOut();
-    QAction* ActionOf(FormCommand id) const { return actions_.value(id); }
+    QAction* ActionOf(FormCommand id) const;
 
-    void Do(FormCommand id);
-    bool RunInForm(FormCommand id); // false: it is no command of the running form's
+    struct Commands;
     void ShowState();
     void ShowActions();
     // What is wrong with the first text that cannot be stored; not with the one that is being typed.
@@ -94,6 +95,7 @@ private:
     void SortByHeader(int field);
     void FitSurface();
     void Scroll(int steps);
+    bool HasScrollBar() const;
     void ShowScrollBar(bool shown);
     void Copy();
     void Paste();
@@ -102,7 +104,8 @@ private:
     int CommandControl() const { return popupControl_ >= 0 ? popupControl_ : lastFocused_; }
 
     RunningForm form_;
-    QHash<FormCommand, QAction*> actions_;
+    CommandActions* actions_ = nullptr;
+    QList<QMenu*> menus_;
     QStackedWidget* stack_;
     QScrollArea* scroller_;
     FormSurface* surface_;

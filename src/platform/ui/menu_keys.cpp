@@ -8,12 +8,20 @@
 #include <memory>
 
 namespace mirel {
+namespace {
 
-void LeaveOutKeysWhenSmall(QMenu& menu, const QWidget& window)
+constexpr const char* kDone = "leavesOutKeys";
+
+} // namespace
+
+void LeaveOutKeysWhenSmall(QMenu& menu, const QWidget& part)
 {
+    if (menu.property(kDone).toBool())
+        return; // a menu can be filled more than once
+    menu.setProperty(kDone, true);
     const auto kept = std::make_shared<QHash<QAction*, QKeySequence>>();
-    QObject::connect(&menu, &QMenu::aboutToShow, &menu, [&menu, &window, kept] {
-        if (!IsHandheldSize(window.size()))
+    QObject::connect(&menu, &QMenu::aboutToShow, &menu, [&menu, &part, kept] {
+        if (!IsHandheldSize(part.window()->size()))
             return;
         for (QAction* action : menu.actions()) {
             if (action->shortcut().isEmpty())

@@ -34,8 +34,9 @@ bool IsHandheldSize(QSize window)
 
 void FillSmallWindow(QWidget& dialog, const QWidget& window)
 {
-    if (IsHandheldSize(window.size()))
-        dialog.setGeometry(window.geometry());
+    const QWidget& whole = *window.window(); // a view may be a part of it
+    if (IsHandheldSize(whole.size()))
+        dialog.setGeometry(whole.geometry());
 }
 
 } // namespace mirel

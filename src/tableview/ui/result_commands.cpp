@@ -12,8 +12,6 @@
 
 namespace mirel {
 
-using Command = TableCommand;
-
 ResultCommands::ResultCommands(RecordBrowser& browser, DbConnection& connection, UserPrompt& prompt, QWidget& view)
     : QObject(&view)
     , browser_(browser)
@@ -23,62 +21,29 @@ ResultCommands::ResultCommands(RecordBrowser& browser, DbConnection& connection,
 {
 }
 
-bool ResultCommands::CanDo(TableCommand command) const
+bool ResultCommands::CanOpenQuery() const
 {
-    const bool hasRecord = browser_.SelectedRecord() >= 0;
-    switch (command) {
-    case Command::FilterExpression:
-    case Command::SortExpression:
-    case Command::Aggregate:
-    case Command::Sum:
-    case Command::Max:
-    case Command::Min:
-    case Command::Avg:
-    case Command::ExportCsv:
-        return hasRecord;
-    case Command::EditAll:
-    case Command::DeleteAll:
-        return hasRecord && browser_.CanUpdate();
-    case Command::UpdateAll:
-        return hasRecord && browser_.CanEdit();
-    case Command::OpenQuery:
-        return store_ && !store_->Queries().empty();
-    case Command::SaveQuery:
-        return store_ && !store_->Path().isEmpty() && browser_.IsOpen();
-    default: // none of these
-        return false;
-    }
+    return store_ && !store_->Queries().empty();
 }
 
-std::optional<bool> ResultCommands::Do(TableCommand command)
+bool ResultCommands::CanSaveQuery() const
 {
-    BulkCommands bulk(browser_, prompt_);
-    switch (command) {
-    case Command::FilterExpression:
-        return FilterByExpression();
-    case Command::SortExpression:
-        return SortByExpression();
-    case Command::DeleteAll:
-        return bulk.DeleteAll();
-    case Command::UpdateAll:
-        return bulk.UpdateAll();
-    case Command::Sum:
-        return bulk.ShowAggregate(Aggregate::Sum);
-    case Command::Max:
-        return bulk.ShowAggregate(Aggregate::Max);
-    case Command::Min:
-        return bulk.ShowAggregate(Aggregate::Min);
-    case Command::Avg:
-        return bulk.ShowAggregate(Aggregate::Avg);
-    case Command::OpenQuery:
-        return OpenQuery();
-    case Command::SaveQuery:
-        return SaveQuery();
-    case Command::ExportCsv:
-        return Export();
-    default: // none of these
-        return std::nullopt;
-    }
+    return store_ && !store_->Path().isEmpty() && browser_.IsOpen();
+}
+
+bool ResultCommands::DeleteAll()
+{
+    return BulkCommands(browser_, prompt_).DeleteAll();
+}
+
+bool ResultCommands::UpdateAll()
+{
+    return BulkCommands(browser_, prompt_).UpdateAll();
+}
+
+bool ResultCommands::Compute(Aggregate function)
+{
+    return BulkCommands(browser_, prompt_).ShowAggregate(function);
 }
 
 QString ResultCommands::SelectedColumn() const
@@ -119,7 +84,7 @@ bool ResultCommands::SortByExpression()
 
 bool ResultCommands::OpenQuery()
 {
-    if (!CanDo(Command::OpenQuery))
+    if (!CanOpenQuery())
         return true;
     if (!browser_.WriteEdit())
         return false;
@@ -140,7 +105,7 @@ bool ResultCommands::OpenQuery()
 
 bool ResultCommands::SaveQuery()
 {
-    if (!CanDo(Command::SaveQuery))
+    if (!CanSaveQuery())
         return true;
     if (!browser_.WriteEdit())
         return false;

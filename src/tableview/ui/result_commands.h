@@ -2,12 +2,10 @@
 
 #include "data/db_connection.h"
 #include "platform/user_prompt.h"
+#include "tableview/aggregate.h"
 #include "tableview/record_browser.h"
-#include "tableview/ui/table_command.h"
 
 #include <QObject>
-
-#include <optional>
 
 class QWidget;
 
@@ -28,9 +26,17 @@ public:
     // Where the database keeps its saved queries; null: nowhere.
     void SetStore(FormStore* store) { store_ = store; }
 
-    bool CanDo(TableCommand command) const;
-    // Empty: it is none of these commands. Otherwise whether it was carried out.
-    std::optional<bool> Do(TableCommand command);
+    // Each returns whether it was carried out; the user's Cancel counts as carried out.
+    bool FilterByExpression();
+    bool SortByExpression();
+    bool DeleteAll();
+    bool UpdateAll();
+    bool Compute(Aggregate function);
+    bool CanOpenQuery() const;
+    bool OpenQuery();
+    bool CanSaveQuery() const;
+    bool SaveQuery();
+    bool Export();
 
 Q_SIGNALS:
     void queryOpened(const QString& name);
@@ -38,11 +44,6 @@ Q_SIGNALS:
 
 private:
     QString SelectedColumn() const; // in its table; empty for an expression
-    bool FilterByExpression();
-    bool SortByExpression();
-    bool OpenQuery();
-    bool SaveQuery();
-    bool Export();
 
     RecordBrowser& browser_;
     DbConnection& connection_;

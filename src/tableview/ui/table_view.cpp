@@ -15,7 +15,6 @@
 #include "tableview/why_not_stored.h"
 
 #include <QApplication>
-#include <QCloseEvent>
 #include <QKeyEvent>
 #include <QStackedWidget>
 #include <QVBoxLayout>
@@ -34,7 +33,7 @@ using Command = TableCommand;
 
 CTableView::CTableView(DbConnection& connection, const QString& database, UserPrompt& prompt,
                        const TableViewSettings& settings, QWidget* parent)
-    : QMainWindow(parent)
+    : HostedView(parent)
     , browser_(connection, database, prompt, settings)
     , prompt_(prompt)
     , blocks_(browser_, prompt)
@@ -58,7 +57,6 @@ CTableView::CTableView(DbConnection& connection, const QString& database, UserPr
                                      .deleteRecord = ActionOf(Command::DeleteRecord),
                                      .detail = ActionOf(Command::ToggleDetail)},
                                     this);
-    CreateMenus();
     LayOut();
     ConnectParts();
     ShowState();
@@ -69,8 +67,7 @@ CTableView::~CTableView() = default;
 
 void CTableView::LayOut()
 {
-    auto* center = new QWidget(this);
-    auto* column = new QVBoxLayout(center);
+    auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(spacing::kTight);
     column->addWidget(stack_, 1);
@@ -86,7 +83,6 @@ void CTableView::LayOut()
     zoomEdit_->installEventFilter(this);
     new HoldPopup(zoomEdit_->viewport(), [this] { return browser_.Settings().holdTimeMs; });
     grid_->setAccessibleName(StringText(Str::GridName));
-    setCentralWidget(center);
     setContextMenuPolicy(Qt::NoContextMenu);
 }
 
@@ -144,11 +140,17 @@ void CTableView::ConnectParts()
     });
     // Other programs may have changed the records while the user was there.
     connect(qApp, &QGuiApplication::applicationStateChanged, this, [this](Qt::ApplicationState state) {
-        if (state != Qt::ApplicationActive)
-            return;
-        browser_.TakeUpChanges();
-        ShowState();
+        if (state == Qt::ApplicationActive && isVisible())
+            TakeUpChanges();
     });
+}
+
+void CTableView::TakeUpChanges()
+{
+    if (givenUp_)
+        return;
+    browser_.TakeUpChanges();
+    ShowState();
 }
 
 void CTableView::SetStore(FormStore& store)
@@ -223,6 +225,13 @@ void CTableView::SetWidthsByHand(const ColumnWidths& widths)
 
 // --- showing ------------------------------------------------------------------------------------------------
 
+void CTableView::Walk(bool (*call)(RecordBrowser&))
+{
+    const bool fromEditor = strip_->HasEditorFocus();
+    if (Run(call) && fromEditor)
+        grid_->setFocus();
+}
+
 bool CTableView::Settle(bool done)
 {
     if (!done && browser_.WriteFailed()) {
@@ -230,6 +239,10 @@ bool CTableView::Settle(bool done)
         refusal_ = {browser_.Edit().Text(), browser_.WriteError()};
     }
     ShowState();
+    if (browser_.IsOpen() && browser_.Recordset().Generation() != generation_) {
+        generation_ = browser_.Recordset().Generation();
+        Q_EMIT recordsChanged();
+    }
     if (!done && browser_.WriteFailed()) {
         QTimer::singleShot(kWriteErrorDelayMs, this, [this] {
             browser_.ShowWriteError();
@@ -302,20 +315,11 @@ void CTableView::ShowZoom()
         zoomEdit_->setFocus();
 }
 
-void CTableView::closeEvent(QCloseEvent* event)
-{
-    if (!Settle(browser_.WriteEdit())) {
-        event->ignore();
-        return;
-    }
-    event->accept();
-}
-
 // The zoomed editor keeps its keys but for those that leave it.
 bool CTableView::eventFilter(QObject* watched, QEvent* event)
 {
     if (watched != zoomEdit_ || event->type() != QEvent::KeyPress)
-        return QMainWindow::eventFilter(watched, event);
+        return HostedView::eventFilter(watched, event);
     switch (static_cast<QKeyEvent*>(event)->key()) {
     case Qt::Key_Escape:
         Do(Command::RevertEdit);
@@ -327,7 +331,7 @@ bool CTableView::eventFilter(QObject* watched, QEvent* event)
         Do(Command::PreviousCell);
         return true;
     default:
-        return QMainWindow::eventFilter(watched, event);
+        return HostedView::eventFilter(watched, event);
     }
 }
 

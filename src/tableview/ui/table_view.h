@@ -1,13 +1,12 @@
 #pragma once
 
+#include "platform/ui/hosted_view.h"
 #include "platform/ui/view_look.h"
 #include "tableview/block_commands.h"
 #include "tableview/column_widths.h"
 #include "tableview/record_browser.h"
 #include "tableview/ui/table_command.h"
 
-#include <QHash>
-#include <QMainWindow>
 #include <QTimer>
 
 #include <functional>
@@ -19,6 +18,7 @@ class QStackedWidget;
 namespace mirel {
 
 class CellStrip;
+class CommandActions;
 class ErrorLine;
 class FilterChip;
 class FindLine;
@@ -28,11 +28,11 @@ class NavigationRow;
 class RecordGrid;
 class ResultCommands;
 
-// The window over one open result: the grid, the editor of the selected cell under it, the buttons that walk
+// The view of one open result: the grid, the editor of the selected cell under it, the buttons that walk
 // through the records. It shows what its record browser holds and hands it what the user does.
 //
-// Connection and prompt must outlive the window.
-class CTableView : public QMainWindow {
+// Connection and prompt must outlive the view.
+class CTableView : public HostedView {
     Q_OBJECT
 
 public:
@@ -45,7 +45,7 @@ public:
     bool OpenTable(const QString& table);
     bool OpenStatement(const QString& title, const QString& statement);
 
-    // Where the database keeps its saved queries, for "Open Query" and "Save As Query"; must outlive the window.
+    // Where the database keeps its saved queries, for "Open Query" and "Save As Query"; must outlive the view.
     void SetStore(FormStore& store);
 
     const RecordBrowser& Browser() const { return browser_; }
@@ -64,6 +64,14 @@ public:
     ColumnWidths WidthsByHand() const;
     void SetWidthsByHand(const ColumnWidths& widths);
 
+    QList<QMenu*> Menus() const override { return menus_; }
+    QList<KeyHint> Keys() const override;
+    bool MayClose() override { return givenUp_ || Settle(browser_.WriteEdit()); }
+    void GiveUpEdits() override { givenUp_ = true; }
+    void TakeUpChanges() override;
+
+    static std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys);
+
 Q_SIGNALS:
     // The user wants to change that of the look; whoever keeps it answers with SetLook.
     void lookRequested(mirel::LookItem item);
@@ -72,20 +80,19 @@ Q_SIGNALS:
     void queriesChanged(); // of the store
 
 protected:
-    void closeEvent(QCloseEvent* event) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     void SetTitle(const QString& title);
     void LayOut();
-    void CreateActions();
-    void CreateMenus();
-    void FillMenu(QMenu* menu, std::span<const MenuEntry> entries);
+    void CreateActions(); // and menus
     void ConnectParts();
 
+    struct Commands;
     void Do(TableCommand command);
-    void DoHere(TableCommand command); // what neither the browser nor the result's commands do
     bool Run(bool (*call)(RecordBrowser&)) { return Settle(call(browser_)); }
+    // The same; and from the editor the focus goes back to the grid.
+    void Walk(bool (*call)(RecordBrowser&));
     // After every call of the browser: shows what it holds now. When a write was refused, the user is told why
     // once the event that led here is over, and stays in the editor. Gives `done` back.
     bool Settle(bool done);
@@ -106,15 +113,15 @@ private:
     void ToggleZoom();
     void ShowPopup(const QPoint& globalPosition);
     void ShowStatement();
-    void ShowKeys();
-    QAction* ActionOf(TableCommand command) const { return actions_.value(command); }
+    QAction* ActionOf(TableCommand command) const;
 
     RecordBrowser browser_;
     UserPrompt& prompt_;
     BlockCommands blocks_;
     QString title_;
     ResultCommands* resultCommands_;
-    QHash<TableCommand, QAction*> actions_;
+    CommandActions* actions_ = nullptr;
+    QList<QMenu*> menus_;
     QStackedWidget* stack_;
     RecordGrid* grid_;
     MemoEdit* zoomEdit_;
@@ -130,8 +137,10 @@ private:
         QString text;
         QString why;
     };
-    Refusal refusal_;   // the last one of the store, and of which text
-    CellPlace notedAt_; // the note is about that cell
+    Refusal refusal_;        // the last one of the store, and of which text
+    CellPlace notedAt_;      // the note is about that cell
+    bool givenUp_ = false;   // its records are gone: nothing is read or written any more
+    quint64 generation_ = 0; // of the records, when others were told of them last
 };
 
 } // namespace mirel

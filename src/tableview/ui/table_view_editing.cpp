@@ -1,4 +1,3 @@
-#include "platform/ui/keys_dialog.h"
 #include "platform/ui/memo_edit.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
@@ -154,18 +153,6 @@ void CTableView::ChooseOptions()
 void CTableView::ShowStatement()
 {
     CStatementDialog(browser_.Statement(), this).exec();
-}
-
-void CTableView::ShowKeys()
-{
-    QList<KeyHint> rows;
-    for (const KeyLine& line : KeyList()) {
-        QStringList keys;
-        for (const QKeyCombination key : line.keys)
-            keys += QKeySequence(key).toString(QKeySequence::NativeText);
-        rows.push_back({keys.join(QStringLiteral(", ")), StringText(line.what)});
-    }
-    ShowKeyHints(*this, rows);
 }
 
 void CTableView::FocusNextPane()

@@ -1,0 +1,489 @@
+// The main window with its views: side bar and tabs when it is wide, one view in front when it is narrow.
+#include "app/ui/entry_panel.h"
+#include "app/ui/look.h"
+#include "app/ui/lumo_view.h"
+#include "app/ui/main_frame.h"
+#include "app/ui/shell_actions.h"
+#include "app/ui/side_bar.h"
+#include "app/ui/side_tree.h"
+#include "app/ui/view_tabs.h"
+#include "app/ui/view_window.h"
+#include "forms/ui/form_eng_view.h"
+#include "resources/string_table.h"
+#include "support/printing.h"
+#include "support/scripted_prompt.h"
+#include "support/sqlite_file.h"
+#include "tableview/ui/record_grid.h"
+#include "tableview/ui/table_view.h"
+
+#include <gtest/gtest.h>
+
+#include <QAbstractButton>
+#include <QAbstractSpinBox>
+#include <QApplication>
+#include <QComboBox>
+#include <QDir>
+#include <QFile>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QTabBar>
+#include <QTemporaryDir>
+#include <QTest>
+
+namespace mirel {
+namespace {
+
+using namespace Qt::StringLiterals;
+
+constexpr QSize kWide(1100, 700);
+constexpr QSize kNarrow(240, 320);
+
+const ViewKey kBirds{EntryKind::Table, u"Birds"_s};
+const ViewKey kBees{EntryKind::Table, u"Bees"_s};
+const ViewKey kBirdForm{EntryKind::Form, u"Bird form"_s};
+
+// A program over one database with tables, a form and a query.
+struct Program {
+    Program(const QString& folder, ScriptedPrompt& prompt)
+        : programFolder{folder}
+        , session(connection, programFolder, prompt)
+        , commands(session, state, settings, SampleDatabase(programFolder, {}))
+    {
+    }
+
+    ProgramFolder programFolder;
+    Profile profile{programFolder.ProfileFile()};
+    Settings settings{profile};
+    DbConnection connection;
+    DatabaseSession session;
+    MainViewState state;
+    MainViewCommands commands;
+    std::unique_ptr<CMainFrame> frame;
+};
+
+class WorkspaceTest : public ::testing::Test {
+protected:
+    static void SetUpTestSuite() { QApplication::setStyle(new TouchTargetStyle(u"Fusion"_s)); }
+
+    void SetUp() override
+    {
+        program_ = std::make_unique<Program>(folder_.path(), prompt_);
+        ASSERT_TRUE(program_->commands.NewDatabase(PathOf(u"shop.cdb"_s)));
+        Execute(u"CREATE TABLE Birds ([Name] Varchar(40),[Wings] SmallInt)"_s);
+        Execute(u"CREATE TABLE Bees (Stripes SmallInt)"_s);
+        for (const QString& name : {u"Wren"_s, u"Owl"_s, u"Rook"_s})
+            Execute(u"INSERT INTO Birds (Name,Wings) VALUES ('%1',2)"_s.arg(name));
+        AddForm();
+        program_->commands.Refill();
+        Show();
+    }
+
+    void Show()
+    {
+        program_->frame = std::make_unique<CMainFrame>(program_->session, program_->state, program_->commands,
+                                                       program_->settings, program_->profile);
+        Frame().resize(kWide);
+        Frame().show();
+        ASSERT_TRUE(QTest::qWaitForWindowActive(&Frame()));
+    }
+    // The program ends and is started again.
+    void Restart()
+    {
+        EXPECT_TRUE(Frame().close());
+        program_->commands.KeepForNextRun();
+        program_.reset();
+        program_ = std::make_unique<Program>(folder_.path(), prompt_);
+        program_->commands.RestoreLastRun({});
+        Show();
+        Frame().RestoreViews();
+    }
+
+    void Execute(const QString& statement)
+    {
+        EXPECT_TRUE(program_->session.GetCatalog().ExecuteStatement(program_->session.Path(), statement))
+            << statement.toStdString();
+    }
+    // As another program does it.
+    void ExecuteElsewhere(const QString& statement)
+    {
+        DbConnection other;
+        EXPECT_TRUE(Catalog(other, prompt_).ExecuteStatement(PathOf(u"shop.cdb"_s), statement));
+    }
+    void AddForm()
+    {
+        ControlDef box;
+        box.type = ControlType::EditBox;
+        box.name.Set(u"Name");
+        box.hasSource = 1;
+        box.SetSource(u"Birds.Name");
+        box.left = box.top = 5;
+        box.width = 100;
+        box.height = 18;
+        FormDef form;
+        form.SetName(u"Bird form");
+        form.SetTableName(u"Birds");
+        form.SetDefaultQuery(u"SELECT * FROM Birds");
+        form.defaultQueryOnStartup = 1;
+        form.AddControl(box);
+        EXPECT_TRUE(
+            program_->session.Store().Apply([&form](FormStore& store) { return store.AddForm(form), true; }));
+    }
+    QString PathOf(const QString& name) const { return QDir(folder_.path()).filePath(name); }
+
+    CMainFrame& Frame() { return *program_->frame; }
+    ViewTabs& Tabs() { return *Frame().findChild<ViewTabs*>(); }
+    QTabBar& Bar() { return *Tabs().findChild<QTabBar*>(u"views"_s); }
+    SideTree& Tree() { return *Frame().findChild<SideTree*>(); }
+    QAction* Command(ShellCommand id) { return Frame().findChild<ShellActions*>()->Of(id); }
+    CTableView* Open(const ViewKey& key) { return qobject_cast<CTableView*>(Frame().OpenView(key)); }
+    QStringList MenuTitles()
+    {
+        QStringList titles;
+        for (const QAction* action : Frame().menuBar()->actions())
+            titles += QString(action->text()).remove(u'&');
+        return titles;
+    }
+    // What a person's tap on an entry of the side bar does.
+    void TapEntry(MainTab section, int row, bool twice = false)
+    {
+        QTreeWidgetItem* heading = Tree().topLevelItem(int(section));
+        const QPoint at = Tree().visualItemRect(row < 0 ? heading : heading->child(row)).center();
+        QTest::mouseClick(Tree().viewport(), Qt::LeftButton, {}, at);
+        if (twice)
+            QTest::mouseDClick(Tree().viewport(), Qt::LeftButton, {}, at);
+    }
+    static void PassOneLook() { QTest::qWait(1300); }
+
+    QTemporaryDir folder_;
+    ScriptedPrompt prompt_;
+    std::unique_ptr<Program> program_;
+};
+
+TEST_F(WorkspaceTest, CrossingTheWidthClosesNothingAndKeepsWhatIsInFront)
+{
+    Open(kBees);
+    CTableView* birds = Open(kBirds);
+    ASSERT_TRUE(birds);
+    QTest::keyClick(birds->findChild<RecordGrid*>(), Qt::Key_M);
+    ASSERT_TRUE(birds->isWindowModified());
+    for (const QSize& size :
+         {kNarrow, kWide, QSize(200, 200), QSize(4000, 3000), QSize(639, 700), QSize(640, 480)}) {
+        Frame().resize(size);
+        QCoreApplication::processEvents();
+        const bool wide = size.width() >= CMainFrame::kLeastWideWidth;
+        EXPECT_EQ(Tabs().Count(), 2);
+        EXPECT_EQ(Tabs().Front(), birds) << size.width();
+        EXPECT_TRUE(birds->isVisible()) << size.width();
+        EXPECT_TRUE(birds->isWindowModified()) << "typed text stays";
+        EXPECT_EQ(Frame().findChild<SideBar*>()->isVisible(), wide) << size.width();
+        EXPECT_EQ(Bar().isVisible(), wide) << size.width();
+    }
+    Frame().resize(kNarrow);
+    Command(ShellCommand::ShowLists)->trigger();
+    EXPECT_TRUE(Frame().findChild<CLumoView*>()->isVisible());
+    EXPECT_EQ(Tabs().Count(), 2);
+    Command(ShellCommand::NextView)->trigger();
+    EXPECT_EQ(Tabs().Front(), birds);
+}
+
+TEST_F(WorkspaceTest, TheMenusAreThoseOfTheViewInFrontThenTheWindowsWithOneFile)
+{
+    const QStringList frames{u"Database"_s, u"Window"_s, u"Help"_s};
+    EXPECT_EQ(MenuTitles(), QStringList{u"File"_s} + frames);
+    Open(kBirds);
+    EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Edit"_s, u"Tools"_s} + frames));
+    Frame().OpenView(kBirdForm);
+    EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Record"_s, u"View"_s} + frames));
+    Frame().resize(kNarrow);
+    EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Record"_s, u"View"_s})) << "the rest is in File";
+    QStringList inFile;
+    for (const QAction* entry : Frame().menuBar()->actions().first()->menu()->actions())
+        inFile += QString(entry->text()).remove(u'&');
+    for (const QString& entry : {u"Database"_s, u"Help"_s, u"Side Bar"_s, u"Close"_s, u"Exit"_s})
+        EXPECT_EQ(inFile.count(entry), 1) << entry.toStdString();
+}
+
+TEST_F(WorkspaceTest, OpensFromTheSideBarByTheTapThatTheUserChose)
+{
+    TapEntry(MainTab::Table, 1);
+    EXPECT_EQ(program_->state.Selected()->name, u"Birds"_s);
+    EXPECT_EQ(Tabs().Count(), 0);
+    TapEntry(MainTab::Table, 1, true);
+    ASSERT_EQ(Tabs().Count(), 1);
+    EXPECT_EQ(Tabs().KeyAt(0), kBirds);
+    TapEntry(MainTab::Table, 1, true);
+    EXPECT_EQ(Tabs().Count(), 1) << "it comes forward again";
+    program_->state.SetOpensByDoubleTap(false);
+    TapEntry(MainTab::Table, 0);
+    EXPECT_EQ(Tabs().Count(), 2);
+    Tree().setFocus();
+    QTest::keyClick(&Tree(), Qt::Key_Down);
+    QTest::keyClick(&Tree(), Qt::Key_Return);
+    EXPECT_EQ(Tabs().Count(), 2) << "Birds was open";
+    EXPECT_EQ(Tabs().KeyAt(Tabs().Current()), kBirds);
+}
+
+TEST_F(WorkspaceTest, NewActsOnTheSectionOfTheCurrentEntry)
+{
+    TapEntry(MainTab::Table, 1);
+    TapEntry(MainTab::Form, 0);
+    prompt_.answers = {false};
+    Command(ShellCommand::New)->trigger();
+    ASSERT_EQ(prompt_.questions.size(), 1);
+    EXPECT_TRUE(prompt_.questions.last().contains(u"\"Birds\""_s)) << prompt_.questions.last().toStdString();
+    TapEntry(MainTab::Query, -1);
+    EXPECT_EQ(program_->state.Tab(), MainTab::Query);
+    EXPECT_FALSE(Command(ShellCommand::Delete)->isEnabled()) << "a heading is nothing to delete";
+}
+
+TEST_F(WorkspaceTest, FavoritesAreTakenOffInOneWay)
+{
+    TapEntry(MainTab::Table, 1);
+    Command(ShellCommand::AddFavorites)->trigger();
+    EXPECT_FALSE(Command(ShellCommand::RemoveFavorites)->isEnabled());
+    EXPECT_TRUE(Command(ShellCommand::Delete)->isEnabled());
+    TapEntry(MainTab::Favorites, 0);
+    EXPECT_FALSE(Command(ShellCommand::Delete)->isEnabled());
+    Command(ShellCommand::RemoveFavorites)->trigger();
+    EXPECT_TRUE(program_->session.Favorites().isEmpty());
+    EXPECT_EQ(program_->state.Entries(MainTab::Table).size(), 2U);
+}
+
+TEST_F(WorkspaceTest, TheSearchGoesThroughAllKinds)
+{
+    auto* search = Frame().findChild<QLineEdit*>(u"sideBarSearch"_s);
+    QTest::keyClicks(search, u"bird"_s);
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Table))->childCount(), 1);
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Form))->childCount(), 1);
+    TapEntry(MainTab::Form, 0, true);
+    EXPECT_EQ(Tabs().KeyAt(0), kBirdForm);
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Table))->childCount(), 1) << "choosing does not end the search";
+    QTest::keyClick(search, Qt::Key_Escape);
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Table))->childCount(), 2);
+}
+
+TEST_F(WorkspaceTest, TabsHaveTheirKeys)
+{
+    Open(kBees);
+    CTableView* birds = Open(kBirds);
+    Frame().OpenView(kBirdForm);
+    QTest::keyClick(&Frame(), Qt::Key_Tab, Qt::ControlModifier);
+    EXPECT_EQ(Tabs().Current(), 0);
+    QTest::keyClick(&Frame(), Qt::Key_Backtab, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_EQ(Tabs().Current(), 2);
+    Tabs().BringForward(1);
+    EXPECT_EQ(QApplication::focusWidget(), birds->findChild<RecordGrid*>());
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_N, Qt::ControlModifier);
+    EXPECT_EQ(birds->Browser().KnownCount(), 4) << "the view's key, not that of the side bar";
+    QTest::keyClick(&Frame(), Qt::Key_W, Qt::ControlModifier);
+    EXPECT_EQ(Tabs().Count(), 2);
+}
+
+TEST_F(WorkspaceTest, TabsComeBackInTheirOrder)
+{
+    Open(kBees);
+    Open(kBirds);
+    Frame().OpenView(kBirdForm);
+    Bar().moveTab(2, 0);
+    Tabs().BringForward(kBees);
+    Restart();
+    ASSERT_EQ(Tabs().Count(), 3);
+    EXPECT_EQ(Tabs().KeyAt(0), kBirdForm);
+    EXPECT_EQ(Tabs().KeyAt(1), kBees);
+    EXPECT_EQ(Tabs().Current(), 1);
+    EXPECT_TRUE(Tabs().Front());
+    EXPECT_FALSE(Tabs().ViewAt(2)) << "it is read when it comes to the front";
+    Tabs().BringForward(2);
+    EXPECT_TRUE(Tabs().Front());
+
+    ExecuteElsewhere(u"DROP TABLE Bees"_s);
+    Restart();
+    EXPECT_EQ(Tabs().Count(), 2);
+    EXPECT_EQ(prompt_.shown, QStringList());
+}
+
+TEST_F(WorkspaceTest, AViewMovesToAWindowOfItsOwnAndBack)
+{
+    CTableView* birds = Open(kBirds);
+    QTest::keyClick(birds->findChild<RecordGrid*>(), Qt::Key_Down);
+    Command(ShellCommand::OpenInWindow)->trigger();
+    auto* window = Frame().findChild<CViewWindow*>();
+    ASSERT_TRUE(window);
+    EXPECT_TRUE(birds->isVisible());
+    EXPECT_EQ(Tabs().Count(), 0);
+    EXPECT_TRUE(window->windowTitle().startsWith(u"Birds"_s));
+    EXPECT_EQ(Open(kBirds), birds) << "it comes forward";
+    for (const QAction* entry : window->menuBar()->actions().first()->menu()->actions()) {
+        if (entry->text() == StringText(Str::CommandShowAsTab))
+            const_cast<QAction*>(entry)->trigger();
+    }
+    EXPECT_EQ(Tabs().Front(), birds);
+    EXPECT_EQ(birds->Browser().SelectedRecord(), 1) << "as it was left";
+
+    Command(ShellCommand::OpenInWindow)->trigger();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    window = Frame().findChild<CViewWindow*>();
+    ASSERT_TRUE(window);
+    EXPECT_TRUE(window->close());
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    EXPECT_TRUE(Frame().findChildren<CTableView*>().isEmpty());
+}
+
+TEST_F(WorkspaceTest, WhatOneViewWritesTheOthersShowAtOnce)
+{
+    CTableView* birds = Open(kBirds);
+    Command(ShellCommand::OpenInWindow)->trigger();
+    Open({EntryKind::Table, u"Bees"_s});
+    QTest::keyClick(birds->findChild<RecordGrid*>(), Qt::Key_End, Qt::ControlModifier);
+    auto* form = qobject_cast<CFormEngView*>(Frame().OpenView(kBirdForm));
+    ASSERT_TRUE(form);
+    EXPECT_EQ(birds->Browser().CounterText(), u"3/3"_s);
+    for (QAction* action : form->actions()) {
+        if (action->text() == StringText(Str::FormAdd))
+            action->trigger();
+    }
+    QTest::qWait(50);
+    EXPECT_EQ(birds->Browser().CounterText(), u"3/4"_s) << "the selection stays on its record";
+}
+
+TEST_F(WorkspaceTest, TakesUpWhatOtherProgramsChange)
+{
+    const CTableView* birds = Open(kBirds);
+    QTest::qWait(100);
+    ExecuteElsewhere(u"INSERT INTO Birds (Name) VALUES ('Jay')"_s);
+    ExecuteElsewhere(u"CREATE TABLE Ants (A SmallInt)"_s);
+    PassOneLook();
+    EXPECT_EQ(birds->Browser().CounterText(), u"1/4"_s);
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Table))->childCount(), 3);
+    ExecuteElsewhere(u"DROP TABLE Birds"_s);
+    PassOneLook();
+    EXPECT_EQ(Tabs().Count(), 0) << "what it showed is gone";
+    EXPECT_EQ(prompt_.shown, QStringList());
+}
+
+TEST_F(WorkspaceTest, ADatabaseThatIsGoneIsToldOnceAndQuietly)
+{
+    Open(kBirds);
+    QTest::qWait(100);
+    ASSERT_TRUE(QFile::rename(PathOf(u"shop.cdb"_s), PathOf(u"moved.cdb"_s)));
+    PassOneLook();
+    EXPECT_EQ(prompt_.shown, QStringList());
+    EXPECT_EQ(Tabs().Count(), 1);
+    bool told = false;
+    for (const QLabel* label : Frame().findChildren<QLabel*>())
+        told = told || (label->isVisible() && label->text().startsWith(u"shop.cdb is gone"_s));
+    EXPECT_TRUE(told);
+}
+
+TEST_F(WorkspaceTest, ADroppedTableClosesItsViewAndNoOther)
+{
+    Open(kBees);
+    Open(kBirds);
+    TapEntry(MainTab::Table, 1);
+    prompt_.answers = {false};
+    Command(ShellCommand::Delete)->trigger();
+    EXPECT_EQ(Tabs().Count(), 2) << "No is harmless";
+    prompt_.answers = {true};
+    Command(ShellCommand::Delete)->trigger();
+    ASSERT_EQ(Tabs().Count(), 1);
+    EXPECT_EQ(Tabs().KeyAt(0), kBees);
+    EXPECT_EQ(prompt_.shown, QStringList());
+}
+
+TEST_F(WorkspaceTest, AnotherDatabaseThatDoesNotOpenLeavesAllAsItIs)
+{
+    Open(kBirds);
+    Open(kBees);
+    QFile letter(PathOf(u"letter.cdb"_s));
+    ASSERT_TRUE(letter.open(QIODevice::WriteOnly));
+    letter.write(QByteArray(5000, 'x'));
+    letter.close();
+    EXPECT_FALSE(program_->commands.OpenDatabase(letter.fileName()));
+    EXPECT_FALSE(program_->commands.OpenDatabase(PathOf(u"no such.cdb"_s)));
+    EXPECT_FALSE(program_->commands.NewDatabase(PathOf(u"shop.cdb"_s)));
+    EXPECT_EQ(prompt_.shown.size(), 3);
+    EXPECT_FALSE(program_->commands.DeleteDatabase(QString()));
+    EXPECT_FALSE(program_->commands.DeleteDatabase(PathOf(u"no such.cdb"_s)));
+    EXPECT_FALSE(program_->commands.DeleteDatabase(letter.fileName()));
+    EXPECT_EQ(prompt_.questions, QStringList()) << "nothing is asked about what is no database";
+    EXPECT_EQ(program_->state.DatabaseName(), u"shop.cdb"_s);
+    ASSERT_EQ(Tabs().Count(), 2);
+    EXPECT_EQ(Open(kBirds)->Browser().CounterText(), u"1/3"_s) << "it works on";
+}
+
+TEST_F(WorkspaceTest, QuestionsComeBeforeAnyViewIsClosed)
+{
+    Open(kBirds);
+    auto* form = qobject_cast<CFormEngView*>(Frame().OpenView(kBirdForm));
+    ASSERT_TRUE(form);
+    QTest::keyClicks(QApplication::focusWidget(), u"x"_s);
+    ASSERT_TRUE(form->isWindowModified());
+    prompt_.answers = {};
+    EXPECT_FALSE(program_->commands.NewDatabase(PathOf(u"other.cdb"_s)));
+    EXPECT_FALSE(QFile::exists(PathOf(u"other.cdb"_s))) << "nothing is left of it";
+    prompt_.answers = {true, true, false};
+    EXPECT_FALSE(program_->commands.DeleteDatabase(PathOf(u"shop.cdb"_s)));
+    EXPECT_FALSE(Frame().close());
+    EXPECT_EQ(Tabs().Count(), 2);
+    EXPECT_TRUE(form->isWindowModified());
+    EXPECT_EQ(program_->state.DatabaseName(), u"shop.cdb"_s);
+    prompt_.answers = {true};
+    EXPECT_TRUE(program_->commands.NewDatabase(PathOf(u"other.cdb"_s)));
+    EXPECT_EQ(Tabs().Count(), 0);
+    EXPECT_EQ(program_->state.DatabaseName(), u"other.cdb"_s);
+}
+
+TEST_F(WorkspaceTest, OneViewAloneEndsTheProgramWhenItCloses)
+{
+    Frame().BeAlone();
+    CTableView* birds = Open(kBirds);
+    ASSERT_TRUE(birds);
+    EXPECT_FALSE(Frame().findChild<SideBar*>()->isVisible());
+    EXPECT_FALSE(Bar().isVisible());
+    EXPECT_TRUE(birds->close());
+    EXPECT_FALSE(Frame().isVisible());
+}
+
+TEST_F(WorkspaceTest, NoNameAndNoNumberOfTablesIsTooMuch)
+{
+    const QString longName = u"Long & long "_s + QString(100, u'w');
+    Execute(u"CREATE TABLE [%1] (A SmallInt)"_s.arg(longName));
+    QByteArray statements = "BEGIN;";
+    for (int i = 0; i < 2000; ++i)
+        statements += "CREATE TABLE T" + QByteArray::number(i) + " (A SMALLINT);";
+    SqliteFile(PathOf(u"shop.cdb"_s)).Run(statements + "COMMIT;");
+    program_->commands.Refill();
+    Frame().ShowState();
+    EXPECT_EQ(Tree().topLevelItem(int(MainTab::Table))->childCount(), 2003);
+    ASSERT_TRUE(Open({EntryKind::Table, longName}));
+    for (int i = 0; i < 30; ++i)
+        Open({EntryKind::Table, u"T%1"_s.arg(i)});
+    for (const QSize& size : {QSize(200, 200), QSize(640, 480), kWide, QSize(4000, 3000)}) {
+        Frame().resize(size);
+        QCoreApplication::processEvents();
+        EXPECT_EQ(Frame().size(), size) << "nothing widens the window";
+    }
+}
+
+TEST_F(WorkspaceTest, EveryPartHasANameForThoseWhoDoNotSee)
+{
+    Open(kBirds);
+    Frame().OpenView(kBirdForm);
+    for (const QSize& size : {kWide, kNarrow}) {
+        Frame().resize(size);
+        Command(ShellCommand::ShowLists)->trigger();
+        QCoreApplication::processEvents();
+        for (const QWidget* widget : Frame().findChildren<QWidget*>()) {
+            if (!widget->isVisible() || widget->focusPolicy() == Qt::NoFocus || widget->focusProxy())
+                continue;
+            const auto* button = qobject_cast<const QAbstractButton*>(widget);
+            const bool named = !widget->accessibleName().isEmpty() || (button && !button->text().isEmpty()) ||
+                               (button && !button->toolTip().isEmpty());
+            EXPECT_TRUE(named) << widget->metaObject()->className() << " " << widget->objectName().toStdString();
+        }
+    }
+}
+
+} // namespace
+} // namespace mirel
