@@ -25,7 +25,7 @@ struct OpenedDatabase {
     std::unique_ptr<FormStore> store;
 };
 
-// Hears at once what changes in the session's database, whoever changed it here.
+// Hears at once what changes in the session's database.
 class SessionListener {
 public:
     virtual ~SessionListener() = default;
@@ -46,7 +46,7 @@ public:
     // gets one with its first opening; one that cannot be written is opened without stamp and store. When the file
     // is no database: false, the reason is reported, and the current one stays open.
     bool Open(const QString& path);
-    // The two halves of Open, for whoever has something to close between them. What is neither adopted nor
+    // The two halves of Open, for callers that close something between them. What is neither adopted nor
     // dismissed keeps its file open.
     std::optional<OpenedDatabase> Prepare(const QString& path);
     void Adopt(OpenedDatabase opened);
@@ -81,7 +81,7 @@ public:
     // Each must be removed before it goes.
     void AddListener(SessionListener& listener) { listeners_.push_back(&listener); }
     void RemoveListener(SessionListener& listener) { std::erase(listeners_, &listener); }
-    // Whoever wrote records calls this.
+    // Call it after writing records.
     void TellRecordsChanged();
 
 private:

@@ -21,7 +21,7 @@ public:
     ~EntrySummary();
     Q_DISABLE_COPY_MOVE(EntrySummary)
 
-    // Looks at an entry, none, or the same anew.
+    // Looks at an entry, none, or the same again.
     void LookAt(const std::optional<MainEntry>& entry);
     bool IsCounting() const { return counted_ != nullptr; }
     void CountOn(int budgetMs);

@@ -347,7 +347,7 @@ std::optional<FormCall> MainViewCommands::CallOfForm(const QString& name) const
     if (!form)
         return std::nullopt;
     FormCall call;
-    call.form.CopyFrom(*form); // the store may be loaded anew while the form runs
+    call.form.CopyFrom(*form); // the store may be loaded again while the form runs
     return call;
 }
 

@@ -61,7 +61,7 @@ public:
     void SetOpenViews(DesignHost* views) { views_ = views ? views : &noViews_; }
     DesignHost& Views() { return *views_; }
 
-    // Reads the lists of the open database anew.
+    // Reads the lists of the open database again.
     void Refill();
     // The same where another program may have changed them; true: it has.
     bool RefillIfChanged();

@@ -112,7 +112,7 @@ void CsvReader::StepOverLineEnd()
 }
 
 // Finds the first LF once for many lines: a file whose lines end with CR alone has none, and looking for it
-// anew in each line would take the square of the buffer's size.
+// again in each line would take the square of the buffer's size.
 bool CsvReader::FindLineEnd()
 {
     for (size_t searched = recordEnd_ - recordAt_;;) {

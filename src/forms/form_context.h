@@ -34,7 +34,7 @@ private:
 };
 
 // Any record of the result, as Read hands it over: for what is computed over many records without moving the
-// current one. Made anew for each result; the form's context must outlive it.
+// current one. Made again for each result; the form's context must outlive it.
 class RowContext : public EvalContext {
 public:
     // Prepares for these trees: they may name no field that was not collected before the first record is lent.

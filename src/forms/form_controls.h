@@ -42,7 +42,7 @@ public:
     // The current record in all controls that show one, without a record nothing but the time.
     enum class Edits { Drop, Keep }; // kept ones stay as long as they differ from what the record gives
     void ShowRecord(const FormSource& result, Edits edits = Edits::Drop);
-    // The aggregates, computed anew over the whole result; nothing where `computed` says that there are none.
+    // The aggregates, computed again over the whole result; nothing where `computed` says that there are none.
     void ShowAggregates(const FormSource& result, bool computed);
     std::span<ControlBinding> Bindings() { return bindings_; }
     void TouchLists(); // their rows may hold other texts

@@ -100,7 +100,7 @@ public:
     Outcome PressButton(int control);
     // Why the last press failed, where nobody was told yet; empty otherwise.
     QString WhyPressFailed() const { return whyFailed_; }
-    // Reads the items of a drop-down box anew, before its list is shown: its query may name other controls.
+    // Reads the items of a drop-down box again, before its list is shown: its query may name other controls.
     void RefreshItems(int control);
     // The button that saves; -1: the form has none.
     int FirstUpdateButton() const;
@@ -114,7 +114,7 @@ public:
     Outcome GoToRecord(qint64 record);
     Outcome AddRecord();
     Outcome DeleteRecord();
-    // Runs the current query again and shows the same record, with everything that is computed computed anew.
+    // Runs the current query again and shows the same record, with everything that is computed computed again.
     Outcome RunAgain();
     // Asks about unsaved changes, tells the host what changed and that it is to close.
     Outcome Close();

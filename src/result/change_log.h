@@ -37,7 +37,7 @@ class ChangeLog {
 public:
     using Step = std::vector<RecordChange>;
 
-    // What is more than this is not kept to be taken back: whoever changes so many cells asks first.
+    // What is more than this is not kept to be taken back: the caller asks before it changes so many cells.
     static constexpr qint64 kMostCells = 200'000;
 
     void Add(Step step); // an empty one is none

@@ -8,8 +8,8 @@ namespace mirel {
 
 // Widths and places of the grid's columns, in pixels from the left edge of the first one.
 //
-// A column fits what it has shown: it grows with wider content and never shrinks, until it is asked to fit anew. A
-// width that the user set by hand stays until then.
+// A column fits what it has shown: it grows with wider content and never shrinks, until it is asked to fit again.
+// A width that the user set by hand stays until then.
 class ColumnLayout {
 public:
     static constexpr int kNarrowestPx = 16;

@@ -33,7 +33,7 @@ QSize CompactTabBar::minimumSizeHint() const
 
 void CompactTabBar::resizeEvent(QResizeEvent* event)
 {
-    // The bar lays its tabs out anew only when it believes that they changed.
+    // The bar lays its tabs out again only when it believes that they changed.
     if (event->size().width() != event->oldSize().width() && count() > 0)
         setTabText(0, tabText(0));
     QTabBar::resizeEvent(event);

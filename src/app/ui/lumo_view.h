@@ -27,7 +27,7 @@ class CLumoView : public QWidget {
 public:
     CLumoView(MainViewState& state, ShellActions& actions, QWidget* parent = nullptr);
 
-    // Shows the state as it is now. Whoever changes it calls this.
+    // Shows the state as it is now. Call it after every change.
     void ShowState();
     void ShowRecent(const QStringList& paths);
     void SetLook(const ViewLook& look);

@@ -21,7 +21,7 @@ class SideBar : public QWidget {
 public:
     SideBar(MainViewState& state, ShellActions& actions, QWidget* parent = nullptr);
 
-    // Shows the state as it is now. Whoever changes it calls this.
+    // Shows the state as it is now. Call it after every change.
     void ShowState();
     void SetLook(const ViewLook& look);
 

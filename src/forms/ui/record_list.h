@@ -22,7 +22,7 @@ public:
 
     void SetColumns(const QStringList& names);
     const QStringList& Columns() const { return columns_; }
-    // Reads the rows in sight anew.
+    // Reads the rows in sight again.
     void SetRows(qint64 rows, qint64 selected);
     void SetSortMark(int column, Qt::SortOrder order); // -1: none
 

@@ -16,7 +16,7 @@ Value ValueOf(const Expr& literal)
     case Operation::False:
         return Value::Bool(literal.operation == Operation::True);
     case Operation::Number:
-        // As text, which is read to the last digit by whoever needs the number, and stored as it was written
+        // As text, which is read to the last digit where the number is needed, and stored as it was written
         // by a text column.
     case Operation::Text:
         return Value::Text(literal.text);

@@ -55,7 +55,7 @@ Value ValueOf(sqlite3_value* value)
 {
     switch (sqlite3_value_type(value)) {
     case SQLITE_INTEGER:
-        return Value::Text(QString::number(sqlite3_value_int64(value))); // to the last digit, whoever reads it
+        return Value::Text(QString::number(sqlite3_value_int64(value))); // to the last digit
     case SQLITE_FLOAT:
         return Value::Double(sqlite3_value_double(value));
     case SQLITE_TEXT:

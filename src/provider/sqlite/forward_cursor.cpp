@@ -108,7 +108,7 @@ Outcome ForwardCursor::FetchFurther(const CellSink& keep)
     return rest_->Read({.first = position_, .count = kBlockSize + 1, .fields = {}}, keep);
 }
 
-// Hands over the records from the current one on, running the SELECT anew: nothing was left running.
+// Hands over the records from the current one on, running the SELECT again: nothing was left running.
 Outcome ForwardCursor::Walk(const std::vector<int>& fields, const CellSink& sink)
 {
     Outcome outcome;

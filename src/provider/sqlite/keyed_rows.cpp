@@ -57,7 +57,7 @@ Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
 }
 
 // Slices pay where the condition is held against every record. Where an index leads to the records, each slice
-// would begin that search anew.
+// would begin that search again.
 Outcome KeyedRows::ChooseGathering()
 {
     gathering_ = Gathering::Whole;

@@ -178,7 +178,7 @@ void Planner::PlanColumns(const Select& select, SelectPlan& plan)
     for (const SelectColumn& column : select.columns) {
         plan.fields.push_back(FieldOf(column));
         const Expr& expression = column.expression;
-        if (expression.operation == Operation::Column) { // as it is stored: whoever reads it knows foreign dates
+        if (expression.operation == Operation::Column) { // as it is stored: its readers know foreign dates
             plan.columns.push_back(SqlWriter::Alias(size_t(expression.source)) + '.' +
                                    QuoteName(plan.fields.back().column));
         } else {

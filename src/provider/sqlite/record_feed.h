@@ -10,7 +10,7 @@ namespace mirel::sqlite {
 
 // Puts records into a table many at a time: they wait here, and a virtual table hands them over to one
 // INSERT … SELECT. That takes little more than half the time of an INSERT for each of them, which would begin and
-// end a statement, and look for the table's end, anew each time.
+// end a statement, and look for the table's end, again each time.
 //
 // Records are put cell by cell; a cell's bytes are copied.
 class RecordFeed {

@@ -28,7 +28,7 @@ class ResultRows {
 public:
     virtual ~ResultRows() = default;
 
-    // Forgets everything and begins anew.
+    // Forgets everything and begins again.
     virtual void Restart() = 0;
     // Learns positions until `wanted` of them are known, or all, or the time is over; a few in any case.
     virtual Outcome Extend(qint64 wanted, const QDeadlineTimer& until) = 0;

@@ -161,7 +161,7 @@ Outcome StaticCursor::TakeUpChanges(ProviderRecordset::Values values)
     return outcome;
 }
 
-// Positions are made anew, and the current record is looked for among them. Its values stay what they were when
+// Positions are made again, and the current record is looked for among them. Its values stay what they were when
 // they were asked for: a write compares them.
 Outcome StaticCursor::Restart()
 {
@@ -171,7 +171,7 @@ Outcome StaticCursor::Restart()
     return outcome.Ok() && (place_ == Place::On || place_ == Place::Gone) ? FindCurrent() : outcome;
 }
 
-// Row ids are given anew when a file is compacted: where the structure is another, a record with the same one but
+// Row ids are given again when a file is compacted: where the structure is another, a record with the same one but
 // other values is not the record that was current.
 bool StaticCursor::IsAnotherRecord()
 {

@@ -16,7 +16,7 @@ namespace mirel {
 class DateField;
 
 // The line under the grid: the selected field's name and one editor for its value, as text, as text with a
-// calendar for dates, or as a tick. It hands over what the user enters; whoever answers calls ShowState.
+// calendar for dates, or as a tick. It hands over what the user enters; the receiver calls ShowState.
 class CellStrip : public QWidget {
     Q_OBJECT
 

@@ -14,7 +14,7 @@ class FieldChooser : public QWidget {
     Q_OBJECT
 
 public:
-    // ToPick: fields are taken into a text, each time anew (see PickBox); else one of them is chosen.
+    // ToPick: fields are taken into a text, each time again (see PickBox); else one of them is chosen.
     enum class Use { ToChoose, ToPick };
     FieldChooser(FieldLists& lists, Use use, QWidget* parent);
 

@@ -26,7 +26,7 @@ class FilterTerm : public QWidget {
 public:
     explicit FilterTerm(QWidget* parent);
 
-    void SetType(FieldType type, FilterKind kind); // makes the list of operators anew
+    void SetType(FieldType type, FilterKind kind); // makes the list of operators again
     void SetOperator(const QString& operatorText);
     void SetValue(const QString& displayText);
     QString Operator() const;

@@ -4,7 +4,7 @@
 
 namespace mirel {
 
-// A box from which words are taken into a text, each choice anew. So its keys and the wheel open its list and
+// A box from which words are taken into a text, each choice again. So its keys and the wheel open its list and
 // choose nothing by themselves: walking past a word does not take it.
 class PickBox : public QComboBox {
     Q_OBJECT

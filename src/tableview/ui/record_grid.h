@@ -17,7 +17,7 @@ class EmptyNote;
 class GridHeader;
 
 // Draws the browser's page with its selection, and turns keys, taps, the wheel and its scroll bars into
-// requests. It changes nothing by itself: whoever answers the requests calls ShowState afterwards.
+// requests. It changes nothing by itself: the receiver of the requests calls ShowState afterwards.
 //
 // The vertical scroll bar counts the whole result, in rows. The browser must outlive the grid.
 class RecordGrid : public QAbstractScrollArea {

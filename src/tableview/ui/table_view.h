@@ -73,7 +73,7 @@ public:
     static std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys);
 
 Q_SIGNALS:
-    // The user wants to change that of the look; whoever keeps it answers with SetLook.
+    // The user wants to change that of the look; its owner answers with SetLook.
     void lookRequested(mirel::LookItem item);
     // The user has confirmed other options; they are in force already.
     void settingsChanged(const TableViewSettings& settings);
