@@ -324,7 +324,7 @@ TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
     QWidget window;
     window.resize(kUpright);
     window.show();
-    QTimer::singleShot(0, &window, [&window] {
+    QTimer::singleShot(0, &window, [] {
         QWidget* popup = QApplication::activePopupWidget();
         ASSERT_TRUE(popup);
         Paint(*popup, u"calendar"_s);

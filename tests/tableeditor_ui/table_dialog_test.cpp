@@ -104,7 +104,7 @@ protected:
     // By the keyboard alone: name, the first letters of type and index, size.
     void TypeField(const QString& name, const QString& type, const QString& size, const QString& index)
     {
-        InFieldDialog([this] { Key(Qt::Key_Insert); },
+        InFieldDialog([] { Key(Qt::Key_Insert); },
                       [&](CFieldDialog&) {
                           Keys(name);
                           Key(Qt::Key_Tab);

@@ -82,10 +82,16 @@ Hr ConvertWhole(const Value& value, Value (*make)(Whole), Value& converted)
     return Hr::Ok;
 }
 
+bool IsExactAsDouble(qint64 whole)
+{
+    const auto number = double(whole); // the greatest ones become 2^63, which is no qint64
+    return number < -double(std::numeric_limits<qint64>::min()) && qint64(number) == whole;
+}
+
 Hr ConvertDouble(const Value& value, Value& converted)
 {
     double number = value.Number();
-    if (const std::optional<qint64> whole = WholeNumberOf(value); whole && qint64(double(*whole)) != *whole) {
+    if (const std::optional<qint64> whole = WholeNumberOf(value); whole && !IsExactAsDouble(*whole)) {
         converted = Value::Whole(*whole);
         return Hr::Ok;
     }
