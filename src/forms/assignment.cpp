@@ -6,12 +6,26 @@
 #include "platform/user_locale.h"
 #include "provider/conversion.h"
 
+#include <cmath>
+#include <optional>
+
 namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
 
-// The language's rule for Yes/No: the first character decides.
+// What people type into a Yes/No field: the two words of the settings, and the usual ones.
+std::optional<bool> TypedTruth(QStringView text, EvalContext& context)
+{
+    const auto is = [&](QStringView word) { return text.compare(word, Qt::CaseInsensitive) == 0; };
+    if (is(context.YesNoWord(true)) || is(u"true") || is(u"1"))
+        return true;
+    if (is(context.YesNoWord(false)) || is(u"false") || is(u"0") || text.isEmpty())
+        return false;
+    return std::nullopt;
+}
+
+// The language's rule for what an expression comes to: the first character decides.
 bool IsTrueText(QStringView text)
 {
     return !text.isEmpty() && (text[0] == u'1' || text[0] == u'T' || text[0] == u't');
@@ -37,15 +51,29 @@ Result Evaluated(FieldAssignment& assignment, EvalContext& context, const TextOf
     return {ShownText(*assignment.tree), assignment.tree.get()};
 }
 
-bool TruthOf(const Result& result)
+// None: what was typed is neither true nor false.
+std::optional<bool> TruthOf(const Result& result, EvalContext& context)
 {
-    return result.IsYesNoField() ? result.node->valueNumber != 0 : IsTrueText(result.text.trimmed());
+    if (result.IsYesNoField())
+        return result.node->valueNumber != 0;
+    const QString text = result.text.trimmed();
+    const std::optional<bool> typed = TypedTruth(text, context);
+    return typed || !result.node ? typed : IsTrueText(text);
 }
 
-Value Unconverted(const Result& result, FieldType type)
+// A computed number loses its fraction in an integer field; a typed one is refused with it.
+QString WholeNumberText(const Result& result, const QString& text)
 {
-    if (type == FieldType::YesNo)
-        return Value::Bool(TruthOf(result));
+    const double number = result.node->valueNumber;
+    return std::trunc(number) == number ? text : NumberText(std::trunc(number));
+}
+
+Value Unconverted(const Result& result, FieldType type, EvalContext& context)
+{
+    if (type == FieldType::YesNo) {
+        const std::optional<bool> truth = TruthOf(result, context);
+        return truth ? Value::Bool(*truth) : Value::Text(result.text);
+    }
     if (IsText(type))
         return result.text.isEmpty() ? Value::Null() : Value::Text(result.text);
     const QString text = result.text.trimmed();
@@ -55,6 +83,8 @@ Value Unconverted(const Result& result, FieldType type)
         return Value::Double(result.node->valueNumber);
     if (type == FieldType::Date && result.IsDate())
         return Value::Date(result.node->valueNumber);
+    if (IsInteger(type) && result.IsNumber())
+        return Value::Text(WholeNumberText(result, text));
     return Value::Text(text);
 }
 
@@ -90,7 +120,8 @@ void CollectControlNames(const ExprNode& tree, QStringList& names)
 Hr ValueToStore(FieldAssignment& assignment, EvalContext& context, const TextOfControl& controlText, Value& value)
 {
     const Result result = Evaluated(assignment, context, controlText);
-    return ConvertForColumn(Unconverted(result, assignment.type), assignment.type, assignment.size, value);
+    return ConvertForColumn(Unconverted(result, assignment.type, context), assignment.type, assignment.size,
+                            value);
 }
 
 QString LiteralToInsert(FieldAssignment& assignment, EvalContext& context, const TextOfControl& controlText)
@@ -105,8 +136,12 @@ QString LiteralToInsert(FieldAssignment& assignment, EvalContext& context, const
         return u"NULL"_s;
     if (assignment.type == FieldType::Date)
         return QuoteText(text);
-    if (assignment.type == FieldType::YesNo && result.IsYesNoField())
-        return TruthOf(result) ? u"1"_s : u"0"_s;
+    if (assignment.type == FieldType::YesNo) {
+        const std::optional<bool> truth = TruthOf(result, context);
+        return !truth ? QuoteText(text) : *truth ? u"1"_s : u"0"_s;
+    }
+    if (IsInteger(assignment.type) && result.IsNumber())
+        return WholeNumberText(result, text);
     if (assignment.type == FieldType::Double && result.IsNumber())
         return NumberText(result.node->valueNumber);
     return IsBareNumber(text) ? text : QuoteText(text); // quoted, for the store to read or to refuse

@@ -210,8 +210,8 @@ FormDef MakeDefaultForm(const QString& table, std::span<const ResultField> field
     return DefaultFormMaker(table, fields, style).Make();
 }
 
-std::optional<FormDef> DefaultFormOf(DbConnection& connection, const QString& database, const QString& table,
-                                     UserPrompt& prompt, const TextStyle& style)
+std::optional<FormDef> DefaultFormOf(DbConnection& connection, const DatabaseLocation& database,
+                                     const QString& table, UserPrompt& prompt, const TextStyle& style)
 {
     DbRecordset records(connection);
     const QString statement = u"SELECT * FROM "_s + FieldReference(table);

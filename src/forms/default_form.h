@@ -19,8 +19,8 @@ FormDef MakeDefaultForm(const QString& table, std::span<const ResultField> field
 
 // The same for a table of a database, whose fields are read first. Empty, and the reason reported, when that
 // fails.
-std::optional<FormDef> DefaultFormOf(DbConnection& connection, const QString& database, const QString& table,
-                                     UserPrompt& prompt, const TextStyle& style = {});
+std::optional<FormDef> DefaultFormOf(DbConnection& connection, const DatabaseLocation& database,
+                                     const QString& table, UserPrompt& prompt, const TextStyle& style = {});
 
 // `name`, or `name` with the least number from 2 on behind it that no form of the store has.
 QString FreeFormName(const FormStore& store, const QString& name);

@@ -1,5 +1,7 @@
 #include "forms/form_controls.h"
 
+#include "forms/evaluation_order.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -59,6 +61,29 @@ FormControls::FormControls(const FormDef& form)
             names_[name] = index;
     }
     MarkUpdateReferences(form);
+    OrderByReferences();
+}
+
+void FormControls::OrderByReferences()
+{
+    ControlReferences references(controls_.size());
+    for (size_t i = 0; i < controls_.size(); ++i) {
+        QStringList names;
+        if (bindings_[i].tree)
+            CollectControlNames(*bindings_[i].tree, names);
+        for (const QString& name : std::as_const(names)) {
+            if (const int control = FindInput(name); control >= 0)
+                references[i].push_back(control);
+        }
+    }
+    order_ = EvaluationOrder(references);
+    std::ranges::copy_if(order_, std::back_inserter(readers_),
+                         [&](int control) { return !references[size_t(control)].empty(); });
+}
+
+bool FormControls::ShowsRecord(size_t control) const
+{
+    return bindings_[control].tree && !bindings_[control].wholeResult;
 }
 
 void FormControls::MarkUpdateReferences(const FormDef& form)
@@ -180,10 +205,11 @@ void FormControls::ShowRecord(const FormSource& result, Edits edits)
     hasRecord_ = result.Index() >= 0;
     if (edits == Edits::Drop)
         ForgetEdits();
-    for (size_t i = 0; i < controls_.size(); ++i) {
+    for (const int control : order_) {
+        const auto i = size_t(control);
         if (controls_[i].type == ControlType::List)
             ShowPlaceInList(controls_[i], result);
-        if (!bindings_[i].tree || bindings_[i].wholeResult)
+        if (!ShowsRecord(i))
             continue;
         if (hasRecord_ || controls_[i].isClock)
             Show(i, result);
@@ -201,6 +227,13 @@ void FormControls::ShowAggregates(const FormSource& result, bool computed)
             Show(i, result);
         else
             ShowNothing(i);
+    }
+    if (!hasRecord_)
+        return;
+    // They may read an aggregate, which had its former value when the record was shown.
+    for (const int control : readers_) {
+        if (ShowsRecord(size_t(control)))
+            Show(size_t(control), result);
     }
 }
 

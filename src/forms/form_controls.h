@@ -70,6 +70,8 @@ public:
 private:
     int FindInput(QStringView name) const;
     void MarkUpdateReferences(const FormDef& form);
+    void OrderByReferences();
+    bool ShowsRecord(size_t control) const; // its own value on the current record, not one over the whole result
     void Show(size_t control, const FormSource& result);
     void ShowNothing(size_t control);
     void ShowText(ControlRun& control, const QString& text);
@@ -81,6 +83,8 @@ private:
     std::vector<ControlRun> controls_;
     std::vector<ControlBinding> bindings_; // one a control
     QHash<QString, int> names_;            // those that hold a value first
+    std::vector<int> order_;               // in which they are computed: what one reads comes before it
+    std::vector<int> readers_;             // of other controls, in that order
     bool edited_ = false;
     bool hasRecord_ = false;
     quint64 revision_ = 0;

@@ -9,7 +9,7 @@ namespace mirel {
 // it. Connection, prompt and what the context draws on must outlive it.
 class FormSource {
 public:
-    FormSource(DbConnection& connection, QString database, UserPrompt& prompt, YesNoWords words,
+    FormSource(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt, YesNoWords words,
                RecordContext::ControlTexts controlTexts, FormContext::Clock clock)
         : result_(connection, std::move(database), prompt)
         , context_(result_.Records(), std::move(words), std::move(controlTexts), std::move(clock))

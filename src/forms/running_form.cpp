@@ -56,14 +56,14 @@ ControlTextOf RunningForm::TextsForQueries() const
 }
 
 // The texts in the query's first column, each once, NULL left out.
-bool RunningForm::ReadItems(const QString& query, QStringList& items)
+bool RunningForm::ReadItems(const QString& query, OnFailure onFailure, QStringList& items)
 {
     const QString statement = CompleteQuery(query, form_.tableName.Text(), TextsForQueries());
     if (const auto known = itemsOfQuery_.find(statement); known != itemsOfQuery_.end()) {
         items = *known;
         return true;
     }
-    if (!MayRun(statement))
+    if (onFailure == OnFailure::BeSilent ? !OnlyReads(statement) : !MayRun(statement))
         return false;
     DbRecordset rows(environment_.connection);
     bool more = rows.Open(statement, environment_.database, CursorType::ForwardOnly, LockType::ReadOnly);
@@ -78,18 +78,19 @@ bool RunningForm::ReadItems(const QString& query, QStringList& items)
     }
     if (more)
         itemsOfQuery_[statement] = items;
-    else
+    else if (onFailure == OnFailure::Tell)
         ReportProviderError(environment_.prompt, &rows, rows.LastResult());
     return more;
 }
 
-bool RunningForm::FillDropDown(int control)
+bool RunningForm::FillDropDown(int control, OnFailure onFailure)
 {
     const ControlBinding& binding = controls_.Bindings()[size_t(control)];
     const bool dataIsShown = binding.isMaybeItem && !IsItem(binding, source_.Context());
     QStringList items = dataIsShown ? QStringList() : DropDownItems(binding.dropDown.data);
     QStringList fromQuery;
-    const bool filled = binding.dropDown.query.isEmpty() || ReadItems(binding.dropDown.query, fromQuery);
+    const bool filled =
+        binding.dropDown.query.isEmpty() || ReadItems(binding.dropDown.query, onFailure, fromQuery);
     items += fromQuery;
     items.removeDuplicates();
     controls_.SetItems(control, std::move(items));
@@ -102,10 +103,11 @@ void RunningForm::FillDropDowns()
     constexpr int kBudgetMs = 1000;
     QElapsedTimer timer;
     timer.start();
-    bool filled = true; // one message is enough: the next query is likely to fail likewise
-    for (int i = 0; i < int(Controls().size()) && filled && timer.elapsed() < kBudgetMs; ++i) {
-        if (controls_.Is(i, ControlType::DropDownBox))
-            filled = FillDropDown(i);
+    // A query that fails leaves its own box empty. One message is enough: the next is likely to fail likewise.
+    OnFailure onFailure = OnFailure::Tell;
+    for (int i = 0; i < int(Controls().size()) && timer.elapsed() < kBudgetMs; ++i) {
+        if (controls_.Is(i, ControlType::DropDownBox) && !FillDropDown(i, onFailure))
+            onFailure = OnFailure::BeSilent;
     }
     itemsOfQuery_.clear();
 }

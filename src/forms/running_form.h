@@ -24,7 +24,7 @@ namespace mirel {
 // What a running form works with. All of it must outlive the form.
 struct FormEnvironment {
     DbConnection& connection;
-    QString database;       // the file's full path
+    DatabaseLocation database;
     const FormStore& store; // where CALL FORM looks
     UserPrompt& prompt;
     FormHost& host;
@@ -178,14 +178,16 @@ private:
     Outcome Turn(bool can, ChangeLog::Outcome (OpenResult::*turn)());
 
     // Items of drop-down boxes.
-    [[nodiscard]] bool FillDropDown(int control);
+    // False: its query failed, which was told unless it was to be silent.
+    enum class OnFailure { Tell, BeSilent };
+    [[nodiscard]] bool FillDropDown(int control, OnFailure onFailure = OnFailure::Tell);
     void FillDropDowns();
-    [[nodiscard]] bool ReadItems(const QString& query, QStringList& items);
+    [[nodiscard]] bool ReadItems(const QString& query, OnFailure onFailure, QStringList& items);
     ControlTextOf TextsForQueries() const;
 
     // Buttons.
     Outcome RunButton(const ControlDef& button);
-    Outcome RunSelect(const ControlDef& button);
+    Outcome RunSelect(const ControlDef& button, qint64 record = -1);
     Outcome RunUpdate(const ControlDef& button);
     Outcome RunUpdateAll(const ControlDef& button);
     Outcome SaveToNoRecord(const ControlDef& button);

@@ -51,7 +51,7 @@ bool RunningForm::OpenFirstResult()
                control.option1 != 0;
     });
     if (button != form_.controls.end())
-        return RunSelect(*button) == Outcome::Done;
+        return RunSelect(*button, callRecord_) == Outcome::Done;
     if (form_.defaultQueryOnStartup != 0 && form_.defaultQuery.IsSet())
         return RunQuery(form_.defaultQuery.Text(), callRecord_) == Outcome::Done;
     if (!form_.tableName.IsEmpty())
@@ -141,7 +141,7 @@ RunningForm::Outcome RunningForm::RunButton(const ControlDef& button)
     return Outcome::Done; // so is any other number that a file may hold
 }
 
-RunningForm::Outcome RunningForm::RunSelect(const ControlDef& button)
+RunningForm::Outcome RunningForm::RunSelect(const ControlDef& button, qint64 record)
 {
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
@@ -149,7 +149,7 @@ RunningForm::Outcome RunningForm::RunSelect(const ControlDef& button)
     if (query.isEmpty())
         return Outcome::Done;
     environment_.host.lastQuery = query;
-    return RunQuery(query, -1);
+    return RunQuery(query, record);
 }
 
 RunningForm::Outcome RunningForm::RunClearForm()
@@ -316,7 +316,8 @@ RunningForm::Outcome RunningForm::SaveToNoRecord(const ControlDef& button)
 {
     if (!controls_.AreEdited())
         return Outcome::Done;
-    if (!CanUpdate() || !environment_.prompt.AskYesNo({Str::SaveAsNewRecord, {}}))
+    if (!CanUpdate() ||
+        !environment_.prompt.AskYesNoWith({Str::SaveAsNewRecord, {}}, {.preset = UserPrompt::Preset::Yes}))
         return Outcome::Stopped;
     std::vector<FieldAssignment> assignments = AssignmentsOf(button);
     std::vector<FieldChange> values;

@@ -47,10 +47,16 @@ public:
         (void)third;
         return AskYesNo(question) ? Answer::Yes : Answer::No;
     }
-    // A question with a plain line below it that says what the answer means; empty: none.
-    virtual bool AskYesNoWithNote(const UserMessage& question, const QString& note)
+    // A question with a plain line below it that says what the answer means (empty: none), and the answer that a
+    // mere Enter gives.
+    enum class Preset { No, Yes };
+    struct Details {
+        QString note;
+        Preset preset = Preset::No;
+    };
+    virtual bool AskYesNoWith(const UserMessage& question, const Details& details)
     {
-        (void)note;
+        (void)details;
         return AskYesNo(question);
     }
     virtual void Show(const UserMessage& message) = 0;

@@ -68,12 +68,20 @@ std::optional<AggregateResult> BulkRun::Sum(int field, Aggregate kind)
     return result;
 }
 
+QString BulkRun::NoteOnUndo(int fieldsOfEach) const
+{
+    if (!result_)
+        return {};
+    return StringText(result_->CanUndoAll(confirmed_, fieldsOfEach) ? Str::UndoBringsBack
+                                                                    : Str::UndoCannotBringBack);
+}
+
 bool BulkRun::AskDeleteAll()
 {
     confirmed_ = records_.RecordCount();
     const QString count = QString::number(confirmed_);
     return prompt_.AskYesNo({Str::DeleteAllQuestion, {count}}) &&
-           prompt_.AskYesNo({Str::DeleteAllReally, {count}});
+           prompt_.AskYesNoWith({Str::DeleteAllReally, {count}}, {.note = NoteOnUndo(records_.FieldCount())});
 }
 
 bool BulkRun::AskUpdateAll(int field, const QString& shownValue)
@@ -81,7 +89,7 @@ bool BulkRun::AskUpdateAll(int field, const QString& shownValue)
     confirmed_ = records_.RecordCount();
     const QString count = QString::number(confirmed_);
     return prompt_.AskYesNo({Str::UpdateAllQuestion, {count, records_.FieldName(field), shownValue}}) &&
-           prompt_.AskYesNo({Str::UpdateAllReally, {count}});
+           prompt_.AskYesNoWith({Str::UpdateAllReally, {count}}, {.note = NoteOnUndo(1)});
 }
 
 bool BulkRun::DeleteAll()

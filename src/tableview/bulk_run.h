@@ -46,6 +46,8 @@ public:
 private:
     using Work = std::function<bool(const BulkProgress&)>;
 
+    // Whether Undo can take the run back, for people to know before they answer; empty where nothing is undone.
+    QString NoteOnUndo(int fieldsOfEach) const;
     bool Run(Str what, qint64 total, const Work& work);
     bool Change(Str what, const std::function<bool(qint64 confirmed, const BulkProgress&)>& change);
     Hr LastResult() const { return result_ ? result_->LastResult() : records_.LastResult(); }

@@ -314,7 +314,7 @@ TEST_F(Walk, GoesThroughTheMessageBoxes)
         look(u"box-long"_s);
         boxes.ShowError(QString(u"A path without a blank: "_s) + QString(3000, u'p'));
         look(u"box-question"_s);
-        (void)boxes.AskYesNoWithNote({Str::DeleteAllReally, {u"10000"_s}}, u"Undo takes this back."_s);
+        (void)boxes.AskYesNoWith({Str::DeleteAllReally, {u"10000"_s}}, {.note = u"Undo takes this back."_s});
         EXPECT_EQ(met, 3);
     }
 }

@@ -71,6 +71,9 @@ TEST_F(FormButtonsTest, UpdateConvertsForTheField)
         {u"Small", u"&free", u"40000", u"refused (80040E57)"},
         {u"Small", u"&free", u"twelve", u"refused (80040E07)"},
         {u"Small", u"&free", u" ", u"NULL"},
+        {u"Small", u"[ID]*12.9", u"", u"12"}, // computed ones lose their fraction
+        {u"Small", u"0-[ID]*12.9", u"", u"-12"},
+        {u"Small", u"[ID]*40000.5", u"", u"refused (80040E57)"},
         {u"Small", u"[ID]*0.1*30", u"", u"3"}, // as the language writes numbers: the last digits do not count
         {u"Price", u"&free", u"-0.1", u"-0.1"},
         {u"Price", u"&free", u"1e3", u"1000"},
@@ -83,7 +86,10 @@ TEST_F(FormButtonsTest, UpdateConvertsForTheField)
         {u"Seen", u"[Seen]+1", u"", u"7/5/2001"},
         {u"Wild", u"&free", u"true", u"-1"},
         {u"Wild", u"&free", u"1", u"-1"},
-        {u"Wild", u"&free", u"yes", u"0"},
+        {u"Wild", u"&free", u"yes", u"-1"},
+        {u"Wild", u"&free", u" No ", u"0"},
+        {u"Wild", u"&free", u"maybe", u"refused (80040E07)"},
+        {u"Wild", u"UPPER('yes')", u"", u"-1"},
         {u"Wild", u"&free", u"", u"0"},
         {u"Wild", u"[ID]=2", u"", u"0"},
     };

@@ -88,6 +88,7 @@ TEST_F(RunningFormTest, OpensTheFirstQueryThatThereIs)
     EXPECT_EQ(Start(form).RecordCount(), 1);
     form.Last().option1 = 1;
     EXPECT_EQ(Start(form).RecordCount(), 3);
+    EXPECT_EQ(Start(form, {}, 2).CounterText(), u"3/3"_s);
     EXPECT_EQ(Start(form, u"SELECT * FROM Birds WHERE ID>2"_s, 1).CounterText(), u"2/2"_s);
     EXPECT_EQ(Text(u"Name"), u"O'Brien"_s);
     EXPECT_EQ(Start(form, u"SELECT * FROM Birds WHERE ID>2"_s, 7).CounterText(), u"1/2"_s);
@@ -186,6 +187,35 @@ TEST_F(RunningFormTest, FillsDropDownsFromDataAndQueries)
     EXPECT_EQ(Text(u"Price"), u"1.5"_s);
     EXPECT_EQ(items(u"Notes"), (QStringList{u"a"_s, u"b"_s}));
     EXPECT_EQ(Text(u"Notes"), u"one"_s);
+}
+
+TEST_F(RunningFormTest, AFailingDropDownLeavesTheOthersTheirItems)
+{
+    FormBuilder form(u"Birds");
+    form.DropDown(u"wrong", u"SELECT Nothing FROM Birds\x08")
+        .DropDown(u"kills", u"DELETE FROM Birds\x08"
+                            u"(all)")
+        .DropDown(u"good", u"SELECT Name FROM Birds WHERE ID<3\x08");
+    Start(form);
+    EXPECT_EQ(running->Controls()[1].items, QStringList{u"(all)"_s});
+    EXPECT_EQ(running->Controls()[2].items, (QStringList{u"Osprey"_s, u"Gull"_s}));
+    EXPECT_EQ(prompt_.shown.size(), 1) << prompt_.shown.join(u' ').toStdString();
+    EXPECT_EQ(Stored(u"SELECT COUNT(*) FROM Birds"_s), u"4"_s);
+}
+
+TEST_F(RunningFormTest, ComputesAControlAfterThoseItReads)
+{
+    FormBuilder form(u"Birds");
+    form.Edit(u"last", u"&middle+'!'").Edit(u"middle", u"&first+'?'").Edit(u"first", u"Birds.Name");
+    form.Edit(u"a", u"&b+'a'").Edit(u"b", u"&a+'b'").Edit(u"self", u"&self+'x'").Edit(u"behind", u"&a");
+    form.Whole(u"count", u"SUM([ID])").Edit(u"ofCount", u"&count+' in all'");
+    Start(form);
+    EXPECT_EQ(Text(u"last"), u"Osprey?!"_s);
+    EXPECT_EQ(Text(u"ofCount"), u"10 in all"_s);
+    EXPECT_EQ(Text(u"behind"), Text(u"a"));
+    EXPECT_EQ(Text(u"b"), Text(u"a") + u'b') << "the first listed of a circle goes first";
+    ASSERT_EQ(running->GoToNext(), Outcome::Done);
+    EXPECT_EQ(Text(u"last"), u"Gull?!"_s);
 }
 
 TEST_F(RunningFormTest, IsDirtyByWhatWouldBeLost)

@@ -120,7 +120,7 @@ QMessageBox::StandardButton Ask(const QString& text, const QString& note, QMessa
     const WorkHidden hidden;
     WideBox box(icon, text, note, buttons);
     box.setDefaultButton(preset);
-    box.setEscapeButton(preset);
+    box.setEscapeButton(buttons & QMessageBox::No ? QMessageBox::No : preset);
     const UsualCursor answering;
     return QMessageBox::StandardButton(box.exec());
 }
@@ -189,13 +189,14 @@ private:
 
 bool MessageBoxPrompt::AskYesNo(const UserMessage& question)
 {
-    return AskYesNoWithNote(question, {});
+    return AskYesNoWith(question, {});
 }
 
-bool MessageBoxPrompt::AskYesNoWithNote(const UserMessage& question, const QString& note)
+bool MessageBoxPrompt::AskYesNoWith(const UserMessage& question, const Details& details)
 {
-    return Ask(question.Text(), note, QMessageBox::Question, QMessageBox::Yes | QMessageBox::No,
-               QMessageBox::No) == QMessageBox::Yes;
+    const auto preset = details.preset == Preset::Yes ? QMessageBox::Yes : QMessageBox::No;
+    return Ask(question.Text(), details.note, QMessageBox::Question, QMessageBox::Yes | QMessageBox::No, preset) ==
+           QMessageBox::Yes;
 }
 
 UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, const UserMessage& third)

@@ -7,11 +7,12 @@ class QWidget;
 namespace mirel {
 
 // Questions and messages as boxes over the window that is in front, long work as a box with a count and Cancel.
-// Yes/No questions default to No. Texts are shown as plain text: a table's name may look like markup.
+// Yes/No questions default to No, unless they say otherwise. Texts are shown as plain text: a table's name may
+// look like markup.
 class MessageBoxPrompt : public UserPrompt {
 public:
     bool AskYesNo(const UserMessage& question) override;
-    bool AskYesNoWithNote(const UserMessage& question, const QString& note) override;
+    bool AskYesNoWith(const UserMessage& question, const Details& details) override;
     Answer AskYesNoOr(const UserMessage& question, const UserMessage& third) override;
     void Show(const UserMessage& message) override;
     void ShowError(const QString& text) override;

@@ -25,7 +25,7 @@ class RecordList;
 // What a form is run in. All of it must outlive the view.
 struct FormSurroundings {
     DbConnection& connection;
-    QString database;
+    DatabaseLocation database;
     const FormStore& store;
     UserPrompt& prompt;
     FormViewSettings settings;
