@@ -31,7 +31,7 @@ constexpr Turn kRedo{&RecordChange::Field::before, &RecordChange::Field::after, 
 // Turns changes on recordsets of their whole tables: they reach every record, in any order, at the same cost.
 class ChangeTurner {
 public:
-    ChangeTurner(DbConnection& connection, const QString& database, const Turn& turn)
+    ChangeTurner(DbConnection& connection, const DatabaseLocation& database, const Turn& turn)
         : connection_(connection)
         , database_(database)
         , turn_(turn)
@@ -112,7 +112,7 @@ private:
     }
 
     DbConnection& connection_;
-    const QString& database_;
+    const DatabaseLocation& database_;
     const Turn& turn_;
     std::map<QString, Table> tables_;
     QString failure_;
@@ -134,29 +134,31 @@ void ChangeLog::Clear()
 {
     undo_.clear();
     redo_.clear();
-    renamed_.clear();
 }
 
-RecordId ChangeLog::IdOf(const RecordChange& change) const
+void ChangeLog::Rename(const QHash<Place, RecordId>& renamed)
 {
-    RecordId id = change.id;
-    for (auto now = renamed_.constFind({change.table, id}); now != renamed_.constEnd();
-         now = renamed_.constFind({change.table, id}))
-        id = *now;
-    return id;
+    if (renamed.isEmpty())
+        return;
+    for (std::deque<Step>* steps : {&undo_, &redo_}) {
+        for (Step& step : *steps) {
+            for (RecordChange& change : step)
+                change.id = renamed.value({change.table, change.id}, change.id);
+        }
+    }
 }
 
-ChangeLog::Outcome ChangeLog::Undo(DbConnection& connection, const QString& database, UserPrompt& prompt)
+ChangeLog::Outcome ChangeLog::Undo(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt)
 {
     return Run(Direction::Undo, connection, database, prompt);
 }
 
-ChangeLog::Outcome ChangeLog::Redo(DbConnection& connection, const QString& database, UserPrompt& prompt)
+ChangeLog::Outcome ChangeLog::Redo(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt)
 {
     return Run(Direction::Redo, connection, database, prompt);
 }
 
-ChangeLog::Outcome ChangeLog::Run(Direction direction, DbConnection& connection, const QString& database,
+ChangeLog::Outcome ChangeLog::Run(Direction direction, DbConnection& connection, const DatabaseLocation& database,
                                   UserPrompt& prompt)
 {
     std::deque<Step>& source = direction == Direction::Undo ? undo_ : redo_;
@@ -184,7 +186,7 @@ ChangeLog::Outcome ChangeLog::Run(Direction direction, DbConnection& connection,
             if (progress && done % kTellEvery == 0 && !progress->Advance(done))
                 break;
             const RecordChange& change = rest.back();
-            const RecordId before = renamed.value({change.table, IdOf(change)}, IdOf(change));
+            const RecordId before = renamed.value({change.table, change.id}, change.id);
             RecordId id = before;
             const Taken what = turner.Apply(change, id);
             if (what == Taken::Refused) {
@@ -207,15 +209,12 @@ ChangeLog::Outcome ChangeLog::Run(Direction direction, DbConnection& connection,
         prompt.ShowError(ProviderErrorText(nullptr, transaction.LastResult(), transaction.ErrorContext()));
         return {};
     }
-    for (auto place = renamed.cbegin(); place != renamed.cend(); ++place) {
-        renamed_.insert(place.key(), place.value());
-        renamed_.remove({place.key().first, place.value()}); // it is that one now
-    }
     source.pop_back();
     if (!rest.empty())
         source.push_back(std::move(rest));
     if (!taken.empty())
         target.push_back(std::move(taken)); // it runs backwards there, as it has to
+    Rename(renamed);
     outcome.done = refusal.isEmpty();
     if (!outcome.done)
         prompt.ShowError(refusal);

@@ -54,21 +54,20 @@ public:
     };
     // One step, as one transaction. When a record is refused, or the user stops it, those taken back by then stay
     // taken back, and the rest of the step is still to come. Failures are reported through the prompt.
-    Outcome Undo(DbConnection& connection, const QString& database, UserPrompt& prompt);
-    Outcome Redo(DbConnection& connection, const QString& database, UserPrompt& prompt);
+    Outcome Undo(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt);
+    Outcome Redo(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt);
 
 private:
     enum class Direction { Undo, Redo };
     using Place = std::pair<QString, RecordId>; // table and record
 
-    Outcome Run(Direction direction, DbConnection& connection, const QString& database, UserPrompt& prompt);
-    RecordId IdOf(const RecordChange& change) const;
+    Outcome Run(Direction direction, DbConnection& connection, const DatabaseLocation& database,
+                UserPrompt& prompt);
+    // Records that came back under another identity, because theirs was taken, are known by it from now on.
+    void Rename(const QHash<Place, RecordId>& renamed);
 
     std::deque<Step> undo_;
     std::deque<Step> redo_;
-    // Records that came back under another identity, because theirs was taken: older steps know them by the
-    // former.
-    QHash<Place, RecordId> renamed_;
 };
 
 } // namespace mirel
