@@ -15,15 +15,22 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-QString FullPath(const QString& path)
+// A file by its full path; an address stays as it is.
+DatabaseLocation Full(const DatabaseLocation& location)
 {
-    return path.isEmpty() ? path : QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+    return location.IsFile() ? DatabaseLocation(QDir::cleanPath(QFileInfo(location.FilePath()).absoluteFilePath()))
+                             : location;
 }
 
-bool SameFile(const QString& a, const QString& b)
+bool Exists(const DatabaseLocation& location)
 {
-    return a == b ||
-           (QFileInfo::exists(a) && QFileInfo(a).canonicalFilePath() == QFileInfo(b).canonicalFilePath());
+    return location.IsAddress() || QFileInfo::exists(location.FilePath());
+}
+
+bool IsSame(const DatabaseLocation& a, const DatabaseLocation& b)
+{
+    return a == b || (a.IsFile() && b.IsFile() && Exists(a) &&
+                      QFileInfo(a.FilePath()).canonicalFilePath() == QFileInfo(b.FilePath()).canonicalFilePath());
 }
 
 } // namespace
@@ -43,25 +50,25 @@ DatabaseSession::~DatabaseSession()
     Close();
 }
 
-bool DatabaseSession::Open(const QString& path)
+bool DatabaseSession::Open(const DatabaseLocation& location)
 {
-    if (path.isEmpty() || IsCurrent(path))
+    if (location.IsEmpty() || IsCurrent(location))
         Close();
-    if (path.isEmpty())
+    if (location.IsEmpty())
         return true;
-    std::optional<OpenedDatabase> opened = Prepare(path);
+    std::optional<OpenedDatabase> opened = Prepare(location);
     if (!opened)
         return false;
     Adopt(std::move(*opened));
     return true;
 }
 
-std::optional<OpenedDatabase> DatabaseSession::Prepare(const QString& path)
+std::optional<OpenedDatabase> DatabaseSession::Prepare(const DatabaseLocation& location)
 {
     OpenedDatabase opened;
-    opened.path = FullPath(path);
+    opened.location = Full(location);
     opened.store = std::make_unique<FormStore>();
-    if (!FindOrMakeStamp(opened.path, opened.stamp)) {
+    if (!FindOrMakeStamp(opened.location, opened.stamp)) {
         Dismiss(opened);
         return std::nullopt;
     }
@@ -75,25 +82,26 @@ std::optional<OpenedDatabase> DatabaseSession::Prepare(const QString& path)
 
 void DatabaseSession::Adopt(OpenedDatabase opened)
 {
-    if (!IsCurrent(opened.path))
+    if (!IsCurrent(opened.location))
         Close();
-    path_ = std::move(opened.path);
+    location_ = std::move(opened.location);
     stamp_ = std::move(opened.stamp);
     sideFile_ = std::move(opened.sideFile);
     favorites_ = std::move(opened.favorites);
     store_ = std::move(opened.store);
-    settings_.AddRecentDatabase(path_); // a profile that cannot be written costs the list of recent ones alone
+    settings_.AddRecentDatabase(
+        location_.Text()); // a profile that cannot be written costs the list of recent ones alone
 }
 
 void DatabaseSession::Dismiss(const OpenedDatabase& opened)
 {
-    if (!IsCurrent(opened.path) && connection_.Provider())
-        connection_.Provider()->CloseDatabase(opened.path);
+    if (!IsCurrent(opened.location) && connection_.Provider())
+        connection_.Provider()->CloseDatabase(opened.location);
 }
 
-bool DatabaseSession::IsCurrent(const QString& path) const
+bool DatabaseSession::IsCurrent(const DatabaseLocation& location) const
 {
-    return IsOpen() && SameFile(FullPath(path), path_);
+    return IsOpen() && IsSame(Full(location), location_);
 }
 
 void DatabaseSession::TellRecordsChanged()
@@ -102,14 +110,14 @@ void DatabaseSession::TellRecordsChanged()
         listener->RecordsChanged();
 }
 
-bool DatabaseSession::FindOrMakeStamp(const QString& path, QString& stamp)
+bool DatabaseSession::FindOrMakeStamp(const DatabaseLocation& location, QString& stamp)
 {
-    if (!catalog_.FindDatabaseStamp(path, stamp))
+    if (!catalog_.FindDatabaseStamp(location, stamp))
         return false;
-    if (!stamp.isEmpty() || !catalog_.EnsureSystemTable(path, folder_.FormsFolder(), stamp))
+    if (!stamp.isEmpty() || !catalog_.EnsureSystemTable(location, folder_.FormsFolder(), stamp))
         return true;
     // Another program may have had the same thought: both then go by the older stamp.
-    return catalog_.FindDatabaseStamp(path, stamp);
+    return catalog_.FindDatabaseStamp(location, stamp);
 }
 
 void DatabaseSession::LoadStore(OpenedDatabase& opened)
@@ -133,39 +141,39 @@ void DatabaseSession::LoadStore(OpenedDatabase& opened)
 
 void DatabaseSession::Close()
 {
-    if (!path_.isEmpty() && connection_.Provider())
-        connection_.Provider()->CloseDatabase(path_);
-    path_.clear();
+    if (IsOpen() && connection_.Provider())
+        connection_.Provider()->CloseDatabase(location_);
+    location_ = {};
     stamp_.clear();
     sideFile_.clear();
     favorites_.clear();
     store_ = std::make_unique<FormStore>();
 }
 
-bool DatabaseSession::Create(const QString& path)
+bool DatabaseSession::Create(const DatabaseLocation& location)
 {
-    const QString full = FullPath(path);
-    return catalog_.ExecuteStatement({}, u"CREATE DATABASE "_s + QuoteText(full)) && Open(full);
+    const DatabaseLocation full = Full(location);
+    return catalog_.ExecuteStatement({}, u"CREATE DATABASE "_s + QuoteText(full.Text())) && Open(full);
 }
 
-bool DatabaseSession::Drop(const QString& path)
+bool DatabaseSession::Drop(const DatabaseLocation& location)
 {
-    const QString full = FullPath(path);
+    const DatabaseLocation full = Full(location);
     QString stamp;
     if (!catalog_.FindDatabaseStamp(full, stamp))
         return false;
-    const QString current = path_;
+    const DatabaseLocation current = location_;
     const bool isCurrent = IsCurrent(full);
     if (isCurrent)
         Close();
     if (connection_.Provider())
         connection_.Provider()->CloseDatabase(full);
-    if (!catalog_.ExecuteStatement({}, u"DROP DATABASE "_s + QuoteText(full))) {
+    if (!catalog_.ExecuteStatement({}, u"DROP DATABASE "_s + QuoteText(full.Text()))) {
         if (isCurrent)
             Open(current);
         return false;
     }
-    settings_.ForgetDatabase(full);
+    settings_.ForgetDatabase(full.Text());
     if (stamp.isEmpty() || HasKnownCopy(full, stamp))
         return true;
     QFile::remove(SideFilePath(folder_.FormsFolder(), stamp));
@@ -175,14 +183,14 @@ bool DatabaseSession::Drop(const QString& path)
     return true;
 }
 
-bool DatabaseSession::HasKnownCopy(const QString& path, const QString& stamp)
+bool DatabaseSession::HasKnownCopy(const DatabaseLocation& location, const QString& stamp)
 {
     const QStringList known = settings_.RecentDatabases();
     return std::ranges::any_of(known, [&](const QString& other) {
-        if (other == path || !QFileInfo::exists(other))
+        if (DatabaseLocation(other) == location || !Exists(other))
             return false;
         const bool bears = catalog_.BearsStamp(other, stamp);
-        if (other != path_)
+        if (DatabaseLocation(other) != location_)
             connection_.Provider()->CloseDatabase(other);
         return bears;
     });

@@ -18,7 +18,7 @@ namespace mirel {
 
 // A database that was opened and is not yet the session's.
 struct OpenedDatabase {
-    QString path;
+    DatabaseLocation location;
     QString stamp;
     QString sideFile;
     QStringList favorites;
@@ -42,27 +42,27 @@ public:
     ~DatabaseSession();
     Q_DISABLE_COPY_MOVE(DatabaseSession)
 
-    // Opens `path` and closes the database before it; an empty path only closes. A database that has no stamp
+    // Opens `location` and closes the database before it; an empty one only closes. A database that has no stamp
     // gets one with its first opening; one that cannot be written is opened without stamp and store. When the file
     // is no database: false, the reason is reported, and the current one stays open.
-    bool Open(const QString& path);
+    bool Open(const DatabaseLocation& location);
     // The two halves of Open, for callers that close something between them. What is neither adopted nor
     // dismissed keeps its file open.
-    std::optional<OpenedDatabase> Prepare(const QString& path);
+    std::optional<OpenedDatabase> Prepare(const DatabaseLocation& location);
     void Adopt(OpenedDatabase opened);
     void Dismiss(const OpenedDatabase& opened);
-    // Whether `path` names the file that is open.
-    bool IsCurrent(const QString& path) const;
+    // Whether `location` names the file that is open.
+    bool IsCurrent(const DatabaseLocation& location) const;
     // Results that are open on the database end with it.
     void Close();
     // CREATE DATABASE, then Open. On failure the current database stays open.
-    bool Create(const QString& path);
-    // Removes the database and with it its side file and its favourites, unless one of the databases opened of
-    // late is a copy and bears the same stamp; asks nothing. On failure all is as it was.
-    bool Drop(const QString& path);
+    bool Create(const DatabaseLocation& location);
+    // Removes the database and with it its side file and its favourites, unless one of the recent databases is a
+    // copy and bears the same stamp; asks nothing. On failure all is as it was.
+    bool Drop(const DatabaseLocation& location);
 
-    bool IsOpen() const { return !path_.isEmpty(); }
-    QString Path() const { return path_; }
+    bool IsOpen() const { return !location_.IsEmpty(); }
+    const DatabaseLocation& Location() const { return location_; }
     QString Stamp() const { return stamp_; }       // empty: the database could not be written
     QString SideFile() const { return sideFile_; } // empty likewise
     // Forms and queries. Without a path, so that nothing can be saved in it, when there is no side file or it
@@ -73,7 +73,7 @@ public:
     // stamp.
     bool SetFavorites(const QStringList& favorites);
 
-    bool ListTables(QStringList& tables) { return catalog_.ListTables(path_, tables); }
+    bool ListTables(QStringList& tables) { return catalog_.ListTables(location_, tables); }
     Catalog& GetCatalog() { return catalog_; }
     DbConnection& Connection() { return connection_; }
     UserPrompt& Prompt() { return prompt_; }
@@ -85,16 +85,16 @@ public:
     void TellRecordsChanged();
 
 private:
-    bool FindOrMakeStamp(const QString& path, QString& stamp);
+    bool FindOrMakeStamp(const DatabaseLocation& location, QString& stamp);
     void LoadStore(OpenedDatabase& opened);
-    bool HasKnownCopy(const QString& path, const QString& stamp);
+    bool HasKnownCopy(const DatabaseLocation& location, const QString& stamp);
 
     DbConnection& connection_;
     ProgramFolder folder_;
     Settings settings_;
     UserPrompt& prompt_;
     Catalog catalog_;
-    QString path_;
+    DatabaseLocation location_;
     QString stamp_;
     QString sideFile_;
     QStringList favorites_;

@@ -41,7 +41,7 @@ void EntrySummary::LookAt(const std::optional<MainEntry>& entry)
 {
     const bool same = entry == entry_;
     entry_ = entry;
-    file_ = FileState::Of(session_.Path());
+    file_ = FileState::Of(session_.Location().FilePath());
     StopCounting();
     if (!same)
         records_.reset(); // or the number stays until the new one is known
@@ -49,8 +49,8 @@ void EntrySummary::LookAt(const std::optional<MainEntry>& entry)
     if (!entry_ || entry_->missing || entry_->kind != EntryKind::Table)
         return;
     counted_ = std::make_unique<DbRecordset>(session_.Connection());
-    if (!counted_->Open(u"SELECT * FROM "_s + FieldReference(entry_->name), session_.Path(), CursorType::Static,
-                        LockType::ReadOnly)) {
+    if (!counted_->Open(u"SELECT * FROM "_s + FieldReference(entry_->name), session_.Location(),
+                        CursorType::Static, LockType::ReadOnly)) {
         counted_.reset();
         return;
     }
@@ -77,7 +77,7 @@ QStringList EntrySummary::Lines() const
         lines += EntryLine();
     if (file_.exists) {
         const QString size = UserLocale::Current().Locale().formattedDataSize(file_.sizeBytes, 1);
-        lines += StringText(Str::SummaryFile, {QFileInfo(session_.Path()).fileName(), size});
+        lines += StringText(Str::SummaryFile, {QFileInfo(session_.Location().FilePath()).fileName(), size});
         lines += ChangeText(file_.changed);
     }
     return lines;

@@ -69,16 +69,16 @@ void MainViewCommands::KeepForNextRun()
             settings_.SetText(Setting::ActiveView, memory.name.toString());
     }
     settings_.SetInt(Setting::OpenByDoubleClick, state_.OpensByDoubleTap() ? 1 : 0);
-    settings_.SetText(Setting::ActiveDb, session_.Path());
+    settings_.SetText(Setting::ActiveDb, session_.Location().Text());
 }
 
 bool MainViewCommands::ReadContents(UserPrompt& prompt, DatabaseContents& contents)
 {
-    contents.path = session_.Path();
+    contents.path = session_.Location().Text();
     if (!session_.IsOpen())
         return true;
     QStringList tables;
-    if (!Catalog(session_.Connection(), prompt).ListTables(session_.Path(), tables))
+    if (!Catalog(session_.Connection(), prompt).ListTables(session_.Location(), tables))
         return false;
     for (const QString& table : std::as_const(tables))
         contents.tables.push_back({EntryKind::Table, table, {}, false});
@@ -94,8 +94,8 @@ bool MainViewCommands::ReadContents(UserPrompt& prompt, DatabaseContents& conten
 void MainViewCommands::Refill()
 {
     // Also now, not at the end alone: a program that is killed comes back to its database.
-    if (settings_.Text(Setting::ActiveDb) != session_.Path())
-        settings_.SetText(Setting::ActiveDb, session_.Path());
+    if (settings_.Text(Setting::ActiveDb) != session_.Location().Text())
+        settings_.SetText(Setting::ActiveDb, session_.Location().Text());
     DatabaseContents contents;
     (void)ReadContents(session_.Prompt(), contents);
     state_.Show(std::move(contents));
@@ -231,7 +231,7 @@ bool MainViewCommands::DropTable(const QString& name)
 {
     if (!views_->WritePending(name))
         return false;
-    DesignRun run(session_.Connection(), session_.Path(), session_.Prompt());
+    DesignRun run(session_.Connection(), session_.Location(), session_.Prompt());
     if (run.DropTable(name) != DesignRun::Outcome::Done)
         return false;
     views_->TableDropped(name);
@@ -258,7 +258,7 @@ bool MainViewCommands::RenameSelected()
 
 bool MainViewCommands::RenameTable(const QString& name, const QString& newName)
 {
-    TableDesigner designer(session_.Connection(), session_.Path(), session_.Prompt(), *views_);
+    TableDesigner designer(session_.Connection(), session_.Location(), session_.Prompt(), *views_);
     return designer.Open(name) && designer.RenameTable(newName);
 }
 
@@ -288,7 +288,7 @@ void MainViewCommands::NewForm(const QString& table)
     UserPrompt& prompt = session_.Prompt();
     if (!prompt.AskYesNo({Str::CreateFormForTable, {table}}))
         return;
-    std::optional<FormDef> form = DefaultFormOf(session_.Connection(), session_.Path(), table, prompt);
+    std::optional<FormDef> form = DefaultFormOf(session_.Connection(), session_.Location(), table, prompt);
     if (!form)
         return;
     const bool stored = session_.Store().Apply([&form](FormStore& store) {

@@ -80,7 +80,7 @@ CsvFormat FormatOfTheFiles()
 
 class TableMaker {
 public:
-    TableMaker(DatabaseSession& session, QString database, QString source)
+    TableMaker(DatabaseSession& session, DatabaseLocation database, QString source)
         : session_(session)
         , database_(std::move(database))
         , source_(std::move(source))
@@ -124,7 +124,7 @@ private:
     }
 
     DatabaseSession& session_;
-    QString database_;
+    DatabaseLocation database_;
     QString source_;
 };
 

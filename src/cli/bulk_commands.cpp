@@ -36,7 +36,8 @@ public:
     {
         if (!run_.OpenDatabase())
             return false;
-        if (records_.OpenSource(run_.SourceOf(run_.Argument(1)), run_.Session().Path(), CursorType::Static, lock))
+        if (records_.OpenSource(run_.SourceOf(run_.Argument(1)), run_.Session().Location(), CursorType::Static,
+                                lock))
             return true;
         ReportProviderError(run_.Prompt(), &records_, records_.LastResult());
         return false;

@@ -36,7 +36,7 @@ bool WriteField(Run& run, RecordWriter& writer, const QString& table, const Resu
 {
     QString index;
     int flags = 0;
-    if (!run.Session().GetCatalog().FindFieldIndex(table, field.name, run.Session().Path(), index, flags))
+    if (!run.Session().GetCatalog().FindFieldIndex(table, field.name, run.Session().Location(), index, flags))
         return false;
     QString type;
     TypeNameOfField(field.type, type);
@@ -76,7 +76,7 @@ ExitStatus RunFields(Run& run)
     DbRecordset records(run.Connection());
     if (!run.OpenDatabase())
         return ExitStatus::Failed;
-    if (!records.Open(InBrackets(table), run.Session().Path(), CursorType::ForwardOnly, LockType::ReadOnly)) {
+    if (!records.Open(InBrackets(table), run.Session().Location(), CursorType::ForwardOnly, LockType::ReadOnly)) {
         ReportProviderError(run.Prompt(), &records, records.LastResult());
         return ExitStatus::Failed;
     }

@@ -37,7 +37,7 @@ public:
         : run_(run)
         , prompt_(run.Prompt())
         , table_(run.Argument(1))
-        , design_(run.Connection(), run.Session().Path(), prompt_)
+        , design_(run.Connection(), run.Session().Location(), prompt_)
     {
     }
 
@@ -83,7 +83,7 @@ private:
     ExitStatus Change(const std::vector<ListedField>& list)
     {
         const std::optional<TableDesign> current =
-            ReadTableDesign(run_.Connection(), run_.Session().Path(), table_, prompt_);
+            ReadTableDesign(run_.Connection(), run_.Session().Location(), table_, prompt_);
         if (!current)
             return ExitStatus::Failed;
         UserMessage fault;

@@ -138,7 +138,7 @@ private:
             return false;
         const QString source = run_.Args().Text(Opt::Source);
         const CursorType cursor = CursorToUse(source);
-        if (!records_.OpenSource(run_.SourceOf(source), run_.Session().Path(), cursor, LockType::ReadOnly))
+        if (!records_.OpenSource(run_.SourceOf(source), run_.Session().Location(), cursor, LockType::ReadOnly))
             return Report();
         if (!run_.Args().Has(Opt::Record))
             return true;

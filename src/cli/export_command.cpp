@@ -56,7 +56,8 @@ bool ExportToOutput(Run& run, DbRecordset& records, const CsvExportOptions& opti
 
 bool ExportToFile(Run& run, DbRecordset& records, const CsvExportOptions& options, const QString& path)
 {
-    const CsvTarget target{.path = path, .database = run.Session().Path(), .onStop = OnStop::Discard};
+    const CsvTarget target{
+        .path = path, .database = run.Session().Location().FilePath(), .onStop = OnStop::Discard};
     const std::optional<qint64> written = ExportCsvFile(records, options, target, run.Prompt());
     run.Times().rows = written.value_or(0);
     return written.has_value();
@@ -98,7 +99,7 @@ ExitStatus RunExport(Run& run)
     if (!source)
         return ExitStatus::Failed;
     DbRecordset records(run.Connection());
-    if (!records.OpenSource(*source, run.Session().Path(), CursorType::Static, LockType::ReadOnly)) {
+    if (!records.OpenSource(*source, run.Session().Location(), CursorType::Static, LockType::ReadOnly)) {
         ReportProviderError(run.Prompt(), &records, records.LastResult());
         return ExitStatus::Failed;
     }

@@ -85,7 +85,7 @@ ExitStatus RunFormsDefault(Run& run)
     if (!store)
         return ExitStatus::Failed;
     std::optional<FormDef> form =
-        DefaultFormOf(run.Connection(), run.Session().Path(), run.Argument(1), run.Prompt());
+        DefaultFormOf(run.Connection(), run.Session().Location(), run.Argument(1), run.Prompt());
     if (!form)
         return ExitStatus::Failed;
     const bool stored = Apply(run, *store, [&form](FormStore& forms) {
@@ -128,7 +128,7 @@ ExitStatus RunFormsExport(Run& run)
         run.Prompt().Show({Str::CliFileExists, {path}});
         return ExitStatus::BadArguments;
     }
-    if (IsSameFile(path, run.Session().Path()) || IsSameFile(path, store->Path())) {
+    if (IsSameFile(path, run.Session().Location().FilePath()) || IsSameFile(path, store->Path())) {
         run.Prompt().Show({Str::FileCreationFail, {path}});
         return ExitStatus::Failed;
     }

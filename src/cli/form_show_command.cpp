@@ -61,7 +61,7 @@ private:
     {
         const Settings settings(run_.Folder().OpenProfile());
         forms_.push_back(std::make_unique<RunningForm>(call, FormEnvironment{run_.Connection(),
-                                                                             run_.Session().Path(),
+                                                                             run_.Session().Location(),
                                                                              run_.Session().Store(),
                                                                              run_.Prompt(),
                                                                              *this,

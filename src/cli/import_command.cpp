@@ -20,7 +20,7 @@ public:
     explicit ImportCommand(Run& run)
         : run_(run)
         , path_(run.PathArgument(1))
-        , database_(run.Session().Path())
+        , database_(run.Session().Location())
     {
         plan_.format = FormatOf(run.Args());
         plan_.table = TableName(run.Args().Text(Opt::Table));
@@ -151,7 +151,7 @@ private:
 
     Run& run_;
     QString path_;
-    QString database_;
+    DatabaseLocation database_;
     ImportPlan plan_;
 };
 

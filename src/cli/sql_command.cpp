@@ -65,7 +65,7 @@ bool RunStatement(Run& run, const QString& statement)
     // Only a static cursor can begin anywhere; the other one gives its first records sooner.
     const CursorType cursor = run.Args().Has(Opt::Offset) ? CursorType::Static : CursorType::ForwardOnly;
     DbRecordset records(run.Connection());
-    const bool done = records.Open(statement, run.Session().Path(), cursor, LockType::ReadOnly) &&
+    const bool done = records.Open(statement, run.Session().Location(), cursor, LockType::ReadOnly) &&
                       (records.Fields().empty() || WriteRecords(run, records));
     if (!done)
         ReportProviderError(run.Prompt(), &records, records.LastResult());

@@ -227,7 +227,7 @@ bool GuessColumns(QIODevice& file, const CsvFormat& format, ImportColumns& colum
     return true;
 }
 
-bool ImportCsv(DbConnection& connection, const QString& database, QIODevice& file, const ImportPlan& plan,
+bool ImportCsv(DbConnection& connection, const DatabaseLocation& database, QIODevice& file, const ImportPlan& plan,
                UserPrompt& prompt, ImportReport& report)
 {
     report = {};

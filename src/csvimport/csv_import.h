@@ -45,7 +45,7 @@ struct ImportReport {
 // Appends one record per line of the file to the plan's table, as one transaction. It ends at the
 // first line that fails: the failure is reported with line and column, and the records before that line stay. It
 // ends the same way, without a message, when the user stops it. False when a line failed or nothing was written.
-[[nodiscard]] bool ImportCsv(DbConnection& connection, const QString& database, QIODevice& file,
+[[nodiscard]] bool ImportCsv(DbConnection& connection, const DatabaseLocation& database, QIODevice& file,
                              const ImportPlan& plan, UserPrompt& prompt, ImportReport& report);
 
 } // namespace mirel

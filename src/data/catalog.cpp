@@ -25,12 +25,13 @@ bool IsCatalogTable(const QString& table)
            table == "MSysProcs"_L1;
 }
 
-bool Run(DbRecordset& recordset, const QString& source, const QString& database)
+bool Run(DbRecordset& recordset, const QString& source, const DatabaseLocation& database)
 {
     return recordset.Open(source, database, CursorType::ForwardOnly, LockType::ReadOnly);
 }
 
-bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& source, const QString& database)
+bool RunOrReport(UserPrompt& prompt, DbRecordset& recordset, const QString& source,
+                 const DatabaseLocation& database)
 {
     if (Run(recordset, source, database))
         return true;
@@ -48,7 +49,8 @@ bool IsBracketed(QStringView name)
 }
 
 // The first column of every row, as text.
-bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& database, QStringList& texts)
+bool ListFirstColumn(DbRecordset& rows, const QString& source, const DatabaseLocation& database,
+                     QStringList& texts)
 {
     if (!Run(rows, source, database))
         return false;
@@ -60,7 +62,7 @@ bool ListFirstColumn(DbRecordset& rows, const QString& source, const QString& da
     return true;
 }
 
-bool ReadStamp(DbRecordset& rows, const QString& database, QString& stamp)
+bool ReadStamp(DbRecordset& rows, const DatabaseLocation& database, QString& stamp)
 {
     QStringList names;
     if (!ListFirstColumn(rows, u"SELECT TableName FROM MSysTables WHERE TableName LIKE 'MirelSys%'"_s, database,
@@ -84,7 +86,7 @@ QDateTime WallClockNow()
 
 } // namespace
 
-bool Catalog::ListTables(const QString& database, QStringList& tables)
+bool Catalog::ListTables(const DatabaseLocation& database, QStringList& tables)
 {
     tables.clear();
     DbRecordset rows(connection_);
@@ -99,7 +101,7 @@ bool Catalog::ListTables(const QString& database, QStringList& tables)
     return true;
 }
 
-bool Catalog::FindDatabaseStamp(const QString& database, QString& stamp)
+bool Catalog::FindDatabaseStamp(const DatabaseLocation& database, QString& stamp)
 {
     stamp.clear();
     DbRecordset rows(connection_);
@@ -109,14 +111,14 @@ bool Catalog::FindDatabaseStamp(const QString& database, QString& stamp)
     return false;
 }
 
-bool Catalog::BearsStamp(const QString& database, const QString& stamp)
+bool Catalog::BearsStamp(const DatabaseLocation& database, const QString& stamp)
 {
     DbRecordset rows(connection_);
     QString found;
     return ReadStamp(rows, database, found) && found == stamp;
 }
 
-bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp)
+bool Catalog::EnsureSystemTable(const DatabaseLocation& database, const QString& folderOfSideFiles, QString& stamp)
 {
     stamp.clear();
     QString wanted;
@@ -132,7 +134,7 @@ bool Catalog::EnsureSystemTable(const QString& database, const QString& folderOf
     return true;
 }
 
-bool Catalog::ListFields(const QString& table, const QString& database, QStringList& fields)
+bool Catalog::ListFields(const QString& table, const DatabaseLocation& database, QStringList& fields)
 {
     fields.clear();
     DbRecordset rows(connection_);
@@ -143,8 +145,8 @@ bool Catalog::ListFields(const QString& table, const QString& database, QStringL
     return true;
 }
 
-bool Catalog::FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
-                             int& flags)
+bool Catalog::FindFieldIndex(const QString& table, const QString& field, const DatabaseLocation& database,
+                             QString& index, int& flags)
 {
     index.clear();
     flags = 0;
@@ -175,7 +177,8 @@ bool Catalog::FindFieldIndex(const QString& table, const QString& field, const Q
     return true;
 }
 
-bool Catalog::ListIndexes(const QString& table, const QString& database, std::vector<IndexDefinition>& indexes)
+bool Catalog::ListIndexes(const QString& table, const DatabaseLocation& database,
+                          std::vector<IndexDefinition>& indexes)
 {
     constexpr int kDescending = 1;
     constexpr int kUnique = 2;
@@ -207,7 +210,7 @@ bool Catalog::ListIndexes(const QString& table, const QString& database, std::ve
            });
 }
 
-bool Catalog::ExecuteStatement(const QString& database, const QString& statement)
+bool Catalog::ExecuteStatement(const DatabaseLocation& database, const QString& statement)
 {
     DbRecordset recordset(connection_);
     return RunOrReport(prompt_, recordset, statement, database);

@@ -26,23 +26,24 @@ public:
     }
 
     // The user's tables by name; the catalog's own tables and the stamp table are left out.
-    bool ListTables(const QString& database, QStringList& tables);
+    bool ListTables(const DatabaseLocation& database, QStringList& tables);
     // The stamp, empty when the database has none. False when the statement failed.
-    bool FindDatabaseStamp(const QString& database, QString& stamp);
+    bool FindDatabaseStamp(const DatabaseLocation& database, QString& stamp);
     // Whether that database has the stamp. Reports nothing: a database that cannot be read has none.
-    bool BearsStamp(const QString& database, const QString& stamp);
+    bool BearsStamp(const DatabaseLocation& database, const QString& stamp);
     // Gives the database a stamp that no file in `folderOfSideFiles` has yet. Reports no failure: a database that
     // cannot be written is opened without a stamp.
-    bool EnsureSystemTable(const QString& database, const QString& folderOfSideFiles, QString& stamp);
-    bool ListFields(const QString& table, const QString& database, QStringList& fields);
+    bool EnsureSystemTable(const DatabaseLocation& database, const QString& folderOfSideFiles, QString& stamp);
+    bool ListFields(const QString& table, const DatabaseLocation& database, QStringList& fields);
     // The index on a field: its name and flags (bit 0 descending, bit 1 unique). Without an
     // index the call succeeds too, with an empty name and flags 0.
-    bool FindFieldIndex(const QString& table, const QString& field, const QString& database, QString& index,
-                        int& flags);
+    bool FindFieldIndex(const QString& table, const QString& field, const DatabaseLocation& database,
+                        QString& index, int& flags);
     // All indexes of a table, each with its fields in their order.
-    bool ListIndexes(const QString& table, const QString& database, std::vector<IndexDefinition>& indexes);
+    bool ListIndexes(const QString& table, const DatabaseLocation& database,
+                     std::vector<IndexDefinition>& indexes);
     // Runs a statement that yields no rows.
-    bool ExecuteStatement(const QString& database, const QString& statement);
+    bool ExecuteStatement(const DatabaseLocation& database, const QString& statement);
 
 private:
     DbConnection& connection_;

@@ -32,7 +32,7 @@ bool DbRecordset::Keep(Hr result) const
     return !Failed(result);
 }
 
-bool DbRecordset::Open(const QString& source, const QString& database, CursorType cursor, LockType lock)
+bool DbRecordset::Open(const QString& source, const DatabaseLocation& database, CursorType cursor, LockType lock)
 {
     Close();
     if (!cursor_)
@@ -41,7 +41,8 @@ bool DbRecordset::Open(const QString& source, const QString& database, CursorTyp
     return open_;
 }
 
-bool DbRecordset::OpenSource(const QString& source, const QString& database, CursorType cursor, LockType lock)
+bool DbRecordset::OpenSource(const QString& source, const DatabaseLocation& database, CursorType cursor,
+                             LockType lock)
 {
     if (OnlyReads(source))
         return Open(source, database, cursor, lock);

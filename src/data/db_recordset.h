@@ -30,10 +30,11 @@ public:
 
     // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
     // with the full path `database`. CREATE and DROP DATABASE take an empty path.
-    [[nodiscard]] bool Open(const QString& source, const QString& database, CursorType cursor, LockType lock);
+    [[nodiscard]] bool Open(const QString& source, const DatabaseLocation& database, CursorType cursor,
+                            LockType lock);
     // The same for a source: what is shown, exported, summed up or changed as a whole. That is a table or a
     // SELECT; any other statement is refused before it runs (SyntaxError, with the reason as context).
-    [[nodiscard]] bool OpenSource(const QString& source, const QString& database, CursorType cursor,
+    [[nodiscard]] bool OpenSource(const QString& source, const DatabaseLocation& database, CursorType cursor,
                                   LockType lock);
     void Close();
     bool IsOpen() const { return open_; }

@@ -15,7 +15,7 @@ namespace mirel {
 // No question is asked while one lives: others wait for it. The connection must outlive it.
 class DbTransaction {
 public:
-    DbTransaction(DbConnection& connection, QString database)
+    DbTransaction(DbConnection& connection, DatabaseLocation database)
         : connection_(connection)
         , database_(std::move(database))
     {
@@ -32,7 +32,7 @@ public:
 
 private:
     DbConnection& connection_;
-    QString database_;
+    DatabaseLocation database_;
     std::unique_ptr<ProviderTransaction> transaction_;
     Hr lastResult_ = Hr::Ok;
     QString context_;

@@ -5,6 +5,7 @@
 #include "platform/hr.h"
 #include "platform/record_id.h"
 #include "platform/value.h"
+#include "provider/database_location.h"
 
 #include <QString>
 
@@ -79,10 +80,10 @@ class ProviderRecordset {
 public:
     virtual ~ProviderRecordset() = default;
 
-    // Closes what was open, then runs `source` (a statement, or the bare name of a table) on the database file
-    // whose full path is `database`; CREATE and DROP DATABASE take an empty path. On success the first record
+    // Closes what was open, then runs `source` (a statement, or the bare name of a table) on `database`,
+    // a file by its full path; CREATE and DROP DATABASE take an empty location. On success the first record
     // is current, or the result is at its end. On failure nothing is open.
-    [[nodiscard]] virtual Hr Open(const QString& source, const QString& database, CursorType cursor,
+    [[nodiscard]] virtual Hr Open(const QString& source, const DatabaseLocation& database, CursorType cursor,
                                   LockType lock) = 0;
     virtual void Close() = 0;
 
@@ -195,17 +196,17 @@ public:
     virtual std::unique_ptr<ProviderRecordset> CreateRecordset() = 0;
 
     // `columns` empty: all columns of the table. On failure null; `result` and `context` say why.
-    virtual std::unique_ptr<RecordAppender> CreateAppender(const QString& database, const QString& table,
+    virtual std::unique_ptr<RecordAppender> CreateAppender(const DatabaseLocation& database, const QString& table,
                                                            const QStringList& columns, Hr& result,
                                                            QString& context) = 0;
 
     // Takes the write lock at once, so that what is compared cannot change before it is written. On failure null;
     // `result` and `context` say why. Must be gone before the connection.
-    virtual std::unique_ptr<ProviderTransaction> BeginTransaction(const QString& database, Hr& result,
+    virtual std::unique_ptr<ProviderTransaction> BeginTransaction(const DatabaseLocation& database, Hr& result,
                                                                   QString& context) = 0;
 
     // Gives the file up. Results still open on it are closed: their calls fail with NotOpen from then on.
-    virtual void CloseDatabase(const QString& database) = 0;
+    virtual void CloseDatabase(const DatabaseLocation& database) = 0;
 };
 
 // The provider of that name ("cedb"), null when there is none.

@@ -20,7 +20,7 @@ constexpr int kFirstCountMs = 3;
 
 } // namespace
 
-OpenResult::OpenResult(DbConnection& connection, QString database, UserPrompt& prompt)
+OpenResult::OpenResult(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt)
     : connection_(connection)
     , records_(connection)
     , prompt_(prompt)

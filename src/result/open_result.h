@@ -39,7 +39,7 @@ struct SeenRecord {
 // Connection and prompt must outlive the result.
 class OpenResult {
 public:
-    OpenResult(DbConnection& connection, QString database, UserPrompt& prompt);
+    OpenResult(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt);
     Q_DISABLE_COPY_MOVE(OpenResult)
 
     // --- the statement --------------------------------------------------------------------------------------
@@ -60,7 +60,7 @@ public:
     bool CanUpdate() const { return IsOpen() && records_.Lock() != LockType::ReadOnly; }
     const QString& Statement() const { return statement_; }
     const QString& BaseStatement() const { return baseStatement_; }
-    const QString& Database() const { return database_; }
+    const DatabaseLocation& Database() const { return database_; }
     DbConnection& Connection() const { return connection_; }
 
     bool AddCondition(const QString& condition);
@@ -148,6 +148,9 @@ public:
     // then. A failure is not reported: LastResult() and LastFailure() tell it.
     bool UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress);
     bool DeleteAll(qint64 confirmed, const BulkProgress& progress);
+    // Whether a change of so many fields of so many records can be taken back: they are few enough, and all of one
+    // table.
+    bool CanUndoAll(qint64 records, int fields) const;
 
     // --- the way back -----------------------------------------------------------------------------------------
 
@@ -160,7 +163,7 @@ public:
     void Report(); // the recordset's last failure, to the user
 
 private:
-    using TurnOfLog = ChangeLog::Outcome (ChangeLog::*)(DbConnection&, const QString&, UserPrompt&);
+    using TurnOfLog = ChangeLog::Outcome (ChangeLog::*)(DbConnection&, const DatabaseLocation&, UserPrompt&);
 
     // A step that becomes too large to be kept is given up.
     class StepInProgress {
@@ -199,7 +202,6 @@ private:
     void NoteRefusal(ManyWritten& written, std::span<const FieldChange> wanted);
     std::optional<RecordChange> NewChange(RecordChange::Kind kind) const;
     void NoteDeleted(DbRecordset& table, ChangeLog::Step& step) const;
-    bool CanNoteAll(qint64 records, int fields);
     bool ChangeAll(bool isNoted, const std::function<bool(ChangeLog::Step&)>& change);
     bool UpdateAllNoted(int field, const Value& value, qint64 confirmed, const BulkProgress& progress,
                         ChangeLog::Step& step);
@@ -208,7 +210,7 @@ private:
     DbConnection& connection_;
     DbRecordset records_;
     UserPrompt& prompt_;
-    QString database_;
+    DatabaseLocation database_;
     QString baseStatement_;
     QString statement_;
     QStringList conditions_;

@@ -306,11 +306,9 @@ OpenResult::WriteAll(qint64 confirmed, const std::function<std::optional<std::ve
     });
 }
 
-// --- all records
-// --------------------------------------------------------------------------------------------------
+// --- all records ------------------------------------------------------------------------------------------------
 
-// Whether so many records of so many fields can be taken back: they are few enough, and of one table.
-bool OpenResult::CanNoteAll(qint64 records, int fields)
+bool OpenResult::CanUndoAll(qint64 records, int fields) const
 {
     return records >= 0 && records * fields <= ChangeLog::kMostCells && records_.IdInTable() == records_.Id();
 }
@@ -339,7 +337,7 @@ bool OpenResult::ChangeAll(bool isNoted, const std::function<bool(ChangeLog::Ste
 
 bool OpenResult::UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress)
 {
-    const bool isNoted = CanNoteAll(confirmed, 1);
+    const bool isNoted = CanUndoAll(confirmed, 1);
     return ChangeAll(isNoted, [&](ChangeLog::Step& step) {
         if (isNoted)
             return UpdateAllNoted(field, value, confirmed, progress, step);
@@ -390,7 +388,7 @@ bool OpenResult::UpdateAllNoted(int field, const Value& value, qint64 confirmed,
 
 bool OpenResult::DeleteAll(qint64 confirmed, const BulkProgress& progress)
 {
-    const bool isNoted = CanNoteAll(confirmed, FieldCount());
+    const bool isNoted = CanUndoAll(confirmed, FieldCount());
     return ChangeAll(isNoted, [&](ChangeLog::Step& step) {
         DbRecordset table(connection_);
         bool more = isNoted && records_.MoveFirst();

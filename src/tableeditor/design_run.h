@@ -24,7 +24,7 @@ public:
     // Done last in the transaction; false takes it back.
     using LastStep = std::function<bool()>;
 
-    DesignRun(DbConnection& connection, QString database, UserPrompt& prompt)
+    DesignRun(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt)
         : connection_(connection)
         , database_(std::move(database))
         , prompt_(prompt)
@@ -59,7 +59,7 @@ private:
     Outcome Execute(const QStringList& statements, UserPrompt& prompt);
 
     DbConnection& connection_;
-    QString database_;
+    DatabaseLocation database_;
     UserPrompt& prompt_;
 };
 

@@ -99,8 +99,8 @@ QString FreeName(const QString& wanted, const QStringList& taken)
     return name;
 }
 
-std::optional<TableDesign> ReadTableDesign(DbConnection& connection, const QString& database, const QString& table,
-                                           UserPrompt& prompt)
+std::optional<TableDesign> ReadTableDesign(DbConnection& connection, const DatabaseLocation& database,
+                                           const QString& table, UserPrompt& prompt)
 {
     TableDesign design;
     DbRecordset rows(connection);

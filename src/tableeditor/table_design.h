@@ -58,7 +58,7 @@ const IndexDefinition* OwnIndex(const TableDesign& design, const QString& field)
 QString FreeName(const QString& wanted, const QStringList& taken);
 
 // The table as it is, each field's `was` being its name. Empty, and the reason reported, when it cannot be read.
-std::optional<TableDesign> ReadTableDesign(DbConnection& connection, const QString& database, const QString& table,
-                                           UserPrompt& prompt);
+std::optional<TableDesign> ReadTableDesign(DbConnection& connection, const DatabaseLocation& database,
+                                           const QString& table, UserPrompt& prompt);
 
 } // namespace mirel

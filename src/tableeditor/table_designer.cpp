@@ -9,7 +9,8 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-TableDesigner::TableDesigner(DbConnection& connection, QString database, UserPrompt& prompt, DesignHost& host)
+TableDesigner::TableDesigner(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt,
+                             DesignHost& host)
     : connection_(connection)
     , database_(std::move(database))
     , prompt_(prompt)

@@ -39,7 +39,7 @@ public:
 // designer.
 class TableDesigner {
 public:
-    TableDesigner(DbConnection& connection, QString database, UserPrompt& prompt, DesignHost& host);
+    TableDesigner(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt, DesignHost& host);
 
     // Turns to an existing table.
     bool Open(const QString& table);
@@ -80,7 +80,7 @@ private:
     void SelectName(const QString& name);
 
     DbConnection& connection_;
-    QString database_;
+    DatabaseLocation database_;
     UserPrompt& prompt_;
     DesignHost& host_;
     DesignRun run_;

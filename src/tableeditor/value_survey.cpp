@@ -46,7 +46,8 @@ Value StoredForm(const Value& value)
     return stored ? Value::Text(QString::fromLatin1(stored->characters.data(), stored->length)) : Value::Null();
 }
 
-qint64 Count(DbConnection& connection, const QString& database, const QString& statement, UserPrompt& prompt)
+qint64 Count(DbConnection& connection, const DatabaseLocation& database, const QString& statement,
+             UserPrompt& prompt)
 {
     DbRecordset rows(connection);
     if (rows.Open(statement, database, CursorType::ForwardOnly, LockType::ReadOnly) && !rows.IsEof())
@@ -77,7 +78,7 @@ ValueFate FateOfValue(const Value& stored, FieldType from, FieldType to, int siz
     return readsNow && before == back ? ValueFate::Same : ValueFate::Altered;
 }
 
-std::optional<ValuesAtStake> SurveyConversion(DbConnection& connection, const QString& database,
+std::optional<ValuesAtStake> SurveyConversion(DbConnection& connection, const DatabaseLocation& database,
                                               const QString& table, const QString& field, FieldType to, int size,
                                               UserPrompt& prompt, Progress& progress)
 {
@@ -116,14 +117,15 @@ std::optional<ValuesAtStake> SurveyConversion(DbConnection& connection, const QS
     return {};
 }
 
-qint64 CountValues(DbConnection& connection, const QString& database, const QString& table, const QString& field,
-                   UserPrompt& prompt)
+qint64 CountValues(DbConnection& connection, const DatabaseLocation& database, const QString& table,
+                   const QString& field, UserPrompt& prompt)
 {
     return Count(connection, database,
                  u"SELECT COUNT(%1) FROM %2"_s.arg(NameInBrackets(field), NameInBrackets(table)), prompt);
 }
 
-qint64 CountRecords(DbConnection& connection, const QString& database, const QString& table, UserPrompt& prompt)
+qint64 CountRecords(DbConnection& connection, const DatabaseLocation& database, const QString& table,
+                    UserPrompt& prompt)
 {
     return Count(connection, database, u"SELECT COUNT(*) FROM "_s + NameInBrackets(table), prompt);
 }

@@ -25,13 +25,14 @@ enum class ValueFate { Same, Altered, Unfit };
 ValueFate FateOfValue(const Value& stored, FieldType from, FieldType to, int size, Hr& fault);
 
 // Looks at all values of the field. Empty when they cannot be read, which was reported, or the user stopped it.
-std::optional<ValuesAtStake> SurveyConversion(DbConnection& connection, const QString& database,
+std::optional<ValuesAtStake> SurveyConversion(DbConnection& connection, const DatabaseLocation& database,
                                               const QString& table, const QString& field, FieldType to, int size,
                                               UserPrompt& prompt, Progress& progress);
 
 // How many values the field holds, how many records the table; -1 when that cannot be read, which was reported.
-qint64 CountValues(DbConnection& connection, const QString& database, const QString& table, const QString& field,
-                   UserPrompt& prompt);
-qint64 CountRecords(DbConnection& connection, const QString& database, const QString& table, UserPrompt& prompt);
+qint64 CountValues(DbConnection& connection, const DatabaseLocation& database, const QString& table,
+                   const QString& field, UserPrompt& prompt);
+qint64 CountRecords(DbConnection& connection, const DatabaseLocation& database, const QString& table,
+                    UserPrompt& prompt);
 
 } // namespace mirel

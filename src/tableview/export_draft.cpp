@@ -11,7 +11,7 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-ExportDraft::ExportDraft(DbConnection& connection, QString database, UserPrompt& prompt)
+ExportDraft::ExportDraft(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt)
     : records_(connection)
     , database_(std::move(database))
     , prompt_(prompt)
@@ -54,7 +54,8 @@ bool ExportDraft::ChoosePath(const QString& path)
 bool ExportDraft::Run()
 {
     return CanRun() &&
-           ExportCsvFile(records_, options_, {.path = path_, .database = database_}, prompt_).has_value();
+           ExportCsvFile(records_, options_, {.path = path_, .database = database_.FilePath()}, prompt_)
+               .has_value();
 }
 
 } // namespace mirel

@@ -21,7 +21,7 @@ public:
         QString firstData; // what the first record holds
     };
 
-    ExportDraft(DbConnection& connection, QString database, UserPrompt& prompt);
+    ExportDraft(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt);
 
     // False, with no source, when the provider refuses the statement, which is told.
     bool SetSource(const QString& statement);
@@ -44,7 +44,7 @@ public:
 
 private:
     DbRecordset records_;
-    QString database_;
+    DatabaseLocation database_;
     UserPrompt& prompt_;
     QString statement_;
     QString path_;

@@ -8,7 +8,7 @@
 
 namespace mirel {
 
-FieldLists::FieldLists(DbConnection& connection, QString database, UserPrompt& prompt)
+FieldLists::FieldLists(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt)
     : connection_(connection)
     , database_(std::move(database))
     , prompt_(prompt)

@@ -19,7 +19,7 @@ public:
         FieldType type = FieldType::None;
     };
 
-    FieldLists(DbConnection& connection, QString database, UserPrompt& prompt);
+    FieldLists(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt);
 
     const QStringList& Tables();
     const std::vector<Field>& FieldsOf(const QString& table);
@@ -27,7 +27,7 @@ public:
 
 private:
     DbConnection& connection_;
-    QString database_;
+    DatabaseLocation database_;
     UserPrompt& prompt_;
     QStringList tables_;
     bool tablesRead_ = false;

@@ -19,7 +19,7 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
-RecordBrowser::RecordBrowser(DbConnection& connection, QString database, UserPrompt& prompt,
+RecordBrowser::RecordBrowser(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt,
                              TableViewSettings settings)
     : result_(connection, std::move(database), prompt)
     , prompt_(prompt)

@@ -36,7 +36,8 @@ enum class SortDirection { Ascending, Descending };
 // Connection and prompt must outlive the browser.
 class RecordBrowser {
 public:
-    RecordBrowser(DbConnection& connection, QString database, UserPrompt& prompt, TableViewSettings settings);
+    RecordBrowser(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt,
+                  TableViewSettings settings);
     Q_DISABLE_COPY_MOVE(RecordBrowser)
 
     // The statement that shows a whole table. Never the bare name: filters are appended to it.
@@ -58,7 +59,7 @@ public:
     bool CanUpdate() const { return result_.CanUpdate(); }
     const QString& Statement() const { return result_.Statement(); }
     const QString& BaseStatement() const { return result_.BaseStatement(); }
-    const QString& Database() const { return result_.Database(); }
+    const DatabaseLocation& Database() const { return result_.Database(); }
 
     const TableViewSettings& Settings() const { return settings_; }
     void ChangeSettings(const TableViewSettings& settings); // a pending edit stays

@@ -72,7 +72,7 @@ TEST_F(SessionTest, StampsADatabaseOnceAndFindsItsStoreAgain)
     EXPECT_TRUE(session_.SetFavorites({u"query:kept"_s}));
 
     const QString moved = File(u"moved.cdb"_s);
-    const QString path = session_.Path();
+    const QString path = session_.Location().Text();
     session_.Close();
     EXPECT_FALSE(session_.IsOpen());
     EXPECT_TRUE(session_.Store().Queries().empty());
@@ -102,9 +102,9 @@ TEST_F(SessionTest, OpensNothingThatIsNoDatabase)
     ASSERT_TRUE(session_.Create(File(u"a.cdb"_s)));
     for (const QString& name : {u"letter.cdb"_s, u"nothing.cdb"_s, u"home"_s}) {
         EXPECT_FALSE(session_.Open(File(name))) << name.toStdString();
-        EXPECT_EQ(session_.Path(), File(u"a.cdb"_s)) << name.toStdString();
+        EXPECT_EQ(session_.Location().Text(), File(u"a.cdb"_s)) << name.toStdString();
     }
-    EXPECT_TRUE(catalog_.ExecuteStatement(session_.Path(), u"CREATE TABLE T (A SmallInt)"_s)) << "it works on";
+    EXPECT_TRUE(catalog_.ExecuteStatement(session_.Location(), u"CREATE TABLE T (A SmallInt)"_s)) << "it works on";
     EXPECT_EQ(prompt_.shown.size(), 3) << prompt_.shown.join(u'\n').toStdString();
     EXPECT_EQ(QFile(File(u"letter.cdb"_s)).size(), 5000);
 }
@@ -159,7 +159,7 @@ TEST_F(SessionTest, KeepsTheStoreForACopyOfTheDatabase)
     ASSERT_TRUE(QFile::copy(File(u"a.cdb"_s), File(u"copy.cdb"_s)));
     ASSERT_TRUE(session_.Open(File(u"copy.cdb"_s)));
     ASSERT_TRUE(session_.Drop(File(u"a.cdb"_s)));
-    EXPECT_EQ(session_.Path(), File(u"copy.cdb"_s)) << "another database stays open";
+    EXPECT_EQ(session_.Location().Text(), File(u"copy.cdb"_s)) << "another database stays open";
     ASSERT_TRUE(session_.Open(File(u"copy.cdb"_s)));
     EXPECT_TRUE(session_.Store().FindQuery(u"kept"));
     ASSERT_TRUE(session_.Drop(File(u"copy.cdb"_s)));
@@ -171,7 +171,7 @@ TEST_F(SessionTest, StaysAsItWasWhenCreateFails)
     ASSERT_TRUE(session_.Create(File(u"a.cdb"_s)));
     EXPECT_FALSE(session_.Create(File(u"a.cdb"_s))) << "there is one";
     EXPECT_FALSE(session_.Create(File(u"no such folder/b.cdb"_s)));
-    EXPECT_EQ(session_.Path(), File(u"a.cdb"_s));
+    EXPECT_EQ(session_.Location().Text(), File(u"a.cdb"_s));
     EXPECT_EQ(prompt_.shown.size(), 2);
 }
 

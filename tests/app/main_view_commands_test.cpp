@@ -40,7 +40,7 @@ protected:
         }
         bool Execute(const QString& statement)
         {
-            const bool done = session.GetCatalog().ExecuteStatement(session.Path(), statement);
+            const bool done = session.GetCatalog().ExecuteStatement(session.Location(), statement);
             commands.Refill();
             return done;
         }
@@ -251,7 +251,8 @@ TEST_F(MainViewCommandsTest, TheSamplesTablesAndQueriesHoldTheirRecords)
         {u"SELECT COUNT(*) FROM Orders WHERE Ordered >= '2001-06-01'"_s, 6}};
     DbRecordset counter(program_->connection);
     for (const auto& [statement, count] : expected) {
-        ASSERT_TRUE(counter.Open(statement, program_->session.Path(), CursorType::ForwardOnly, LockType::ReadOnly))
+        ASSERT_TRUE(
+            counter.Open(statement, program_->session.Location(), CursorType::ForwardOnly, LockType::ReadOnly))
             << statement.toStdString();
         EXPECT_EQ(counter.FieldValue(0).Number(), count) << statement.toStdString();
     }
@@ -260,7 +261,7 @@ TEST_F(MainViewCommandsTest, TheSamplesTablesAndQueriesHoldTheirRecords)
         program_->SelectOn(MainTab::Query, name);
         const std::optional<TableRequest> request = program_->commands.RequestOfSelected();
         ASSERT_TRUE(request) << name.toStdString();
-        EXPECT_TRUE(counter.Open(request->statement, program_->session.Path(), CursorType::ForwardOnly,
+        EXPECT_TRUE(counter.Open(request->statement, program_->session.Location(), CursorType::ForwardOnly,
                                  LockType::ReadOnly))
             << name.toStdString();
         EXPECT_FALSE(counter.IsEof()) << name.toStdString();

@@ -35,7 +35,7 @@ protected:
 
     void Run(const QString& statement)
     {
-        ASSERT_TRUE(session_.GetCatalog().ExecuteStatement(session_.Path(), statement));
+        ASSERT_TRUE(session_.GetCatalog().ExecuteStatement(session_.Location(), statement));
     }
     QString Source(const QString& form) { return session_.Store().FindForm(form)->controls[0].source.Text(); }
     QString Query() { return session_.Store().FindQuery(u"All")->text.Text(); }
@@ -63,7 +63,7 @@ protected:
 
 TEST_F(RenamingTest, MendsWhatRefersToATableOrAField)
 {
-    TableDesigner designer(connection_, session_.Path(), prompt_, host_);
+    TableDesigner designer(connection_, session_.Location(), prompt_, host_);
     ASSERT_TRUE(designer.Open(u"Birds"_s));
     FieldDesign field = designer.Fields()[0];
     field.name = u"Full Name"_s;
@@ -110,7 +110,7 @@ TEST_F(RenamingTest, RenamesFormsAndQueries)
 
 TEST_F(RenamingTest, IsAllOrNothing)
 {
-    TableDesigner designer(connection_, session_.Path(), prompt_, host_);
+    TableDesigner designer(connection_, session_.Location(), prompt_, host_);
     ASSERT_TRUE(designer.Open(u"Birds"_s));
     // A store that cannot be written keeps the table's name, too.
     const QString forms = QFileInfo(session_.SideFile()).path();

@@ -29,7 +29,7 @@ protected:
     std::unique_ptr<RunningForm> Start(const FormCall& call)
     {
         auto form = std::make_unique<RunningForm>(
-            call, FormEnvironment{connection_, session_.Path(), session_.Store(), prompt_, host_, {}, {}});
+            call, FormEnvironment{connection_, session_.Location(), session_.Store(), prompt_, host_, {}, {}});
         EXPECT_TRUE(form->Open());
         return form;
     }

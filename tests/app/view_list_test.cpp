@@ -82,7 +82,7 @@ protected:
     }
     void Run(const QString& statement)
     {
-        EXPECT_TRUE(session.GetCatalog().ExecuteStatement(session.Path(), statement));
+        EXPECT_TRUE(session.GetCatalog().ExecuteStatement(session.Location(), statement));
     }
     QString CountedLine(const QString& table)
     {

@@ -46,7 +46,7 @@ protected:
 
     bool Execute(const QString& statement)
     {
-        return session_.GetCatalog().ExecuteStatement(session_.Path(), statement);
+        return session_.GetCatalog().ExecuteStatement(session_.Location(), statement);
     }
     QString PathOf(const QString& name) const { return QDir(folder_.path()).filePath(name); }
     QWidget* OpenBirds() { return frame_.OpenTable({u"Birds"_s, u"SELECT * FROM Birds"_s, u"Birds"_s}); }

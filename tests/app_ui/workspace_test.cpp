@@ -101,7 +101,7 @@ protected:
 
     void Execute(const QString& statement)
     {
-        EXPECT_TRUE(program_->session.GetCatalog().ExecuteStatement(program_->session.Path(), statement))
+        EXPECT_TRUE(program_->session.GetCatalog().ExecuteStatement(program_->session.Location(), statement))
             << statement.toStdString();
     }
     // As another program does it.

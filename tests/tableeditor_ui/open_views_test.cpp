@@ -36,7 +36,7 @@ protected:
     }
     bool Execute(const QString& statement)
     {
-        return session_.GetCatalog().ExecuteStatement(session_.Path(), statement);
+        return session_.GetCatalog().ExecuteStatement(session_.Location(), statement);
     }
     CTableView* OpenBirds()
     {

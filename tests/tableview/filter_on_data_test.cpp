@@ -30,7 +30,7 @@ protected:
         DatabaseSession session(connection, programs, prompt);
         const SampleDatabase sample(programs, QStringLiteral(MIREL_SOURCE_DIR "/samples"));
         ASSERT_TRUE(sample.Open(session)) << prompt.shown.join(u'\n').toStdString();
-        path_ = session.Path();
+        path_ = session.Location().Text();
         session.Close();
         ASSERT_TRUE(QFile::copy(path_, CopyPath()));
     }
@@ -131,7 +131,8 @@ TEST_F(FilterOnData, KeepsOrLeavesOutWhatTheCellHolds)
         const int fields = browser_.FieldCount();
         for (int field = 0; field < fields; ++field) {
             const QByteArray column = '"' + browser_.FieldName(field).toUtf8() + '"';
-            const QByteArray first = "(SELECT " + column + " FROM \"" + table.toUtf8() + "\" ORDER BY rowid LIMIT 1)";
+            const QByteArray first =
+                "(SELECT " + column + " FROM \"" + table.toUtf8() + "\" ORDER BY rowid LIMIT 1)";
             EXPECT_TRUE(browser_.SelectCell(0, field));
             EXPECT_TRUE(browser_.FilterByCell(CellFilter::BySelection));
             EXPECT_EQ(Shown(), Counted(table, column + " IS " + first)) << column.toStdString();

@@ -14,7 +14,7 @@ void ShowAbout(const DatabaseSession& session, QWidget& parent)
     QStringList lines{StringText(Str::AboutWhat)};
     if (session.IsOpen()) {
         const QString stamp = session.Stamp().isEmpty() ? StringText(Str::AboutNoStamp) : session.Stamp();
-        lines << QString() << StringText(Str::AboutDatabase, {QDir::toNativeSeparators(session.Path())})
+        lines << QString() << StringText(Str::AboutDatabase, {QDir::toNativeSeparators(session.Location().Text())})
               << StringText(Str::AboutStamp, {stamp});
     }
     QMessageBox box(&parent);

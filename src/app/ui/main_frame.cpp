@@ -397,7 +397,7 @@ void CMainFrame::EditSelected()
 void CMainFrame::DesignTable(const QString& table)
 {
     panel_->StopCounting();
-    TableDesigner designer(session_.Connection(), session_.Path(), session_.Prompt(), *openViews_);
+    TableDesigner designer(session_.Connection(), session_.Location(), session_.Prompt(), *openViews_);
     if (table.isEmpty() || designer.Open(table))
         CTableDialog(designer, this).exec();
     commands_.Refill();

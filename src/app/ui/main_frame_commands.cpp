@@ -59,7 +59,7 @@ struct CMainFrame::Commands {
     static void Export(CMainFrame& frame)
     {
         if (const std::optional<TableRequest> request = frame.commands_.RequestOfSelected()) {
-            RunExport(frame.session_.Connection(), frame.session_.Path(), frame.session_.Prompt(),
+            RunExport(frame.session_.Connection(), frame.session_.Location(), frame.session_.Prompt(),
                       {.name = request->title, .statement = request->statement}, frame);
         }
     }

@@ -90,7 +90,7 @@ CFormEngView* CMainFrame::OpenForm(const FormCall& call)
 
 CTableView* CMainFrame::MakeTable(const TableRequest& request)
 {
-    auto* table = new CTableView(session_.Connection(), session_.Path(), session_.Prompt(),
+    auto* table = new CTableView(session_.Connection(), session_.Location(), session_.Prompt(),
                                  ReadTableViewSettings(settings_), this);
     table->hide(); // until it has its place
     if (!table->OpenStatement(request.title, request.statement)) {
@@ -122,7 +122,7 @@ CFormEngView* CMainFrame::MakeForm(const FormCall& call)
 {
     auto* form = new CFormEngView(call,
                                   {.connection = session_.Connection(),
-                                   .database = session_.Path(),
+                                   .database = session_.Location(),
                                    .store = session_.Store(),
                                    .prompt = session_.Prompt(),
                                    .settings = ReadFormViewSettings(settings_),

@@ -3,6 +3,7 @@
 #include "provider/sqlite/cedb_recordset.h"
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/table_appender.h"
+#include "resources/string_table.h"
 
 namespace mirel::sqlite {
 namespace {
@@ -45,13 +46,17 @@ CedbProvider::~CedbProvider()
         file->Close();
 }
 
-std::shared_ptr<DatabaseFile> CedbProvider::FileOf(const QString& database, Outcome& outcome)
+std::shared_ptr<DatabaseFile> CedbProvider::FileOf(const DatabaseLocation& database, Outcome& outcome)
 {
     outcome = {};
-    const QString identity = IdentityOfPath(database);
+    if (database.IsAddress()) {
+        outcome = {Hr::CannotOpen, StringText(Str::DatabaseIsNoFile, {database.Text()})};
+        return nullptr;
+    }
+    const QString identity = IdentityOfPath(database.FilePath());
     if (const auto open = files_.constFind(identity); open != files_.constEnd())
         return *open;
-    std::shared_ptr<DatabaseFile> file = DatabaseFile::Open(database, outcome);
+    std::shared_ptr<DatabaseFile> file = DatabaseFile::Open(database.FilePath(), outcome);
     if (file)
         files_.insert(identity, file);
     return file;
@@ -62,9 +67,9 @@ std::unique_ptr<ProviderRecordset> CedbProvider::CreateRecordset()
     return std::make_unique<CedbRecordset>(*this);
 }
 
-std::unique_ptr<RecordAppender> CedbProvider::CreateAppender(const QString& database, const QString& table,
-                                                             const QStringList& columns, Hr& result,
-                                                             QString& context)
+std::unique_ptr<RecordAppender> CedbProvider::CreateAppender(const DatabaseLocation& database,
+                                                             const QString& table, const QStringList& columns,
+                                                             Hr& result, QString& context)
 {
     Outcome outcome;
     std::unique_ptr<RecordAppender> appender;
@@ -75,7 +80,7 @@ std::unique_ptr<RecordAppender> CedbProvider::CreateAppender(const QString& data
     return appender;
 }
 
-std::unique_ptr<ProviderTransaction> CedbProvider::BeginTransaction(const QString& database, Hr& result,
+std::unique_ptr<ProviderTransaction> CedbProvider::BeginTransaction(const DatabaseLocation& database, Hr& result,
                                                                     QString& context)
 {
     Outcome outcome;
@@ -87,9 +92,9 @@ std::unique_ptr<ProviderTransaction> CedbProvider::BeginTransaction(const QStrin
     return outcome.Ok() ? std::make_unique<FileTransaction>(file) : nullptr;
 }
 
-void CedbProvider::CloseDatabase(const QString& database)
+void CedbProvider::CloseDatabase(const DatabaseLocation& database)
 {
-    if (const std::shared_ptr<DatabaseFile> file = files_.take(IdentityOfPath(database)))
+    if (const std::shared_ptr<DatabaseFile> file = files_.take(IdentityOfPath(database.FilePath())))
         file->Close();
 }
 

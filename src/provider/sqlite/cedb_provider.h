@@ -19,15 +19,15 @@ public:
     Q_DISABLE_COPY_MOVE(CedbProvider)
 
     std::unique_ptr<ProviderRecordset> CreateRecordset() override;
-    std::unique_ptr<RecordAppender> CreateAppender(const QString& database, const QString& table,
+    std::unique_ptr<RecordAppender> CreateAppender(const DatabaseLocation& database, const QString& table,
                                                    const QStringList& columns, Hr& result,
                                                    QString& context) override;
-    std::unique_ptr<ProviderTransaction> BeginTransaction(const QString& database, Hr& result,
+    std::unique_ptr<ProviderTransaction> BeginTransaction(const DatabaseLocation& database, Hr& result,
                                                           QString& context) override;
-    void CloseDatabase(const QString& database) override;
+    void CloseDatabase(const DatabaseLocation& database) override;
 
     // The file of that path, opened when it is not yet; null, and why, when it cannot be.
-    std::shared_ptr<DatabaseFile> FileOf(const QString& database, Outcome& outcome);
+    std::shared_ptr<DatabaseFile> FileOf(const DatabaseLocation& database, Outcome& outcome);
 
 private:
     QHash<QString, std::shared_ptr<DatabaseFile>> files_; // by IdentityOfPath

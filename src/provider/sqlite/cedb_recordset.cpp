@@ -49,11 +49,11 @@ Hr CedbRecordset::Change(Call call)
     return OnCursor(call);
 }
 
-Hr CedbRecordset::Open(const QString& source, const QString& database, CursorType cursor, LockType lock)
+Hr CedbRecordset::Open(const QString& source, const DatabaseLocation& database, CursorType cursor, LockType lock)
 {
     Close();
     source_ = source;
-    const Outcome outcome = database.isEmpty() ? RunOnNoDatabase(source) : Run(source, database, cursor, lock);
+    const Outcome outcome = database.IsEmpty() ? RunOnNoDatabase(source) : Run(source, database, cursor, lock);
     if (!outcome.Ok()) {
         cursor_.reset();
         file_.reset();
@@ -88,7 +88,8 @@ Outcome CedbRecordset::RunDatabasePlan(const Plan& plan)
     return DatabaseFile::Remove(path);
 }
 
-Outcome CedbRecordset::Run(const QString& source, const QString& database, CursorType cursor, LockType lock)
+Outcome CedbRecordset::Run(const QString& source, const DatabaseLocation& database, CursorType cursor,
+                           LockType lock)
 {
     Outcome outcome;
     file_ = provider_.FileOf(database, outcome);

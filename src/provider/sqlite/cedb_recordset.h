@@ -19,7 +19,7 @@ public:
     {
     }
 
-    Hr Open(const QString& source, const QString& database, CursorType cursor, LockType lock) override;
+    Hr Open(const QString& source, const DatabaseLocation& database, CursorType cursor, LockType lock) override;
     void Close() override;
 
     QString Source() const override { return source_; }
@@ -59,7 +59,7 @@ public:
     Hr DeleteAll(qint64 confirmed, const BulkProgress& progress) override;
 
 private:
-    Outcome Run(const QString& source, const QString& database, CursorType cursor, LockType lock);
+    Outcome Run(const QString& source, const DatabaseLocation& database, CursorType cursor, LockType lock);
     Outcome RunPlan(Plan plan, CursorType cursor, LockType lock);
     Outcome RunOnNoDatabase(const QString& source);
     Outcome RunDatabasePlan(const Plan& plan);

@@ -259,8 +259,8 @@ void CExportWizard::GoOn()
         accept();
 }
 
-void RunExport(DbConnection& connection, const QString& database, UserPrompt& prompt, const ExportRequest& request,
-               QWidget& window)
+void RunExport(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
+               const ExportRequest& request, QWidget& window)
 {
     ExportDraft draft(connection, database, prompt);
     {
@@ -269,7 +269,7 @@ void RunExport(DbConnection& connection, const QString& database, UserPrompt& pr
             return;
         draft.RecordCount();
     }
-    CExportWizard wizard(draft, request.name, database, &window);
+    CExportWizard wizard(draft, request.name, database.FilePath(), &window);
     FillSmallWindow(wizard, window);
     wizard.exec();
 }

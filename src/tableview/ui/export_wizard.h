@@ -55,7 +55,7 @@ struct ExportRequest {
     QString name; // of the table or the query
     QString statement;
 };
-void RunExport(DbConnection& connection, const QString& database, UserPrompt& prompt, const ExportRequest& request,
-               QWidget& window);
+void RunExport(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
+               const ExportRequest& request, QWidget& window);
 
 } // namespace mirel

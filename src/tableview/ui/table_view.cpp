@@ -31,7 +31,7 @@ constexpr int kWriteErrorDelayMs = 1;
 
 using Command = TableCommand;
 
-CTableView::CTableView(DbConnection& connection, const QString& database, UserPrompt& prompt,
+CTableView::CTableView(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
                        const TableViewSettings& settings, QWidget* parent)
     : HostedView(parent)
     , browser_(connection, database, prompt, settings)

@@ -36,7 +36,7 @@ class CTableView : public HostedView {
     Q_OBJECT
 
 public:
-    CTableView(DbConnection& connection, const QString& database, UserPrompt& prompt,
+    CTableView(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
                const TableViewSettings& settings, QWidget* parent = nullptr);
     ~CTableView() override;
 
