@@ -22,7 +22,7 @@ constexpr std::array kSettings = {
     SettingRow{Setting::OpenByDoubleClick, u"Config", u"openByDoubleClick", Integer, u"1",
                u"1: an entry opens on a double tap; 0: on a single one"},
     SettingRow{Setting::RecentDatabases, u"Config", u"recentDatabases", Text, u"",
-               u"databases opened of late, a line each, the latest first"},
+               u"recent databases, a line each, the latest first"},
     SettingRow{Setting::MainViewBkColor, u"MainView", u"BkColor", Colors, u"", u"background colours"},
     SettingRow{Setting::MainViewTextColor, u"MainView", u"TextColor", Colors, u"", u"text colours"},
     SettingRow{Setting::MainViewFont, u"MainView", u"Font", Font, kDefaultFont, u"font"},

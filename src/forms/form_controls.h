@@ -25,7 +25,7 @@ public:
 
     std::span<const ControlRun> All() const { return controls_; }
     const ControlRun& operator[](int control) const { return controls_[size_t(control)]; }
-    bool Is(int control, ControlType type) const; // false also for an index that there is not
+    bool Is(int control, ControlType type) const; // false for an index out of range
     int Find(QStringView name) const;             // the first that can hold a value, else the first; -1: none
     // Grows with every change of what a control shows.
     quint64 Revision() const { return revision_; }

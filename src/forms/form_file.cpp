@@ -3,6 +3,9 @@
 #include "forms/form_store.h"
 #include "resources/string_table.h"
 
+#include <QByteArrayView>
+#include <QFile>
+
 namespace mirel {
 
 bool ExportForm(const FormDef& form, const QString& path, QString& error)
@@ -17,6 +20,18 @@ bool ExportForm(const FormDef& form, const QString& path, QString& error)
     return false;
 }
 
+namespace {
+
+// Almost any bytes can be read as a form, these too.
+bool IsDatabase(const QString& path)
+{
+    constexpr QByteArrayView kMark = "SQLite format 3";
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) && file.peek(kMark.size()) == kMark;
+}
+
+} // namespace
+
 std::optional<FormDef> ImportForm(const QString& path, QString& error)
 {
     FormStore file(path);
@@ -24,7 +39,7 @@ std::optional<FormDef> ImportForm(const QString& path, QString& error)
         error = file.LastError();
         return {};
     }
-    if (file.Forms().empty()) {
+    if (file.Forms().empty() || IsDatabase(path)) {
         error = StringText(Str::FormFileIsEmpty, {path});
         return {};
     }

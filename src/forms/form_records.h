@@ -11,7 +11,7 @@ namespace mirel {
 
 // What the system keeps of forms and saved queries. These are the fields of the store file, with their numbers
 // and their order; docs/store-file.md shows the bytes. Colours are 0x00BBGGRR, kDefaultColor leaves them to
-// whoever paints. Flags are numbers because a file may hold others than 0 and 1, and keeps them; any but 0 is
+// the painter. Flags are numbers because a file may hold others than 0 and 1, and keeps them; any but 0 is
 // "yes". Reserved bytes have no meaning here and come back as they were.
 
 inline constexpr quint32 kDefaultColor = 0xFFFFFFFF;

@@ -118,7 +118,7 @@ public:
     Outcome RunAgain();
     // Asks about unsaved changes, tells the host what changed and that it is to close.
     Outcome Close();
-    // Asks about unsaved changes alone. True: whoever asked may go on.
+    // Only asks about unsaved changes. True: the caller may go on.
     bool LeaveRecordCheck();
 
     // --- the way back -------------------------------------------------------------------------------------

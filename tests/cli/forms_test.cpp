@@ -168,6 +168,8 @@ TEST_F(FormsCommands, CarryFormsFromFileToFile)
                                      {u"show"_s, u"a.cdb"_s, u"Nobody"_s},
                                      {u"delete"_s, u"a.cdb"_s, u"Nobody"_s, u"--yes"_s},
                                      {u"import"_s, u"a.cdb"_s, u"missing.pfs"_s},
+                                     {u"import"_s, u"a.cdb"_s, u"a.cdb"_s, u"--name"_s, u"Not a form"_s},
+                                     {u"import"_s, u"a.cdb"_s, u"f.pfs"_s, u"--name"_s, QString()},
                                      {u"default"_s, u"a.cdb"_s, u"Nowhere"_s},
                                      {u"dump"_s, u"missing.pfs"_s}}) {
         const Ended ended = Run(QStringList{u"forms"_s} + words);

@@ -101,7 +101,7 @@ TEST(ProfileText, RefusesNamesThatNoLineCouldHold)
     EXPECT_EQ(profile.Bytes(), "[S]\nkey=1\n");
 }
 
-TEST(Profile, IsReadAnewByEveryCall)
+TEST(Profile, IsReadByEveryCall)
 {
     const QTemporaryDir folder;
     const QString path = folder.filePath(u"new folder/Mirel.ini"_s);

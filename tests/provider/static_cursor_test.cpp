@@ -234,7 +234,7 @@ TEST_F(StaticCursor, EndsWithItsDatabase)
     EXPECT_EQ(cursor->MoveNext(), Hr::NotOpen);
     EXPECT_EQ(cursor->Read({}, [](std::span<const Cell>) { return true; }), Hr::NotOpen);
     EXPECT_TRUE(cursor->AtEnd());
-    EXPECT_EQ(Rows(u"SELECT N FROM T"_s).size(), 3) << "opened anew";
+    EXPECT_EQ(Rows(u"SELECT N FROM T"_s).size(), 3) << "opened again";
 }
 
 TEST_F(StaticCursor, FindsARecordByItsNumberInEveryOrder)

@@ -173,7 +173,7 @@ TEST_F(TwoPrograms, AResultOutlivesItsTableAndColumns)
     other.Run("ALTER TABLE T DROP COLUMN Name");
     failsWithWords(*whole);
     EXPECT_EQ(Read(*named).size(), 2995) << "its columns are there";
-    EXPECT_EQ(Read(*Open(u"T"_s)).value(0), u"1"_s) << "opened anew";
+    EXPECT_EQ(Read(*Open(u"T"_s)).value(0), u"1"_s) << "opened again";
     other.Run("DROP TABLE T");
     EXPECT_EQ(Try(u"SELECT * FROM T"_s), Hr::NoSuchTable);
     failsWithWords(*named);

@@ -189,7 +189,7 @@ void CFormEngView::ShowState()
     setWindowModified(form_.IsDirty());
     chip_->ShowConditions(form_.Conditions());
     if (!form_.IsDirty())
-        Q_EMIT recordsChanged(); // or it was looked at only; whoever hears it looks for himself
+        Q_EMIT recordsChanged(); // perhaps nothing was written: the listeners look
     if (CurrentPage() == Page::Detail)
         ShowDetail();
     if (CurrentPage() == Page::List)

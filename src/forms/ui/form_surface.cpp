@@ -18,7 +18,7 @@
 namespace mirel {
 namespace {
 
-// What lies further out is none of the form: no hand has put it there.
+// Controls further out are not part of the form: nobody placed them there by hand.
 constexpr int kFarthestPx = 8000;
 constexpr int kMarginPx = 2;
 

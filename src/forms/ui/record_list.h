@@ -11,7 +11,7 @@ class QStandardItemModel;
 namespace mirel {
 
 // Rows of texts under a header, read as they come into sight: a list of any length costs what its visible rows
-// do. Draws what it is given; a tap or a key asks for another row, and whoever answers calls SetRows.
+// do. Draws what it is given; a tap or a key asks for another row, and the answer is a call of SetRows.
 //
 // Rows count from 0.
 class RecordList : public QAbstractScrollArea {

@@ -23,8 +23,8 @@ struct FileKind {
 
 // Asks the user for a file; empty when there is none. `title` and `accept` are texts of commands. The dialog
 // begins in the folder of `near`, in the user's documents when that is empty. On a screen too small for the
-// desktop's dialog, one of our own fills the window. An existing file is no question when creating: whoever writes
-// it asks.
+// desktop's dialog, one of our own fills the window. Creating does not ask about an existing file: the
+// writer does.
 struct FileRequest {
     Str title;
     Str accept;

@@ -18,7 +18,7 @@ bool IsNumberUnit(QChar unit)
            unit == u'E';
 }
 
-// "12001-01-01" and "0000-05-05" have the form of a date, but of a year that there is not.
+// "12001-01-01" and "0000-05-05" look like dates, but their years are out of range.
 bool IsDateOutOfRange(QStringView text)
 {
     const qsizetype dash = text.indexOf(u'-');

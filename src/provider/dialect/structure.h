@@ -9,8 +9,8 @@
 
 namespace mirel::dialect {
 
-// The statements that change a database's structure, as plain records. Names stand without brackets; whoever
-// has checked them against a schema has put in the schema's own spelling of the names that exist.
+// The statements that change a database's structure, as plain records. Names stand without brackets; the
+// check against a schema puts in its own spelling of the names that exist.
 
 struct ColumnDefinition {
     QString name;

@@ -202,7 +202,7 @@ Outcome StaticCursor::CountAll()
     return rows_->Extend(kAllRecords, kNoHurry);
 }
 
-Outcome StaticCursor::CountAnew()
+Outcome StaticCursor::Recount()
 {
     return InRead([this] {
         Outcome outcome = TakeUpChanges();
@@ -236,7 +236,7 @@ Outcome StaticCursor::Settle(qint64 position)
 
 qint64 StaticCursor::RecordCount()
 {
-    (void)CountAnew();
+    (void)Recount();
     return rows_->Known();
 }
 
@@ -434,7 +434,7 @@ Outcome StaticCursor::AddNew(std::span<const FieldChange> values, const RecordId
 {
     const std::optional<RecordKey> wanted = KeyOf(preferred, 1);
     RecordKey key(plan_.sources.size(), kNoRow);
-    Outcome outcome = CountAnew(); // before the lock is taken: it can take its time
+    Outcome outcome = Recount(); // before the lock is taken: it can take its time
     if (outcome.Ok()) {
         outcome = InWrite([&] {
             Outcome taken = TakeUpChanges();
@@ -485,7 +485,7 @@ Outcome StaticCursor::Delete()
 {
     if (place_ != Place::On && place_ != Place::Gone)
         return {Hr::NoCurrentRecord, {}};
-    Outcome outcome = CountAnew();
+    Outcome outcome = Recount();
     if (!outcome.Ok())
         return outcome;
     outcome = InWrite([&] {

@@ -76,7 +76,7 @@ private:
     Outcome FindCurrent();
     Outcome Settle(qint64 position);
     Outcome CountAll();
-    Outcome CountAnew(); // all, as they are now
+    Outcome Recount(); // all, as they are now
     Outcome ReadCurrent(std::span<const int> fields, std::vector<Value>& values);
     Outcome LoadRecord();
     Outcome CheckCurrent(std::span<const int> fields);
