@@ -362,6 +362,8 @@ RunningForm::Outcome RunningForm::AddRecord()
     std::vector<FieldChange> values;
     if (!NewRecordValues(values))
         return Outcome::Failed;
+    if (CanUpdate() && !source_.Result().AskForRequired(values))
+        return Outcome::Stopped;
     if (source_.Result().Add(values) != OpenResult::Written::Done) {
         environment_.prompt.ShowError(source_.Result().LastFailure());
         return Outcome::Failed;

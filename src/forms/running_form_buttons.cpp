@@ -332,6 +332,8 @@ RunningForm::Outcome RunningForm::SaveToNoRecord(const ControlDef& button)
         std::erase_if(values, [&](const FieldChange& preset) { return preset.field == change.field; });
         values.push_back(change);
     }
+    if (!source_.Result().AskForRequired(values))
+        return Outcome::Stopped;
     if (source_.Result().Add(values) != OpenResult::Written::Done) {
         environment_.prompt.ShowError(source_.Result().LastFailure());
         return Outcome::Failed;

@@ -36,8 +36,9 @@ struct ResultField {
     QString table;    // the table that the column comes from; empty for an expression
     QString column;   // its name in that table; empty for an expression
     QString source{}; // the table's alias in the statement, or its name; empty for an expression
-    bool isJoined = false; // the statement reads from several tables
-    QString expression{};  // as the statement writes it, ready to be compared; empty for a column
+    bool isJoined = false;   // the statement reads from several tables
+    QString expression{};    // as the statement writes it, ready to be compared; empty for a column
+    bool isRequired = false; // the column takes no NULL, and a new record gets no default for it
 };
 
 // A value for a column of an open result, by its index there.

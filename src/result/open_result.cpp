@@ -5,6 +5,9 @@
 #include "data/statement_text.h"
 #include "platform/ole_date.h"
 #include "provider/cell_value.h"
+#include "provider/conversion.h"
+#include "resources/string_table.h"
+#include "result/cell_text.h"
 
 #include <algorithm>
 
@@ -172,6 +175,40 @@ std::vector<FieldChange> OpenResult::NewRecordValues(const QDateTime& now) const
             values.push_back({field, Value::Bool(false)});
     }
     return values;
+}
+
+bool OpenResult::AskForRequired(std::vector<FieldChange>& values)
+{
+    for (int field = 0; field < FieldCount(); ++field) {
+        const bool isGiven = std::ranges::find(values, field, &FieldChange::field) != values.end();
+        if (isGiven || !IsWritable(field) || !Fields()[size_t(field)].isRequired)
+            continue;
+        std::optional<Value> value = AskForValue(field);
+        if (!value)
+            return false;
+        values.push_back({field, std::move(*value)});
+    }
+    return true;
+}
+
+// Until it is one that the field takes.
+std::optional<Value> OpenResult::AskForValue(int field)
+{
+    const FieldType type = records_.TypeOfField(field);
+    for (QString typed;;) {
+        const UserMessage label{Str::RequiredValue, {records_.FieldName(field)}};
+        const std::optional<QString> answer = prompt_.AskText({Str::RequiredValueTitle, {}}, label, typed);
+        if (!answer)
+            return {};
+        typed = *answer;
+        const Value given = typed.isEmpty() && IsText(type) ? Value::Text(typed) : TypedValue(typed, type);
+        Value value;
+        const Hr hr =
+            given.IsNull() ? Hr::BadLiteral : ConvertForColumn(given, type, records_.FieldSize(field), value);
+        if (!Failed(hr))
+            return value;
+        prompt_.ShowError(ProviderErrorText(&records_, hr, records_.FieldName(field)));
+    }
 }
 
 // --- records

@@ -80,6 +80,8 @@ public:
     // What a new record holds before anybody types: today in the date fields, No in the Yes/No fields. All else is
     // left to the store, which fills in its own keys and defaults.
     std::vector<FieldChange> NewRecordValues(const QDateTime& now) const;
+    // Asks for what the table requires of a new record and `values` does not hold yet. False: the user gave up.
+    [[nodiscard]] bool AskForRequired(std::vector<FieldChange>& values);
 
     // --- records ----------------------------------------------------------------------------------------------
 
@@ -163,6 +165,7 @@ public:
     void Report(); // the recordset's last failure, to the user
 
 private:
+    std::optional<Value> AskForValue(int field);
     using TurnOfLog = ChangeLog::Outcome (ChangeLog::*)(DbConnection&, const DatabaseLocation&, UserPrompt&);
 
     // A step that becomes too large to be kept is given up.

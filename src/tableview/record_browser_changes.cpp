@@ -67,7 +67,10 @@ bool RecordBrowser::AddRecord()
 {
     if (!IsOpen() || FieldCount() == 0 || !WriteEdit())
         return false;
-    if (result_.Add(result_.NewRecordValues(QDateTime::currentDateTime())) != OpenResult::Written::Done) {
+    std::vector<FieldChange> values = result_.NewRecordValues(QDateTime::currentDateTime());
+    if (CanUpdate() && !result_.AskForRequired(values))
+        return false;
+    if (result_.Add(values) != OpenResult::Written::Done) {
         prompt_.ShowError(result_.LastFailure());
         return false;
     }

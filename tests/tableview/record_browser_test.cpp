@@ -1,5 +1,6 @@
 #include "tableview/record_browser.h"
 
+#include "support/sqlite_file.h"
 #include "tableview/people_fixture.h"
 
 namespace mirel {
@@ -374,6 +375,21 @@ TEST_F(Browser, EditsNothingOfAResultThatCannotBeWritten)
     browser.EditText(u"x"_s);
     browser.EditChecked(true);
     EXPECT_FALSE(browser.HasPendingEdit());
+}
+
+TEST_F(Browser, AsksForWhatTheTableRequiresOfANewRecord)
+{
+    SqliteFile(path).Run("CREATE TABLE Strict (Id INTEGER PRIMARY KEY NOT NULL, N INTEGER NOT NULL, "
+                         "D TEXT NOT NULL DEFAULT 'given', T TEXT NOT NULL, Free TEXT)");
+    ASSERT_TRUE(browser.Open(RecordBrowser::StatementOfTable(u"Strict")));
+    EXPECT_FALSE(browser.AddRecord()) << "given up";
+    EXPECT_EQ(Stored(u"SELECT COUNT(*) FROM Strict"_s), u"0"_s);
+    prompt.questions.clear();
+    prompt.texts = {u"many"_s, u""_s, u"12"_s, u""_s};
+    ASSERT_TRUE(browser.AddRecord());
+    EXPECT_EQ(prompt.questions.size(), 4) << prompt.questions.join(u'|').toStdString();
+    EXPECT_EQ(prompt.shown.size(), 2) << "no number, and nothing at all";
+    EXPECT_EQ(SqliteFile(path).Text("SELECT Id || N || D || T || (Free IS NULL) FROM Strict"), u"112given1"_s);
 }
 
 TEST_F(Browser, RunsAgainWhereItStood)

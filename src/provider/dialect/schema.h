@@ -20,6 +20,7 @@ struct Column {
     int id = 0;                // FieldID: stable within a session
     bool foreignDates = false; // a date column whose values may be in forms other than ours: compared and
                                // sorted through a normalising function
+    bool isRequired = false;   // takes no NULL, and a new record gets no default for it
 };
 
 struct Index {

@@ -168,6 +168,7 @@ ResultField Planner::FieldOf(const SelectColumn& column) const
     ResultField field = ResultFieldOf(*source.table, source.table->columns[size_t(expression.column)]);
     field.source = source.name;
     field.isJoined = checker_.Sources().size() > 1;
+    field.isRequired = source.table->columns[size_t(expression.column)].isRequired;
     if (!column.alias.isEmpty())
         field.name = column.alias;
     return field;

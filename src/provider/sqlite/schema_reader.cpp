@@ -106,7 +106,12 @@ Outcome SchemaReader::ReadColumns(dialect::Table& table)
         const bool foreignDates = declared.type == FieldType::Date && !(isOurs_ && declared.own);
         const bool isWide = declared.type == FieldType::Integer && !(isOurs_ && declared.own);
         const int size = isWide ? kWideIntegerSize : declared.size;
-        table.columns.push_back({name, declared.type, size, file_.Ids().OfField(table.name, name), foreignDates});
+        // The engine gives an integer key its value by itself.
+        const bool isKey = row.Integer(Key) != 0 && row.Text(Type).compare(u"INTEGER", Qt::CaseInsensitive) == 0;
+        const bool isRequired =
+            row.Integer(NotNull) != 0 && sqlite3_column_type(row.Get(), Default) == SQLITE_NULL && !isKey;
+        table.columns.push_back(
+            {name, declared.type, size, file_.Ids().OfField(table.name, name), foreignDates, isRequired});
     });
 }
 
