@@ -38,6 +38,8 @@ constexpr std::array kSettings = {
                u"tap-and-hold time in milliseconds"},
     SettingRow{Setting::TableViewAutoSizing, u"TableView", u"autoSizing", Integer, u"1",
                u"size columns to their contents"},
+    SettingRow{Setting::TableViewLeadingNumber, u"TableView", u"leadingNumber", Integer, u"0",
+               u"a typed number is what its text begins with, not the whole of it"},
     SettingRow{Setting::TableViewYesNo, u"TableView", u"yesnoString", YesNo, u"Yes/No",
                u"words for true and false; one pair with the form view's"},
     SettingRow{Setting::TableViewBkColor, u"TableView", u"BkColor", Colors, u"", u"background colours"},

@@ -32,6 +32,7 @@ enum class Setting {
     TableViewSortColumn,
     TableViewHoldingTime,
     TableViewAutoSizing,
+    TableViewLeadingNumber,
     TableViewYesNo,
     TableViewBkColor,
     TableViewTextColor,

@@ -9,6 +9,7 @@ TableViewSettings ReadTableViewSettings(const Settings& settings)
             .sortByHeader = settings.Flag(Setting::TableViewSortColumn),
             .holdTimeMs = settings.Int(Setting::TableViewHoldingTime),
             .autoSizing = settings.Flag(Setting::TableViewAutoSizing),
+            .leadingNumber = settings.Flag(Setting::TableViewLeadingNumber),
             .words = settings.Words()};
 }
 

@@ -69,7 +69,7 @@ private:
 std::optional<Value> ValueOf(Run& run, const QString& given, FieldType type)
 {
     if (type != FieldType::YesNo)
-        return TypedValue(given, type);
+        return TypedValue(run.IsSet(Setting::TableViewLeadingNumber) ? LeadingNumber(given, type) : given, type);
     const YesNoWords words = run.Words();
     const auto is = [&given](const QString& word) { return given.compare(word, Qt::CaseInsensitive) == 0; };
     if (given == u"1" || is(words.yes))

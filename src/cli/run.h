@@ -49,6 +49,7 @@ public:
 
     // The user's words for Yes and No.
     YesNoWords Words() const { return Settings(folder_.OpenProfile()).Words(); }
+    bool IsSet(Setting setting) const { return Settings(folder_.OpenProfile()).Flag(setting); }
     // In the format that --format names, with the user's words for Yes and No.
     std::unique_ptr<RecordWriter> MakeWriter();
     void WriteTiming() const;

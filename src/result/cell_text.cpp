@@ -3,6 +3,8 @@
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
 
+#include <QRegularExpression>
+
 #include <charconv>
 #include <cmath>
 #include <limits>
@@ -10,6 +12,8 @@
 
 namespace mirel {
 namespace {
+
+using namespace Qt::StringLiterals;
 
 QString TextOfCell(const Cell& cell, qsizetype maxChars)
 {
@@ -163,6 +167,16 @@ Value TypedValue(const QString& text, FieldType type)
     if (type == FieldType::Date)
         return TypedDate(text);
     return Value::Text(text);
+}
+
+QString LeadingNumber(const QString& text, FieldType type)
+{
+    static const QRegularExpression kInteger(u"^[+-]?[0-9]+"_s);
+    static const QRegularExpression kDouble(u"^[+-]?([0-9]+\\.?[0-9]*|\\.[0-9]+)([eE][+-]?[0-9]+)?"_s);
+    if (text.isEmpty() || !IsNumber(type))
+        return text;
+    const QString number = (IsInteger(type) ? kInteger : kDouble).match(text.trimmed()).captured();
+    return number.isEmpty() ? u"0"_s : number;
 }
 
 bool IsKeptWhole(const QString& text, FieldType type, int size)

@@ -32,6 +32,10 @@ constexpr bool IsRightAligned(FieldType type)
 // and a number that does not fit, are passed on as text, for the store to refuse. Not for Yes/No.
 Value TypedValue(const QString& text, FieldType type);
 
+// The number that a text begins with, as a text for TypedValue: "12.7" is "12" for an integer, "abc" is "0".
+// Another type's text stays as it is, and so does the empty one.
+QString LeadingNumber(const QString& text, FieldType type);
+
 // Whether TypedValue keeps all of the text: what an editor marks before anything is written. `size` is the
 // field's, -1 for none.
 bool IsKeptWhole(const QString& text, FieldType type, int size);

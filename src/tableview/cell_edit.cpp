@@ -6,11 +6,12 @@
 
 namespace mirel {
 
-void CellEdit::Load(const Value& value, FieldType type, int size)
+void CellEdit::Load(const Value& value, FieldType type, int size, bool readsLeading)
 {
     Unload();
     type_ = type;
     size_ = size;
+    readsLeading_ = readsLeading;
     if (type == FieldType::YesNo) {
         kind_ = EditorKind::Check;
         checked_ = loadedChecked_ = value.Number() != 0;
@@ -21,9 +22,14 @@ void CellEdit::Load(const Value& value, FieldType type, int size)
     text_ = loadedText_ = VariantText(value);
 }
 
+QString CellEdit::TextToStore() const
+{
+    return readsLeading_ ? LeadingNumber(text_, type_) : text_;
+}
+
 QString CellEdit::WhyNotStored() const
 {
-    return !pending_ || kind_ == EditorKind::Check ? QString() : mirel::WhyNotStored(text_, type_, size_);
+    return !pending_ || kind_ == EditorKind::Check ? QString() : mirel::WhyNotStored(TextToStore(), type_, size_);
 }
 
 void CellEdit::SetText(const QString& text)
@@ -56,7 +62,7 @@ void CellEdit::Revert()
 
 Value CellEdit::Stored() const
 {
-    return kind_ == EditorKind::Check ? Value::Bool(checked_) : TypedValue(text_, type_);
+    return kind_ == EditorKind::Check ? Value::Bool(checked_) : TypedValue(TextToStore(), type_);
 }
 
 } // namespace mirel

@@ -13,7 +13,8 @@ enum class EditorKind { None, Text, Date, Check };
 // A date is edited as text, in the form the user writes dates; a Yes/No is ticked or not.
 class CellEdit {
 public:
-    void Load(const Value& value, FieldType type, int size);
+    // `readsLeading`: a number is what its text begins with, and not the whole of it.
+    void Load(const Value& value, FieldType type, int size, bool readsLeading = false);
     void Unload() { *this = CellEdit(); }
 
     EditorKind Kind() const { return kind_; }
@@ -33,9 +34,12 @@ public:
     Value Stored() const;
 
 private:
+    QString TextToStore() const;
+
     EditorKind kind_ = EditorKind::None;
     FieldType type_ = FieldType::None;
     int size_ = -1;
+    bool readsLeading_ = false;
     QString loadedText_;
     QString text_;
     bool loadedChecked_ = false;

@@ -36,7 +36,7 @@ bool RecordBrowser::WriteEdit()
     if (SelectedRecord() >= 0 && list_.RowOf(SelectedRecord()) != SelectedRow())
         ShowRecordAgain(SelectedRecord()); // others have moved it meanwhile
     edit_.Load(Recordset().FieldValue(selectedField_), TypeOfField(selectedField_),
-               Recordset().FieldSize(selectedField_));
+               Recordset().FieldSize(selectedField_), settings_.leadingNumber);
     RefreshCell();
     return true;
 }

@@ -241,7 +241,7 @@ void RecordBrowser::LoadEditor()
         return;
     }
     edit_.Load(Recordset().FieldValue(selectedField_), TypeOfField(selectedField_),
-               Recordset().FieldSize(selectedField_));
+               Recordset().FieldSize(selectedField_), settings_.leadingNumber);
 }
 
 // Makes the record current, and scrolls no further than it takes to show it; the page is then to be filled.

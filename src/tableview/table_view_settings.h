@@ -13,6 +13,7 @@ struct TableViewSettings {
     bool sortByHeader = false;
     int holdTimeMs = 400; // how long a hold takes to open the popup menu; 0 or less: it never does
     bool autoSizing = true;
+    bool leadingNumber = false; // a typed number is what its text begins with, not the whole of it
     YesNoWords words;
 
     friend bool operator==(const TableViewSettings&, const TableViewSettings&) = default;

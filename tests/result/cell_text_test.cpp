@@ -35,6 +35,22 @@ TEST(GridText, ShowsEachKindOfCellAsTheUserReadsIt)
         EXPECT_EQ(GridText(row.cell, row.type, kWords, 50), row.text) << row.what;
 }
 
+TEST(TypedValue, TakesTheNumberThatATextBeginsWithWhereAsked)
+{
+    const struct {
+        QString text;
+        FieldType type;
+        QString number;
+    } rows[] = {
+        {u"12.7"_s, FieldType::Integer, u"12"_s},       {u"abc"_s, FieldType::SmallInt, u"0"_s},
+        {u" -3 apples"_s, FieldType::Integer, u"-3"_s}, {u"1,234.50"_s, FieldType::Double, u"1"_s},
+        {u".5e2 m"_s, FieldType::Double, u".5e2"_s},    {u"."_s, FieldType::Double, u"0"_s},
+        {u"12 men"_s, FieldType::Text, u"12 men"_s},    {QString(), FieldType::Integer, QString()},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(LeadingNumber(row.text, row.type), row.number) << row.text.toStdString();
+}
+
 TEST(GridText, IsCutWhereItIsLongerThanTheLimit)
 {
     const struct {
