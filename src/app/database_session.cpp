@@ -130,6 +130,10 @@ void DatabaseSession::LoadStore(OpenedDatabase& opened)
     if (opened.store->Load())
         return;
     if (!QFileInfo::exists(opened.sideFile)) {
+        // A copy that was handed on brings its forms and queries along.
+        if (const QByteArray carried = connection_.Provider()->Care().Belongings(opened.location);
+            !carried.isEmpty())
+            (void)opened.store->LoadFrom(carried);
         if (!opened.store->Save())
             prompt_.ShowError(opened.store->LastError());
         return;

@@ -12,6 +12,11 @@ ExitStatus RunDrop(Run& run);
 ExitStatus RunTables(Run& run);
 ExitStatus RunFields(Run& run);
 
+// care_commands.cpp
+ExitStatus RunCheck(Run& run);
+ExitStatus RunBackup(Run& run);
+ExitStatus RunCompact(Run& run);
+
 // sql_command.cpp
 ExitStatus RunSql(Run& run);
 

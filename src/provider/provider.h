@@ -5,6 +5,7 @@
 #include "platform/hr.h"
 #include "platform/record_id.h"
 #include "platform/value.h"
+#include "provider/database_care.h"
 #include "provider/database_location.h"
 
 #include <QString>
@@ -208,6 +209,8 @@ public:
 
     // Gives the file up. Results still open on it are closed: their calls fail with NotOpen from then on.
     virtual void CloseDatabase(const DatabaseLocation& database) = 0;
+
+    virtual DatabaseCare& Care() = 0;
 };
 
 // The provider of that name ("cedb"), null when there is none.

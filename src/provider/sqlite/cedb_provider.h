@@ -1,6 +1,7 @@
 #pragma once
 
 #include "provider/provider.h"
+#include "provider/sqlite/cedb_care.h"
 #include "provider/sqlite/outcome.h"
 
 #include <QHash>
@@ -25,11 +26,13 @@ public:
     std::unique_ptr<ProviderTransaction> BeginTransaction(const DatabaseLocation& database, Hr& result,
                                                           QString& context) override;
     void CloseDatabase(const DatabaseLocation& database) override;
+    DatabaseCare& Care() override { return care_; }
 
     // The file of that path, opened when it is not yet; null, and why, when it cannot be.
     std::shared_ptr<DatabaseFile> FileOf(const DatabaseLocation& database, Outcome& outcome);
 
 private:
+    CedbCare care_{*this};
     QHash<QString, std::shared_ptr<DatabaseFile>> files_; // by IdentityOfPath
 };
 

@@ -1,5 +1,6 @@
 #include "provider/sqlite/schema_reader.h"
 
+#include "provider/sqlite/cedb_care.h"
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/declared_type.h"
 #include "provider/sqlite/sql_writer.h"
@@ -33,7 +34,8 @@ private:
     // Exactly so: a file may have a table of its own whose name differs in the case of a letter.
     bool IsCatalogName(const QString& name) const
     {
-        return std::ranges::find(schema_.tables, name, &dialect::Table::name) != schema_.tables.end();
+        return name == QLatin1StringView(kBelongingsTable) ||
+               std::ranges::find(schema_.tables, name, &dialect::Table::name) != schema_.tables.end();
     }
 
     DatabaseFile& file_;
