@@ -1,0 +1,96 @@
+#include "resources/string_table.h"
+#include "tableview/ui/table_view_commands.h"
+
+#include <array>
+
+// What stands behind entries of the menus: changes of all records, sums, the layout.
+
+namespace mirel {
+
+std::span<const TableRow> CTableView::Commands::SubmenuRows()
+{
+    using R = ResultCommands;
+    static constexpr std::array kRows = {
+        TableRow{{.id = Id(TableCommand::DeleteAll),
+                  .text = Str::ActionDeleteAll,
+                  .tip = Str::ActionDeleteAllTip,
+                  .menus = TableEditAllMenu},
+                 Result<&R::DeleteAll>,
+                 CanChangeRecords},
+        TableRow{{.id = Id(TableCommand::UpdateAll),
+                  .text = Str::ActionUpdateAll,
+                  .tip = Str::ActionUpdateAllTip,
+                  .menus = TableEditAllMenu},
+                 Result<&R::UpdateAll>,
+                 CanChangeValues},
+        TableRow{{.id = Id(TableCommand::Sum),
+                  .text = Str::ActionSum,
+                  .tip = Str::ActionSumTip,
+                  .menus = TableAggregateMenu},
+                 Compute<Aggregate::Sum>,
+                 HasRecord},
+        TableRow{{.id = Id(TableCommand::Max),
+                  .text = Str::ActionMax,
+                  .tip = Str::ActionMaxTip,
+                  .menus = TableAggregateMenu},
+                 Compute<Aggregate::Max>,
+                 HasRecord},
+        TableRow{{.id = Id(TableCommand::Min),
+                  .text = Str::ActionMin,
+                  .tip = Str::ActionMinTip,
+                  .menus = TableAggregateMenu},
+                 Compute<Aggregate::Min>,
+                 HasRecord},
+        TableRow{{.id = Id(TableCommand::Avg),
+                  .text = Str::ActionAvg,
+                  .tip = Str::ActionAvgTip,
+                  .menus = TableAggregateMenu},
+                 Compute<Aggregate::Avg>,
+                 HasRecord},
+        TableRow{{.id = Id(TableCommand::LayoutFont),
+                  .text = Str::CommandFont,
+                  .tip = Str::TipFont,
+                  .icon = u"preferences-desktop-font",
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::Font>},
+        TableRow{{.id = Id(TableCommand::LayoutBackground),
+                  .text = Str::CommandBackgroundColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::LineBackground>},
+        TableRow{{.id = Id(TableCommand::LayoutListBackground),
+                  .text = Str::CommandListBackgroundColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::ListBackground>},
+        TableRow{{.id = Id(TableCommand::LayoutButtonBackground),
+                  .text = Str::CommandButtonBackgroundColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::ButtonBackground>},
+        TableRow{{.id = Id(TableCommand::LayoutText),
+                  .text = Str::LayoutTextColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::LineText>},
+        TableRow{{.id = Id(TableCommand::LayoutListText),
+                  .text = Str::CommandListTextColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::ListText>},
+        TableRow{{.id = Id(TableCommand::LayoutButtonText),
+                  .text = Str::CommandButtonTextColor,
+                  .tip = Str::TipColor,
+                  .menus = TableLayoutMenu},
+                 Look<LookItem::ButtonText>},
+        TableRow{{.id = Id(TableCommand::LayoutReset),
+                  .text = Str::LayoutReset,
+                  .tip = Str::LayoutResetTip,
+                  .menus = TableLayoutMenu,
+                  .group = 1},
+                 Look<LookItem::Reset>},
+    };
+    return kRows;
+}
+
+} // namespace mirel
