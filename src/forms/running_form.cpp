@@ -152,7 +152,7 @@ std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int co
     return controls_.ListRows(control, source_, first, count);
 }
 
-bool RunningForm::ShowsNumbers(int control, int column) const
+bool RunningForm::ShowsNumbers(int control, int column)
 {
     if (!controls_.Is(control, ControlType::List) || !HasResult() || column < 0 ||
         column >= controls_[control].columns.size())

@@ -88,7 +88,7 @@ public:
 
     // The texts of a list's rows, a QStringList a row, uncut. Fewer than asked for at the end.
     std::vector<QStringList> ListRows(int control, qint64 first, int count);
-    bool ShowsNumbers(int control, int column) const; // of a list: a field of numbers
+    bool ShowsNumbers(int control, int column); // of a list: a field of numbers
 
     // --- what the user does to controls -------------------------------------------------------------------
 
