@@ -70,6 +70,13 @@ void EntrySummary::StopCounting()
     counted_.reset();
 }
 
+QString EntrySummary::Name() const
+{
+    if (entry_)
+        return entry_->name;
+    return file_.exists ? QFileInfo(session_.Location().FilePath()).fileName() : QString();
+}
+
 QStringList EntrySummary::Lines() const
 {
     QStringList lines;
@@ -77,7 +84,9 @@ QStringList EntrySummary::Lines() const
         lines += EntryLine();
     if (file_.exists) {
         const QString size = UserLocale::Current().Locale().formattedDataSize(file_.sizeBytes, 1);
-        lines += StringText(Str::SummaryFile, {QFileInfo(session_.Location().FilePath()).fileName(), size});
+        lines += entry_
+                     ? StringText(Str::SummaryFile, {QFileInfo(session_.Location().FilePath()).fileName(), size})
+                     : size;
         lines += ChangeText(file_.changed);
     }
     return lines;

@@ -28,7 +28,7 @@ public:
     // Lets go of the table, so that it can be dropped.
     void StopCounting();
 
-    QString Name() const { return entry_ ? entry_->name : QString(); }
+    QString Name() const; // without an entry, the database's
     QStringList Lines() const;
 
 private:

@@ -39,6 +39,20 @@ QString LineOf(const NameUse& use)
     return StringText(text, {use.name, QString::number(use.places)});
 }
 
+// One after the other; several first take names that nothing bears, so that none is taken for another's old one.
+bool MendAll(FormStore& store, const std::vector<NameChange>& changes)
+{
+    if (changes.size() == 1)
+        return !MendNames(store, changes.front()).empty();
+    const auto between = [](size_t i) { return u"mirel renaming %1"_s.arg(i); };
+    bool any = false;
+    for (size_t i = 0; i < changes.size(); ++i)
+        any = !MendNames(store, {changes[i].what, changes[i].table, changes[i].from, between(i)}).empty() || any;
+    for (size_t i = 0; i < changes.size(); ++i)
+        MendNames(store, {changes[i].what, changes[i].table, between(i), changes[i].to});
+    return any;
+}
+
 template <typename Record>
 void RenameRecord(Record* record, const QString& newName)
 {
@@ -91,7 +105,18 @@ bool Renaming::Rename(const NameChange& change, const std::function<bool(const D
     const Choice choice = Ask(change);
     if (choice == Choice::Cancel)
         return false;
-    if (choice == Choice::RenameAlone || session_.Store().Path().isEmpty())
+    if (choice == Choice::RenameAlone)
+        return rename({});
+    const bool renamed = RenameAndMend({change}, rename);
+    if (renamed && MendsFavorites(change))
+        MendFavorites(change);
+    return renamed;
+}
+
+bool Renaming::RenameAndMend(const std::vector<NameChange>& changes,
+                             const std::function<bool(const DesignRun::LastStep& last)>& rename)
+{
+    if (changes.empty() || session_.Store().Path().isEmpty())
         return rename({});
     bool mended = false;
     bool failed = false;
@@ -99,7 +124,7 @@ bool Renaming::Rename(const NameChange& change, const std::function<bool(const D
     const bool renamed = rename([&] {
         mended = session_.Store().Apply([&](FormStore& store) {
             before = store;
-            return !MendNames(store, change).empty();
+            return MendAll(store, changes);
         });
         failed = !mended && !session_.Store().LastError().isEmpty();
         return !failed;
@@ -114,8 +139,6 @@ bool Renaming::Rename(const NameChange& change, const std::function<bool(const D
             return true;
         });
     }
-    if (renamed && MendsFavorites(change))
-        MendFavorites(change);
     return renamed;
 }
 

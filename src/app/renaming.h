@@ -21,6 +21,10 @@ public:
 
     // Of a table or a field: `rename` does it, and does the last step that it is given before it commits.
     bool Rename(const NameChange& change, const std::function<bool(const DesignRun::LastStep& last)>& rename);
+    // The same for several at once, names exchanged included, without a question: all that refers to them is
+    // mended.
+    bool RenameAndMend(const std::vector<NameChange>& changes,
+                       const std::function<bool(const DesignRun::LastStep& last)>& rename);
     // Of a form or a saved query. False, with the reason told, for a name that cannot be or is taken.
     bool RenameInStore(EntryKind kind, const QString& name, const QString& newName);
 

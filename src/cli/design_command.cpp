@@ -1,3 +1,4 @@
+#include "app/renaming.h"
 #include "cli/commands.h"
 #include "cli/run.h"
 #include "resources/string_table.h"
@@ -29,6 +30,17 @@ public:
 private:
     UserPrompt& prompt_;
 };
+
+// The fields that the list calls otherwise than the table does.
+std::vector<NameChange> NewNames(const QString& table, const std::vector<FieldDesign>& fields)
+{
+    std::vector<NameChange> changes;
+    for (const FieldDesign& field : fields) {
+        if (!field.was.isEmpty() && field.was != field.name)
+            changes.push_back({NameChange::What::Field, table, field.was, field.name});
+    }
+    return changes;
+}
 
 // One design, from the file to the table.
 class DesignCommand {
@@ -93,7 +105,13 @@ private:
         const QStringList dropped = PlanDesign(*current, *fields).dropped;
         if (!dropped.isEmpty() && !run_.Args().Has(Opt::Yes))
             return run_.Refuse(StringText(Str::DesignNeedsYes, {dropped.join(QStringLiteral(", "))}));
-        switch (design_.Apply(*current, *fields)) {
+        DesignRun::Outcome outcome = DesignRun::Outcome::Refused;
+        Renaming(run_.Session())
+            .RenameAndMend(NewNames(current->table, *fields), [&](const DesignRun::LastStep& last) {
+                outcome = design_.Apply(*current, *fields, last);
+                return outcome == DesignRun::Outcome::Done;
+            });
+        switch (outcome) {
         case DesignRun::Outcome::Done:
             return ExitStatus::Done;
         case DesignRun::Outcome::Stale:

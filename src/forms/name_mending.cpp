@@ -7,6 +7,8 @@
 #include "provider/dialect/lexer.h"
 #include "provider/dialect/parser.h"
 
+#include <QRegularExpression>
+
 #include <algorithm>
 
 namespace mirel {
@@ -357,6 +359,9 @@ private:
     }
 
     void MendControl(ControlDef& control);
+    void MendDropDown(ControlDef& control);
+    bool ShowsItsOwn(const ControlDef& control) const;
+    void RenameControl(ControlDef& control);
     void MendButton(ControlDef& button);
     void MendAssignments(ControlDef& button);
 
@@ -382,23 +387,14 @@ void FormMender::MendControl(ControlDef& control)
             control.SetSource(JoinListColumns(columns));
         return;
     }
-    case ControlType::DropDownBox: {
-        const DropDownSource before = SplitDropDown(source);
-        DropDownSource after = before;
-        after.query = mender_.Statement(before.query, {});
-        if (control.hasSource != 0 && DropDownItems(before.data).size() == 1)
-            after.data = mender_.Expression(before.data, ExprMode::Condition, mayBeBare_);
-        if (after.query != before.query || after.data != before.data)
-            control.SetSource(JoinDropDown(after));
-        return;
-    }
+    case ControlType::DropDownBox:
+        return MendDropDown(control);
     case ControlType::EditBox:
     case ControlType::CheckBox:
         if (control.hasSource != 0 && !source.isEmpty())
             return Put(control.source, mender_.Expression(source, ExprMode::Condition, mayBeBare_));
-        // It shows the field of its own name; other controls refer to that name, so it gets a source instead.
-        if (control.fieldBound != 0 && change_.what == NameChange::What::Field && mayBeBare_ &&
-            SameName(control.name.Text(), change_.from)) {
+        // Other controls refer to its name, so it gets a source instead.
+        if (ShowsItsOwn(control)) {
             control.hasSource = 1;
             control.SetSource(NameInBrackets(change_.to));
             mender_.Note();
@@ -408,6 +404,55 @@ void FormMender::MendControl(ControlDef& control)
     case ControlType::Label:
         return;
     }
+}
+
+// Whether the control shows the field that is renamed because it bears its name.
+bool FormMender::ShowsItsOwn(const ControlDef& control) const
+{
+    return control.fieldBound != 0 && change_.what == NameChange::What::Field && mayBeBare_ &&
+           SameName(control.name.Text(), change_.from);
+}
+
+void FormMender::MendDropDown(ControlDef& control)
+{
+    const DropDownSource before = SplitDropDown(control.source.Text());
+    DropDownSource after = before;
+    after.query = mender_.Statement(before.query, {});
+    const qsizetype items = control.hasSource != 0 ? DropDownItems(before.data).size() : 0;
+    if (items == 1)
+        after.data = mender_.Expression(before.data, ExprMode::Condition, mayBeBare_);
+    if (ShowsItsOwn(control) && after.data == before.data) {
+        if (items == 0) {
+            after.data = NameInBrackets(change_.to);
+            control.hasSource = 1;
+        } else {
+            RenameControl(control); // its items leave no room for a source
+        }
+        mender_.Note();
+    }
+    if (after.query != before.query || after.data != before.data)
+        control.SetSource(JoinDropDown(after));
+}
+
+// The control takes the field's new name, and what refers to it follows: "&Name" and "&[Name]", in quotes, too.
+void FormMender::RenameControl(ControlDef& control)
+{
+    const QString from = QRegularExpression::escape(control.name.Text());
+    const QRegularExpression reference(u"&(\\[%1\\]|%1(?![\\w]))"_s.arg(from),
+                                       QRegularExpression::CaseInsensitiveOption);
+    const QString to = u'&' + FieldReference(change_.to);
+    for (ControlDef& each : form_.controls) {
+        QString source = each.source.Text();
+        qsizetype at = 0;
+        for (QRegularExpressionMatch match = reference.match(source); match.hasMatch();
+             match = reference.match(source, at)) {
+            source.replace(match.capturedStart(), match.capturedLength(), to);
+            at = match.capturedStart() + to.size();
+        }
+        if (source != each.source.Text())
+            each.SetSource(source);
+    }
+    control.name.Set(change_.to);
 }
 
 void FormMender::MendButton(ControlDef& button)

@@ -152,6 +152,16 @@ std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int co
     return controls_.ListRows(control, source_, first, count);
 }
 
+bool RunningForm::ShowsNumbers(int control, int column)
+{
+    if (!controls_.Is(control, ControlType::List) || !HasResult() || column < 0 ||
+        column >= controls_[control].columns.size())
+        return false;
+    const ControlBinding& binding = controls_.Bindings()[size_t(control)];
+    const int field = ColumnOf(binding.columns[size_t(column)].tree.get(), source_.Context());
+    return field >= 0 && IsRightAligned(source_.Records().TypeOfField(field));
+}
+
 QString RunningForm::CounterText() const
 {
     return HasResult() ? u"%1/%2"_s.arg(source_.Index() + 1).arg(source_.Count()) : QString();
@@ -513,6 +523,24 @@ RunningForm::Outcome RunningForm::SortByTerms(const QString& terms)
 RunningForm::Outcome RunningForm::RemoveFilter()
 {
     return Rearrange([&] { return source_.Result().RemoveConditions(); });
+}
+
+RunningForm::Outcome RunningForm::TakeFilterOff(int filter)
+{
+    std::vector<OpenResult::Filter> filters = Filters();
+    if (filter < 0 || size_t(filter) >= filters.size())
+        return Outcome::Done;
+    filters.erase(filters.begin() + filter);
+    return Rearrange([&] { return source_.Result().Refilter(filters); });
+}
+
+RunningForm::Outcome RunningForm::SwitchFilter(int filter)
+{
+    std::vector<OpenResult::Filter> filters = Filters();
+    if (filter < 0 || size_t(filter) >= filters.size())
+        return Outcome::Done;
+    filters[size_t(filter)].on = !filters[size_t(filter)].on;
+    return Rearrange([&] { return source_.Result().Refilter(filters); });
 }
 
 } // namespace mirel

@@ -88,6 +88,7 @@ public:
 
     // The texts of a list's rows, a QStringList a row, uncut. Fewer than asked for at the end.
     std::vector<QStringList> ListRows(int control, qint64 first, int count);
+    bool ShowsNumbers(int control, int column); // of a list: a field of numbers
 
     // --- what the user does to controls -------------------------------------------------------------------
 
@@ -145,8 +146,12 @@ public:
     Outcome SortByControl(int control, SortOrder order);
     Outcome AddCondition(const QString& condition);
     Outcome SortByTerms(const QString& terms);
-    bool IsFiltered() const { return !Conditions().isEmpty(); }
-    const QStringList& Conditions() const { return source_.Result().Conditions(); }
+    bool IsFiltered() const { return !Filters().empty(); }
+    QStringList Conditions() const { return source_.Result().Conditions(); } // those in force
+    const std::vector<OpenResult::Filter>& Filters() const { return source_.Result().Filters(); }
+    // One of them, by its place in the list.
+    Outcome TakeFilterOff(int filter);
+    Outcome SwitchFilter(int filter);
     Outcome RemoveFilter(); // back to the query that was run, its order included
 
     // --- the result as records: for the list, zoom and detail modes -----------------------------------------

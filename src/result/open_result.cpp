@@ -41,7 +41,8 @@ void OpenResult::Report()
 
 bool OpenResult::Open(const QString& statement)
 {
-    conditions_.clear();
+    filters_.clear();
+    order_.clear();
     baseStatement_ = statement;
     return Execute(statement);
 }
@@ -50,14 +51,17 @@ bool OpenResult::OpenInstead(const QString& statement)
 {
     const QString base = baseStatement_;
     const QString current = statement_;
-    const QStringList conditions = conditions_;
+    const std::vector<Filter> filters = filters_;
+    const QString order = order_;
     if (Open(statement))
         return true;
     if (base.isEmpty())
         return false;
     baseStatement_ = base;
-    if (Execute(current))
-        conditions_ = conditions;
+    if (Execute(current)) {
+        filters_ = filters;
+        order_ = order;
+    }
     return false;
 }
 
@@ -121,20 +125,73 @@ bool OpenResult::AddCondition(const QString& condition)
 {
     if (!Rewrite(WithCondition(statement_, condition)))
         return false;
-    conditions_ += condition;
+    filters_.push_back({condition});
     return true;
 }
 
 bool OpenResult::OrderBy(const QString& terms)
 {
-    return Rewrite(WithOrder(statement_, terms));
+    if (!Rewrite(WithOrder(statement_, terms)))
+        return false;
+    order_ = terms;
+    return true;
 }
 
 bool OpenResult::RemoveConditions()
 {
     if (!Rewrite(baseStatement_))
         return false;
-    conditions_.clear();
+    filters_.clear();
+    order_.clear();
+    return true;
+}
+
+bool OpenResult::Refilter(const std::vector<Filter>& filters)
+{
+    QString statement = baseStatement_;
+    for (const Filter& filter : filters) {
+        if (filter.on)
+            statement = WithCondition(statement, filter.condition);
+    }
+    if (!order_.isEmpty())
+        statement = WithOrder(statement, order_);
+    const RecordId id = records_.Id();
+    if (!Rewrite(statement))
+        return false;
+    ReturnTo(id, 0);
+    filters_ = filters;
+    return true;
+}
+
+QStringList OpenResult::Conditions() const
+{
+    QStringList conditions;
+    for (const Filter& filter : filters_) {
+        if (filter.on)
+            conditions += filter.condition;
+    }
+    return conditions;
+}
+
+bool OpenResult::OpenRenamed(const std::function<QString(const QString&)>& renamed)
+{
+    const QString base = renamed(baseStatement_);
+    const QString current = renamed(statement_);
+    // A part reads by the new names as the whole does that ends with it.
+    const auto renamedPart = [&](const QString& part, QString (*put)(const QString&, const QString&)) {
+        const QString before = put(base, QStringLiteral("1"));
+        const QString whole = renamed(put(baseStatement_, part));
+        const QString head = before.chopped(1);
+        return before.endsWith(u'1') && whole.startsWith(head) ? whole.sliced(head.size()) : part;
+    };
+    std::vector<Filter> filters = filters_;
+    for (Filter& filter : filters)
+        filter.condition = renamedPart(filter.condition, WithCondition);
+    const QString order = order_.isEmpty() ? QString() : renamedPart(order_, WithOrder);
+    if (!Open(base) || (current != base && !Rewrite(current)))
+        return false;
+    filters_ = filters;
+    order_ = order;
     return true;
 }
 

@@ -39,6 +39,14 @@ struct SeenRecord {
 // Connection and prompt must outlive the result.
 class OpenResult {
 public:
+    // A condition that a filter has put onto the base statement. Switched off, it stays in the list alone.
+    struct Filter {
+        QString condition;
+        bool on = true;
+
+        friend bool operator==(const Filter&, const Filter&) = default;
+    };
+
     OpenResult(DbConnection& connection, DatabaseLocation database, UserPrompt& prompt);
     Q_DISABLE_COPY_MOVE(OpenResult)
 
@@ -66,7 +74,13 @@ public:
     bool AddCondition(const QString& condition);
     bool OrderBy(const QString& terms);
     bool RemoveConditions(); // back to the base statement, its order included
-    const QStringList& Conditions() const { return conditions_; }
+    // These conditions instead of those there are; the order stays, and the current record where it is still in
+    // the result. Where they are refused, all is as before.
+    bool Refilter(const std::vector<Filter>& filters);
+    const std::vector<Filter>& Filters() const { return filters_; }
+    QStringList Conditions() const; // those in force
+    // Opens the same with other names in its statements: `renamed` makes one say the new ones.
+    bool OpenRenamed(const std::function<QString(const QString&)>& renamed);
 
     // --- fields -----------------------------------------------------------------------------------------------
 
@@ -216,7 +230,8 @@ private:
     DatabaseLocation database_;
     QString baseStatement_;
     QString statement_;
-    QStringList conditions_;
+    std::vector<Filter> filters_;
+    QString order_; // put onto the base statement; empty: its own
     quint64 runs_ = 0;
     std::optional<qint64> count_;
     quint64 generation_ = 0; // of the records, when position_ was taken

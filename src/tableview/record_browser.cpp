@@ -67,6 +67,15 @@ bool RecordBrowser::Rewrite(const QString& statement)
     return WriteEdit() && Execute([&] { return result_.Rewrite(statement); });
 }
 
+bool RecordBrowser::OpenRenamed(const std::function<QString(const QString&)>& renamed)
+{
+    if (!WriteEdit())
+        return false;
+    fieldNames_.clear(); // a hidden column shows again: it may bear another name
+    visible_.clear();
+    return Execute([&] { return result_.OpenRenamed(renamed); });
+}
+
 bool RecordBrowser::RunAgain()
 {
     if (!WriteEdit())

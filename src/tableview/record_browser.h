@@ -54,6 +54,7 @@ public:
     // is run again.
     bool Rewrite(const QString& statement);
     bool RunAgain(); // the current statement; the selection stays on its position
+    bool OpenRenamed(const std::function<QString(const QString&)>& renamed); // as OpenResult's
     void Close();
     bool IsOpen() const { return result_.IsOpen(); }
     bool CanUpdate() const { return result_.CanUpdate(); }
@@ -164,8 +165,13 @@ public:
     bool FilterByCell(CellFilter filter); // the selected cell
     bool AddCondition(const QString& condition);
     bool RemoveFilter(); // back to the base statement, its order included
-    bool IsFiltered() const { return !Conditions().isEmpty(); }
-    const QStringList& Conditions() const { return result_.Conditions(); }
+    bool IsFiltered() const { return !Filters().empty(); }
+    QStringList Conditions() const { return result_.Conditions(); } // those in force
+    const std::vector<OpenResult::Filter>& Filters() const { return result_.Filters(); }
+    // One of the filters, by its place in the list. They work on an empty result, too.
+    bool TakeFilterOff(int filter);
+    bool SwitchFilter(int filter);
+    bool ChangeFilter(int filter, const QString& condition);
 
     bool SortByColumn(int field, SortDirection direction);
     bool SortByTerms(const QString& terms);
@@ -260,6 +266,7 @@ private:
 
     // The result.
     bool Execute(const std::function<bool()>& run);
+    bool Refilter(const std::vector<OpenResult::Filter>& filters);
     void ShowFromStart();
     void Clear();
     void TakeUpFields();

@@ -38,6 +38,38 @@ bool RecordBrowser::RemoveFilter()
     return true;
 }
 
+bool RecordBrowser::Refilter(const std::vector<OpenResult::Filter>& filters)
+{
+    return IsOpen() && WriteEdit() && Execute([&] { return result_.Refilter(filters); });
+}
+
+bool RecordBrowser::TakeFilterOff(int filter)
+{
+    std::vector<OpenResult::Filter> filters = Filters();
+    if (filter < 0 || size_t(filter) >= filters.size())
+        return true;
+    filters.erase(filters.begin() + filter);
+    return Refilter(filters);
+}
+
+bool RecordBrowser::SwitchFilter(int filter)
+{
+    std::vector<OpenResult::Filter> filters = Filters();
+    if (filter < 0 || size_t(filter) >= filters.size())
+        return true;
+    filters[size_t(filter)].on = !filters[size_t(filter)].on;
+    return Refilter(filters);
+}
+
+bool RecordBrowser::ChangeFilter(int filter, const QString& condition)
+{
+    std::vector<OpenResult::Filter> filters = Filters();
+    if (filter < 0 || size_t(filter) >= filters.size() || condition.isEmpty())
+        return true;
+    filters[size_t(filter)] = {condition};
+    return Refilter(filters);
+}
+
 bool RecordBrowser::SortByTerms(const QString& terms)
 {
     if (!IsOpen() || IsEmpty() || terms.isEmpty())

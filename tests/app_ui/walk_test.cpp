@@ -13,6 +13,7 @@
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
+#include "support/ui/screen_checks.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/csv_options_dialog.h"
@@ -26,23 +27,14 @@
 #include "tableview/ui/statement_dialog.h"
 #include "tableview/ui/table_view.h"
 
-#include <QAbstractButton>
-#include <QAbstractItemView>
-#include <QAbstractSpinBox>
-#include <QAccessible>
 #include <QApplication>
 #include <QCheckBox>
-#include <QComboBox>
 #include <QDialogButtonBox>
-#include <QDir>
-#include <QLabel>
-#include <QLineEdit>
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QTabWidget>
 #include <QTest>
 #include <QTimer>
-#include <QToolButton>
 
 namespace mirel {
 namespace {
@@ -64,86 +56,6 @@ protected:
     {
         QApplication::setStyle(u"Fusion"_s);
         QApplication::setPalette(before_);
-    }
-
-    static void Paint(QWidget& shown, const QString& name)
-    {
-        const QString folder = qEnvironmentVariable("MIREL_PICTURES");
-        if (!folder.isEmpty()) {
-            EXPECT_TRUE(shown.grab().save(QDir(folder).filePath(name + u".png"_s)));
-        }
-    }
-
-    // What of a widget has a name for those who do not see it: its own, its text, or the label that leads to it.
-    static QString NameOf(QWidget& widget)
-    {
-        const QAccessibleInterface* read = QAccessible::queryAccessibleInterface(&widget);
-        return read ? read->text(QAccessible::Name) : widget.accessibleName();
-    }
-
-    static bool IsPartOfAnother(const QWidget& widget)
-    {
-        const QWidget* parent = widget.parentWidget();
-        return widget.objectName().startsWith(u"qt_") || qobject_cast<const QComboBox*>(parent) ||
-               qobject_cast<const QAbstractSpinBox*>(parent) || qobject_cast<const QAbstractItemView*>(parent) ||
-               (parent && parent->inherits("QTabBar")) || (parent && parent->inherits("QLineEdit")) ||
-               widget.inherits("QTabBar") || widget.inherits("QScrollBar");
-    }
-
-    static void ExpectWithin(QWidget& part, QWidget& whole, const std::string& where)
-    {
-        const QRect place(part.mapTo(&whole, QPoint()), part.size());
-        EXPECT_GE(place.left(), 0) << where;
-        EXPECT_LE(place.right(), whole.width()) << where << ": " << place.right();
-        bool scrolls = false;
-        for (const QWidget* over = part.parentWidget(); over && over != &whole; over = over->parentWidget())
-            scrolls = scrolls || qobject_cast<const QAbstractScrollArea*>(over);
-        if (!scrolls) {
-            EXPECT_LE(place.bottom(), whole.height()) << where << ": " << place.bottom();
-        }
-    }
-
-    static void ExpectWholeText(QWidget& part, const QString& text, int widthPx, const std::string& where)
-    {
-        if (text.isEmpty() || text.contains(u'…'))
-            return;
-        EXPECT_GE(part.width() + 1, widthPx) << where << " cuts \"" << text.toStdString() << "\"";
-    }
-
-    static void ExpectReachable(QWidget& part, const std::string& where)
-    {
-        const bool button = qobject_cast<QAbstractButton*>(&part);
-        const bool operated = button || qobject_cast<QLineEdit*>(&part) || qobject_cast<QComboBox*>(&part) ||
-                              qobject_cast<QAbstractItemView*>(&part) || qobject_cast<QPlainTextEdit*>(&part);
-        const auto* line = qobject_cast<QLineEdit*>(&part);
-        if (!operated || !part.isEnabled() || (line && line->isReadOnly()))
-            return;
-        EXPECT_FALSE(NameOf(part).isEmpty()) << where << " has no name";
-        // The button of a date has its keys in the date's line.
-        const bool hasKeyElsewhere = button && part.parentWidget()->inherits("mirel::DateField");
-        EXPECT_TRUE((part.focusPolicy() & Qt::TabFocus) || hasKeyElsewhere) << where << " is out of Tab's way";
-    }
-
-    static void ExpectFits(QWidget& whole, const QString& name, QSize screen)
-    {
-        QApplication::processEvents();
-        Paint(whole, u"%1-%2x%3"_s.arg(name, QString::number(screen.width()), QString::number(screen.height())));
-        EXPECT_LE(whole.width(), screen.width()) << name.toStdString();
-        EXPECT_LE(whole.height(), screen.height()) << name.toStdString();
-        for (QWidget* part : whole.findChildren<QWidget*>()) {
-            if (!part->isVisibleTo(&whole) || part->isWindow() || IsPartOfAnother(*part))
-                continue;
-            const std::string where =
-                (name + u": "_s + QString::fromLatin1(part->metaObject()->className()) + u' ' + NameOf(*part))
-                    .toStdString();
-            ExpectWithin(*part, whole, where);
-            ExpectReachable(*part, where);
-            if (const auto* label = qobject_cast<QLabel*>(part); label && !label->wordWrap())
-                ExpectWholeText(*part, label->text(), label->sizeHint().width(), where);
-            if (const auto* box = qobject_cast<QAbstractButton*>(part); box && !qobject_cast<QToolButton*>(part))
-                ExpectWholeText(*part, box->text(),
-                                box->fontMetrics().size(Qt::TextShowMnemonic, box->text()).width() + 8, where);
-        }
     }
 
     // A dialog over a window of each size, as its command brings it up.
@@ -315,7 +227,12 @@ TEST_F(Walk, GoesThroughTheMessageBoxes)
         boxes.ShowError(QString(u"A path without a blank: "_s) + QString(3000, u'p'));
         look(u"box-question"_s);
         (void)boxes.AskYesNoWith({Str::DeleteAllReally, {u"10000"_s}}, {.note = u"Undo takes this back."_s});
-        EXPECT_EQ(met, 3);
+        look(u"box-three-answers"_s);
+        (void)boxes.AskYesNoOr({Str::RenameMendQuestion, {u"Name"_s, u"Form \"Entry\" (7)"_s, u"Full Name"_s}},
+                               {Str::RenameAlone, {}});
+        look(u"box-text"_s);
+        (void)boxes.AskText({Str::SaveQueryTitle, {}}, {Str::SaveQueryPrompt, {}}, QString(200, u'q'));
+        EXPECT_EQ(met, 5);
     }
 }
 

@@ -1,17 +1,13 @@
 // The main window with its views: side bar and tabs when it is wide, one view in front when it is narrow.
 #include "app/ui/entry_panel.h"
-#include "app/ui/look.h"
 #include "app/ui/lumo_view.h"
-#include "app/ui/main_frame.h"
-#include "app/ui/shell_actions.h"
 #include "app/ui/side_bar.h"
 #include "app/ui/side_tree.h"
-#include "app/ui/view_tabs.h"
 #include "app/ui/view_window.h"
+#include "app_ui/program_fixture.h"
 #include "forms/ui/form_eng_view.h"
 #include "resources/string_table.h"
 #include "support/printing.h"
-#include "support/scripted_prompt.h"
 #include "support/sqlite_file.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/table_view.h"
@@ -43,67 +39,22 @@ const ViewKey kBirds{EntryKind::Table, u"Birds"_s};
 const ViewKey kBees{EntryKind::Table, u"Bees"_s};
 const ViewKey kBirdForm{EntryKind::Form, u"Bird form"_s};
 
-// A program over one database with tables, a form and a query.
-struct Program {
-    Program(const QString& folder, ScriptedPrompt& prompt)
-        : programFolder{folder}
-        , session(connection, programFolder, prompt)
-        , commands(session, state, settings, SampleDatabase(programFolder, {}))
-    {
-    }
-
-    ProgramFolder programFolder;
-    Profile profile{programFolder.ProfileFile()};
-    Settings settings{profile};
-    DbConnection connection;
-    DatabaseSession session;
-    MainViewState state;
-    MainViewCommands commands;
-    std::unique_ptr<CMainFrame> frame;
-};
-
-class WorkspaceTest : public ::testing::Test {
+// A database with tables, a form and a query.
+class WorkspaceTest : public ProgramFixture {
 protected:
-    static void SetUpTestSuite() { QApplication::setStyle(new TouchTargetStyle(u"Fusion"_s)); }
-
     void SetUp() override
     {
-        program_ = std::make_unique<Program>(folder_.path(), prompt_);
-        ASSERT_TRUE(program_->commands.NewDatabase(PathOf(u"shop.cdb"_s)));
-        Execute(u"CREATE TABLE Birds ([Name] Varchar(40),[Wings] SmallInt)"_s);
-        Execute(u"CREATE TABLE Bees (Stripes SmallInt)"_s);
+        Start();
+        ASSERT_TRUE(Commands().NewDatabase(PathOf(u"shop.cdb"_s)));
+        EXPECT_TRUE(Execute(u"CREATE TABLE Birds ([Name] Varchar(40),[Wings] SmallInt)"_s));
+        EXPECT_TRUE(Execute(u"CREATE TABLE Bees (Stripes SmallInt)"_s));
         for (const QString& name : {u"Wren"_s, u"Owl"_s, u"Rook"_s})
-            Execute(u"INSERT INTO Birds (Name,Wings) VALUES ('%1',2)"_s.arg(name));
+            EXPECT_TRUE(Execute(u"INSERT INTO Birds (Name,Wings) VALUES ('%1',2)"_s.arg(name)));
         AddForm();
-        program_->commands.Refill();
-        Show();
+        Commands().Refill();
+        Show(kWide);
     }
 
-    void Show()
-    {
-        program_->frame = std::make_unique<CMainFrame>(program_->session, program_->state, program_->commands,
-                                                       program_->settings, program_->profile);
-        Frame().resize(kWide);
-        Frame().show();
-        ASSERT_TRUE(QTest::qWaitForWindowActive(&Frame()));
-    }
-    // The program ends and is started again.
-    void Restart()
-    {
-        EXPECT_TRUE(Frame().close());
-        program_->commands.KeepForNextRun();
-        program_.reset();
-        program_ = std::make_unique<Program>(folder_.path(), prompt_);
-        program_->commands.RestoreLastRun({});
-        Show();
-        Frame().RestoreViews();
-    }
-
-    void Execute(const QString& statement)
-    {
-        EXPECT_TRUE(program_->session.GetCatalog().ExecuteStatement(program_->session.Location(), statement))
-            << statement.toStdString();
-    }
     // As another program does it.
     void ExecuteElsewhere(const QString& statement)
     {
@@ -129,13 +80,8 @@ protected:
         EXPECT_TRUE(
             program_->session.Store().Apply([&form](FormStore& store) { return store.AddForm(form), true; }));
     }
-    QString PathOf(const QString& name) const { return QDir(folder_.path()).filePath(name); }
-
-    CMainFrame& Frame() { return *program_->frame; }
-    ViewTabs& Tabs() { return *Frame().findChild<ViewTabs*>(); }
     QTabBar& Bar() { return *Tabs().findChild<QTabBar*>(u"views"_s); }
     SideTree& Tree() { return *Frame().findChild<SideTree*>(); }
-    QAction* Command(ShellCommand id) { return Frame().findChild<ShellActions*>()->Of(id); }
     CTableView* Open(const ViewKey& key) { return qobject_cast<CTableView*>(Frame().OpenView(key)); }
     QStringList MenuTitles()
     {
@@ -154,10 +100,6 @@ protected:
             QTest::mouseDClick(Tree().viewport(), Qt::LeftButton, {}, at);
     }
     static void PassOneLook() { QTest::qWait(1300); }
-
-    QTemporaryDir folder_;
-    ScriptedPrompt prompt_;
-    std::unique_ptr<Program> program_;
 };
 
 TEST_F(WorkspaceTest, CrossingTheWidthClosesNothingAndKeepsWhatIsInFront)
@@ -287,7 +229,7 @@ TEST_F(WorkspaceTest, TabsComeBackInTheirOrder)
     Frame().OpenView(kBirdForm);
     Bar().moveTab(2, 0);
     Tabs().BringForward(kBees);
-    Restart();
+    Restart(kWide);
     ASSERT_EQ(Tabs().Count(), 3);
     EXPECT_EQ(Tabs().KeyAt(0), kBirdForm);
     EXPECT_EQ(Tabs().KeyAt(1), kBees);
@@ -298,7 +240,7 @@ TEST_F(WorkspaceTest, TabsComeBackInTheirOrder)
     EXPECT_TRUE(Tabs().Front());
 
     ExecuteElsewhere(u"DROP TABLE Bees"_s);
-    Restart();
+    Restart(kWide);
     EXPECT_EQ(Tabs().Count(), 2);
     EXPECT_EQ(prompt_.shown, QStringList());
 }

@@ -43,6 +43,21 @@ TEST_F(DesignProgram, MakesAndChangesATable)
     EXPECT_EQ(Sql(u"SELECT * FROM T"_s), u"B\n1\n22\n"_s);
 }
 
+TEST_F(DesignProgram, MendsWhatRefersToARenamedField)
+{
+    NewDatabase();
+    EXPECT_EQ(Design(R"([{"name":"A","type":"Text"},{"name":"B","type":"Text"}])").status, 0);
+    Sql(u"INSERT INTO T (A,B) VALUES ('a','b')"_s);
+    EXPECT_EQ(
+        Run({u"queries"_s, u"save"_s, u"a.cdb"_s, u"Q"_s, u"SELECT A FROM T WHERE B='b'"_s, u"--table"_s, u"T"_s})
+            .status,
+        0);
+    EXPECT_EQ(Design(R"([{"name":"B","type":"Text","was":"A"},{"name":"A","type":"Text","was":"B"}])"),
+              (Ended{0, {}, {}}));
+    EXPECT_TRUE(Run({u"queries"_s, u"list"_s, u"a.cdb"_s}).out.contains(u"SELECT B FROM T WHERE A='b'"_s));
+    EXPECT_EQ(Run({u"queries"_s, u"run"_s, u"a.cdb"_s, u"Q"_s, u"--format"_s, u"csv"_s}).out, u"B\na\n"_s);
+}
+
 TEST_F(DesignProgram, RefusesWhatCannotBe)
 {
     NewDatabase();

@@ -154,5 +154,32 @@ TEST(MendNames, GoesThroughFormsAndQueries)
     EXPECT_EQ(store, before);
 }
 
+TEST(MendNames, ADropDownBoxThatShowsTheFieldOfItsOwnNameFollowsIt)
+{
+    FormBuilder builder(u"Birds", u"Entry");
+    builder.DropDown(u"Name", u"Owl;Wren")
+        .Button(u"Save", ButtonFunction::Update, {{u"Birds.Name"_s, u"&Name"_s}, {u"Note"_s, u"&NameX"_s}})
+        .Button(u"Find", ButtonFunction::Select, u"SELECT * WHERE Note LIKE '&[name]%'");
+    builder.form.controls[0].fieldBound = 1;
+    FormDef& items = builder.form;
+    FormBuilder query(u"Birds", u"By query");
+    query.DropDown(u"Name", u"SELECT Kind FROM Kinds\x08");
+    query.form.controls[0].fieldBound = 1;
+    FormStore store;
+    store.AddForm(items);
+    store.AddForm(query.form);
+    EXPECT_EQ(MendNames(store, kField).size(), 2U);
+    const std::vector<ControlDef>& controls = store.Forms()[0].controls;
+    EXPECT_EQ(controls[0].name.Text(), u"Full Name"_s);
+    EXPECT_EQ(controls[0].source.Text(), u"Owl;Wren"_s);
+    EXPECT_EQ(controls[1].source.Text(),
+              JoinAssignments({{u"Birds.[Full Name]"_s, u"&[Full Name]"_s}, {u"Note"_s, u"&NameX"_s}}));
+    EXPECT_EQ(controls[2].source.Text(), u"SELECT * WHERE Note LIKE '&[Full Name]%'"_s);
+    const ControlDef& byQuery = store.Forms()[1].controls[0];
+    EXPECT_EQ(byQuery.name.Text(), u"Name"_s);
+    EXPECT_EQ(SplitDropDown(byQuery.source.Text()).data, u"[Full Name]"_s);
+    EXPECT_EQ(SplitDropDown(byQuery.source.Text()).query, u"SELECT Kind FROM Kinds"_s);
+}
+
 } // namespace
 } // namespace mirel

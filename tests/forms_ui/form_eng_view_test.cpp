@@ -4,7 +4,7 @@
 #include "forms/ui/record_list.h"
 #include "forms_ui/form_fixture.h"
 #include "platform/ui/error_line.h"
-#include "tableview/ui/filter_chip.h"
+#include "tableview/ui/filter_bar.h"
 
 #include <QCheckBox>
 #include <QClipboard>
@@ -426,12 +426,12 @@ TEST_F(FormView, FiltersAndSortsByTheFocusedControlsField)
     Show({Edit(u"City"_s), kCounter, Edit(u"Name"_s)});
     ActionOf(Str::FormFilterBy)->trigger();
     EXPECT_EQ(TextOf(u"rec"_s), u"1/2"_s);
-    EXPECT_TRUE(view->findChild<FilterChip*>()->isVisible());
+    EXPECT_TRUE(view->findChild<FilterBar*>()->isVisible());
     ActionOf(Str::ActionRemoveFilter)->trigger();
     ActionOf(Str::FormFilterExcluding)->trigger();
     EXPECT_EQ(TextOf(u"Name"_s), u"Bob"_s);
     ActionOf(Str::ActionRemoveFilter)->trigger();
-    EXPECT_FALSE(view->findChild<FilterChip*>()->isVisible());
+    EXPECT_FALSE(view->findChild<FilterBar*>()->isVisible());
     Find(u"Name"_s)->setFocus();
     ActionOf(Str::FormSortDescending)->trigger();
     EXPECT_EQ(TextOf(u"Name"_s), u"Cid"_s);

@@ -1,6 +1,7 @@
 #include "tableview/record_browser.h"
 
 #include "support/sqlite_file.h"
+#include "tableview/condition_label.h"
 #include "tableview/people_fixture.h"
 
 namespace mirel {
@@ -326,6 +327,86 @@ TEST_F(Browser, FiltersAddUpAndAreRemovedAtOnce)
     ASSERT_TRUE(browser.RemoveFilter());
     EXPECT_EQ(browser.CounterText(), u"1/25"_s);
     EXPECT_FALSE(browser.IsFiltered());
+}
+
+TEST_F(Browser, FiltersAreChangedSwitchedAndTakenOffOneByOne)
+{
+    ASSERT_TRUE(browser.SortByColumn(1, SortDirection::Descending));
+    ASSERT_TRUE(browser.AddCondition(u"Age > 30"_s));
+    ASSERT_TRUE(browser.AddCondition(u"Member IS TRUE"_s));
+    const QString base = u"SELECT * FROM People"_s;
+    struct Step {
+        std::function<bool()> change;
+        QString statement;
+        QString counter;
+    };
+    const std::vector<Step> steps = {
+        {[&] { return browser.SwitchFilter(0); }, base + u" WHERE Member IS TRUE ORDER BY Age DESC"_s, u"1/12"_s},
+        {[&] { return browser.SwitchFilter(1); }, base + u" ORDER BY Age DESC"_s, u"1/25"_s},
+        {[&] { return browser.SwitchFilter(0); }, base + u" WHERE Age > 30 ORDER BY Age DESC"_s, u"1/13"_s},
+        {[&] { return browser.ChangeFilter(0, u"Age < 23"_s); }, base + u" WHERE Age < 23 ORDER BY Age DESC"_s,
+         u"1/2"_s},
+        {[&] { return !browser.ChangeFilter(0, u"Nobody = 1"_s); }, base + u" WHERE Age < 23 ORDER BY Age DESC"_s,
+         u"1/2"_s},
+        {[&] { return browser.TakeFilterOff(7) && browser.SwitchFilter(-1); },
+         base + u" WHERE Age < 23 ORDER BY Age DESC"_s, u"1/2"_s},
+        {[&] { return browser.ChangeFilter(0, u"Age < 0"_s); }, base + u" WHERE Age < 0 ORDER BY Age DESC"_s,
+         u"0/0"_s},
+        {[&] { return browser.TakeFilterOff(0); }, base + u" ORDER BY Age DESC"_s, u"1/25"_s},
+        {[&] { return browser.TakeFilterOff(0); }, base + u" ORDER BY Age DESC"_s, u"1/25"_s},
+    };
+    for (const Step& step : steps) {
+        EXPECT_TRUE(step.change()) << step.statement.toStdString();
+        EXPECT_EQ(browser.Statement(), step.statement);
+        EXPECT_EQ(browser.CounterText(), step.counter) << step.statement.toStdString();
+    }
+    EXPECT_EQ(browser.CurrentSort().field, 1);
+    EXPECT_EQ(prompt.shown.size(), 1) << "the refused one is told";
+}
+
+TEST_F(Browser, AFilterThatIsSwitchedLeavesTheSelectionOnItsRecord)
+{
+    ASSERT_TRUE(browser.AddCondition(u"Age > 30"_s));
+    ASSERT_TRUE(browser.GoToRecord(5));
+    SelectField(u"Note"_s);
+    const QString note = browser.SelectedText();
+    ASSERT_TRUE(browser.SwitchFilter(0));
+    EXPECT_EQ(browser.SelectedText(), note);
+    EXPECT_EQ(browser.KnownCount(), 25);
+}
+
+TEST_F(Browser, FiltersFollowANewName)
+{
+    ASSERT_TRUE(browser.AddCondition(u"Age > 30"_s));
+    ASSERT_TRUE(browser.SortByColumn(1, SortDirection::Descending));
+    ASSERT_TRUE(browser.AddCondition(u"Member IS TRUE"_s));
+    Run(u"ALTER TABLE People RENAME COLUMN Age TO Years"_s);
+    ASSERT_TRUE(browser.OpenRenamed([](QString statement) { return statement.replace(u"Age"_s, u"Years"_s); }));
+    EXPECT_EQ(browser.Conditions(), QStringList({u"Years > 30"_s, u"Member IS TRUE"_s}));
+    ASSERT_TRUE(browser.TakeFilterOff(1));
+    EXPECT_EQ(browser.Statement(), u"SELECT * FROM People WHERE Years > 30 ORDER BY Years DESC"_s);
+}
+
+TEST(ConditionLabels, SayInWordsWhatAConditionKeeps)
+{
+    const std::vector<std::pair<QString, QString>> rows = {
+        {u"Name = 'P1'"_s, u"Name: P1"_s},
+        {u"[Airport Name]='O''Hare'"_s, u"Airport Name: O'Hare"_s},
+        {u"[Bird Strikes].[Cost Total $] >= 300000"_s, u"Cost Total $ >= 300000"_s},
+        {u"(NOT(Damage = 'None'))"_s, u"Damage: not None"_s},
+        {u"Damage <> 'None'"_s, u"Damage: not None"_s},
+        {u"Note IS NULL"_s, u"Note: empty"_s},
+        {u"(NOT(Note IS NULL))"_s, u"Note: not empty"_s},
+        {u"Member IS TRUE"_s, u"Member: TRUE"_s},
+        {u"Name LIKE 'P%'"_s, u"Name LIKE P%"_s},
+        {u"[a]]b] = 1"_s, u"a]b: 1"_s},
+        {u"Age > 1 AND  Age < 9"_s, u"Age > 1 AND Age < 9"_s},
+        {u"(Age = 1) OR (Age = 2)"_s, u"(Age = 1) OR (Age = 2)"_s},
+        {u"(Age = 1"_s, u"(Age = 1"_s},
+        {QString(), QString()},
+    };
+    for (const auto& [condition, label] : rows)
+        EXPECT_EQ(ConditionLabel(condition), label);
 }
 
 TEST_F(Browser, FiltersByTheWholeTextNotByTheCutOne)

@@ -5,7 +5,7 @@
 #include "tableview/people_fixture.h"
 #include "tableview/ui/cell_strip.h"
 #include "tableview/ui/empty_note.h"
-#include "tableview/ui/filter_chip.h"
+#include "tableview/ui/filter_bar.h"
 #include "tableview/ui/find_line.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
@@ -554,15 +554,34 @@ TEST_F(TableView, OffersToRemoveAFilterThatNothingMatches)
     EXPECT_FALSE(button->isVisible());
 }
 
-TEST_F(TableView, ShowsTheFilterInForceWithItsCross)
+TEST_F(TableView, ShowsAChipForEachFilterThatIsSwitchedAndTakenOffByItself)
 {
-    auto* chip = view.findChild<FilterChip*>();
-    EXPECT_FALSE(chip->isVisible());
+    auto* bar = view.findChild<FilterBar*>();
+    const auto chips = [bar] {
+        QList<FilterChip*> shown = bar->findChildren<FilterChip*>();
+        shown.removeIf([](const FilterChip* chip) { return chip->isHidden(); });
+        return shown;
+    };
+    EXPECT_FALSE(bar->isVisible());
+    ActionOf(Str::ActionSortDescending)->trigger();
+    for (int step = 0; step < 3; ++step) // to Member
+        QTest::keyClick(view.findChild<RecordGrid*>(), Qt::Key_Right);
     ActionOf(Str::ActionFilterBy)->trigger();
-    EXPECT_TRUE(chip->isVisible());
-    EXPECT_EQ(browser.CounterText(), u"1/1"_s);
-    chip->findChild<QToolButton*>()->click();
-    EXPECT_FALSE(chip->isVisible());
+    QTest::keyClick(view.findChild<RecordGrid*>(), Qt::Key_Home);
+    ActionOf(Str::ActionFilterExcluding)->trigger();
+    ASSERT_EQ(chips().size(), 2);
+    EXPECT_EQ(browser.CounterText(), u"1/12"_s);
+    Q_EMIT bar->switched(0);
+    EXPECT_EQ(browser.CounterText(), u"1/12"_s);
+    EXPECT_EQ(chips().size(), 2) << "it stays, switched off";
+    chips()[1]->Cross()->click();
+    EXPECT_EQ(browser.CounterText(), u"1/25"_s);
+    Q_EMIT bar->switched(0);
+    EXPECT_EQ(browser.CounterText(), u"1/13"_s);
+    EXPECT_EQ(browser.Statement(), u"SELECT * FROM People WHERE Age > 30 ORDER BY Name DESC"_s)
+        << "the order stays";
+    chips()[0]->Cross()->click();
+    EXPECT_FALSE(bar->isVisible());
     EXPECT_EQ(browser.CounterText(), u"1/25"_s);
 }
 

@@ -3,7 +3,6 @@
 #include "platform/ui/elided_label.h"
 #include "resources/string_table.h"
 
-#include <QLabel>
 #include <QVBoxLayout>
 
 namespace mirel {
@@ -18,21 +17,20 @@ EntryPanel::EntryPanel(DatabaseSession& session, QWidget* parent)
     : QWidget(parent)
     , summary_(session)
     , name_(new ElidedLabel(this))
-    , lines_(new QLabel(this))
 {
     QFont bold = font();
     bold.setBold(true);
     name_->setFont(bold);
-    lines_->setForegroundRole(QPalette::PlaceholderText);
-    lines_->setTextFormat(Qt::PlainText);
-    lines_->setWordWrap(true);
-    lines_->setMinimumWidth(1);
-    lines_->setAccessibleName(StringText(Str::SummaryName));
+    setAccessibleName(StringText(Str::SummaryName));
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(12, 8, 12, 8);
     column->setSpacing(4);
     column->addWidget(name_);
-    column->addWidget(lines_);
+    for (ElidedLabel*& line : lines_) {
+        line = new ElidedLabel(this);
+        line->setForegroundRole(QPalette::PlaceholderText);
+        column->addWidget(line);
+    }
     lookTimer_.setSingleShot(true);
     connect(&lookTimer_, &QTimer::timeout, this, &EntryPanel::Look);
     connect(&countTimer_, &QTimer::timeout, this, [this] {
@@ -46,12 +44,11 @@ EntryPanel::EntryPanel(DatabaseSession& session, QWidget* parent)
 
 void EntryPanel::LookAt(const std::optional<MainEntry>& entry)
 {
+    const bool isFirst = !entry_ && summary_.Name().isEmpty();
     entry_ = entry;
     summary_.StopCounting();
     countTimer_.stop();
-    name_->setVisible(entry.has_value());
-    name_->SetText(entry ? entry->name : QString());
-    lookTimer_.start(kLookDelayMs);
+    lookTimer_.start(isFirst ? 0 : kLookDelayMs);
 }
 
 void EntryPanel::Look()
@@ -67,9 +64,14 @@ void EntryPanel::Look()
 void EntryPanel::ShowLines()
 {
     name_->SetText(summary_.Name());
-    name_->setVisible(!summary_.Name().isEmpty());
     name_->setToolTip(summary_.Name().toHtmlEscaped());
-    lines_->setText(summary_.Lines().join(u'\n'));
+    const QStringList lines = summary_.Lines();
+    for (size_t i = 0; i < lines_.size(); ++i) {
+        const QString line = lines.value(qsizetype(i));
+        lines_[i]->SetText(line);
+        lines_[i]->setToolTip(line.toHtmlEscaped());
+    }
+    setAccessibleDescription(lines.join(u'\n'));
 }
 
 } // namespace mirel

@@ -5,7 +5,7 @@
 #include <QTimer>
 #include <QWidget>
 
-class QLabel;
+#include <array>
 
 namespace mirel {
 
@@ -28,7 +28,7 @@ private:
     EntrySummary summary_;
     std::optional<MainEntry> entry_;
     ElidedLabel* name_;
-    QLabel* lines_;
+    std::array<ElidedLabel*, 3> lines_{}; // always as many: the list above stays where it is
     QTimer lookTimer_;
     QTimer countTimer_;
 };

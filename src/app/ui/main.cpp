@@ -6,6 +6,8 @@
 #include "cli/console_prompt.h"
 
 #include <QApplication>
+#include <QEventLoop>
+#include <QTimer>
 
 #include <cstdio>
 
@@ -96,6 +98,15 @@ bool ShowAlone(CMainFrame& frame, const WindowOptions& options)
     return true;
 }
 
+// What is counted and read in slices.
+void WaitUntilAllShows()
+{
+    constexpr int kMs = 400;
+    QEventLoop loop;
+    QTimer::singleShot(kMs, &loop, &QEventLoop::quit);
+    loop.exec();
+}
+
 int TakePicture(const WindowOptions& options)
 {
     cli::ConsolePrompt prompt(kAnswerNo); // nobody is there to press a button
@@ -109,7 +120,9 @@ int TakePicture(const WindowOptions& options)
     frame.setWindowState(Qt::WindowNoState);
     frame.resize(options.size);
     frame.show();
-    QCoreApplication::processEvents();
+    if (!frame.IsAlone())
+        frame.RestoreViews();
+    WaitUntilAllShows();
     if (frame.grab().save(options.picture, "PNG"))
         return kDone;
     Say(stderr, u"mirel: cannot write %1\n"_s.arg(options.picture));
@@ -178,7 +191,7 @@ int main(int argc, char** argv)
     if (picture)
         qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
-    QGuiApplication::setApplicationDisplayName(QStringLiteral("Mirel"));
+    // Without a display name of its own: that would be put behind every window's title.
     if (!UsePalette(PaletteToUse(*options)))
         QApplication::setStyle(new TouchTargetStyle({}));
     return picture ? TakePicture(*options) : ShowWindow(*options);

@@ -7,6 +7,7 @@
 #include "resources/string_table.h"
 
 #include <QApplication>
+#include <QDialogButtonBox>
 #include <QElapsedTimer>
 #include <QGridLayout>
 #include <QInputDialog>
@@ -92,6 +93,21 @@ public:
             setInformativeText(WrappedText(LinesOf(note), font(), room));
         if (auto* grid = qobject_cast<QGridLayout*>(layout()))
             grid->addItem(new QSpacerItem(room + picture, 0), grid->rowCount(), 0, 1, grid->columnCount());
+    }
+
+protected:
+    // Buttons that do not stand side by side stand one above the other.
+    void showEvent(QShowEvent* event) override
+    {
+        QMessageBox::showEvent(event);
+        auto* buttons = findChild<QDialogButtonBox*>();
+        if (!buttons || !parentWidget() || buttons->orientation() == Qt::Vertical ||
+            minimumSizeHint().width() <= parentWidget()->window()->width())
+            return;
+        buttons->setOrientation(Qt::Vertical);
+        for (QAbstractButton* button : buttons->buttons())
+            button->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+        adjustSize();
     }
 };
 

@@ -27,7 +27,8 @@ public:
     // What only a list needs.
     struct ListSource {
         RowReader rows;
-        std::function<int()> maxColumnChars; // as the options are now
+        std::function<int()> maxColumnChars;        // as the options are now
+        std::function<bool(int column)> isNumber{}; // shown to the right; null: none is
     };
 
     static std::unique_ptr<ControlWidget> Make(const ControlRun& control, const ListSource& list,

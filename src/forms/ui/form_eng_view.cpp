@@ -5,7 +5,8 @@
 #include "platform/ui/error_line.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
-#include "tableview/ui/filter_chip.h"
+#include "result/cell_text.h"
+#include "tableview/ui/filter_bar.h"
 #include "tableview/why_not_stored.h"
 
 #include <QApplication>
@@ -43,14 +44,27 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
     , surface_(new FormSurface(form_, nullptr))
     , detail_(new QTreeWidget(this))
     , list_(new RecordList({.rows = [this](qint64 first, int count) { return form_.RecordTexts(first, count); },
-                            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }},
+                            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; },
+                            .isNumber =
+                                [this](int field) {
+                                    return size_t(field) < form_.Fields().size() &&
+                                           IsRightAligned(form_.Fields()[size_t(field)].type);
+                                }},
                            this))
     , error_(new ErrorLine(this))
 {
     CreateActions();
-    chip_ = new FilterChip(ActionOf(FormCommand::RemoveFilter), this);
+    filters_ = new FilterBar(FilterBar::Offers::SwitchAndRemove, this);
     CreateToolBar();
     LayOut();
+    connect(filters_, &FilterBar::removed, this, [this](int filter) {
+        (void)form_.TakeFilterOff(filter);
+        ShowState();
+    });
+    connect(filters_, &FilterBar::switched, this, [this](int filter) {
+        (void)form_.SwitchFilter(filter);
+        ShowState();
+    });
     connect(surface_, &FormSurface::acted, this, &CFormEngView::ShowState);
     connect(surface_, &FormSurface::popupRequested, this, &CFormEngView::ShowPopup);
     connect(surface_, &FormSurface::focusMoved, this, [this](QWidget* widget) {
@@ -78,7 +92,7 @@ void CFormEngView::LayOut()
     column->setSpacing(0);
     column->addWidget(toolBar_);
     column->addWidget(stack_, 1);
-    column->addWidget(chip_);
+    column->addWidget(filters_);
     column->addWidget(error_);
     stack_->addWidget(scroller_);
     stack_->addWidget(detail_);
@@ -187,7 +201,7 @@ void CFormEngView::ShowState()
     const bool readOnly = form_.HasResult() && !form_.CanUpdate();
     setWindowTitle(StringText(readOnly ? Str::TableViewTitleReadOnly : Str::TableViewTitle, {form_.Title()}));
     setWindowModified(form_.IsDirty());
-    chip_->ShowConditions(form_.Conditions());
+    filters_->Show(form_.Filters());
     if (!form_.IsDirty())
         Q_EMIT recordsChanged(); // perhaps nothing was written: the listeners look
     if (CurrentPage() == Page::Detail)

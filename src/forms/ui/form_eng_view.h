@@ -18,7 +18,7 @@ namespace mirel {
 
 class CommandActions;
 class ErrorLine;
-class FilterChip;
+class FilterBar;
 class FormSurface;
 class RecordList;
 
@@ -112,7 +112,7 @@ private:
     QTreeWidget* detail_;
     RecordList* list_;
     QToolBar* toolBar_ = nullptr;
-    FilterChip* chip_ = nullptr;
+    FilterBar* filters_ = nullptr;
     ErrorLine* error_;
     int refusedControl_ = -1; // that the error is about
     QBasicTimer clock_;

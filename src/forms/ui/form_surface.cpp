@@ -67,7 +67,8 @@ void FormSurface::MakeControls()
     for (int i = 0; i < int(controls.size()); ++i) {
         const ControlWidget::ListSource list{
             .rows = [this, i](qint64 first, int count) { return form_.ListRows(i, first, count); },
-            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; }};
+            .maxColumnChars = [this] { return form_.Settings().maxColumnChars; },
+            .isNumber = [this, i](int column) { return form_.ShowsNumbers(i, column); }};
         const ControlRun& control = controls[size_t(i)];
         widgets_.push_back(ControlWidget::Make(control, list, *this));
         if (IsComputed(i))

@@ -17,8 +17,15 @@ namespace {
 
 constexpr int kLeastRowPx = 20;
 constexpr int kLeastColumnChars = 8;
-constexpr int kMarginPx = 4;
+constexpr int kMarginPx = 6;
 constexpr int kWheelRows = 3;
+
+// Behind the point, and the point itself: what stands to the right of where numbers meet.
+int FractionWidth(const QFontMetrics& metrics, const QString& number)
+{
+    const qsizetype point = number.indexOf(u'.');
+    return point < 0 ? 0 : metrics.horizontalAdvance(number.sliced(point));
+}
 
 QString SingleLine(QString text)
 {
@@ -134,6 +141,35 @@ void RecordList::ReadRows()
     const int visible = viewport()->height() / RowHeightPx() + 1;
     const int count = int(std::min<qint64>(visible, rows_ - top_));
     texts_ = count > 0 ? source_.rows(top_, count) : std::vector<QStringList>();
+    MeasureNumbers();
+}
+
+// Numbers stand under one another by their points, headers above them.
+void RecordList::MeasureNumbers()
+{
+    fractionPx_.assign(size_t(names_->columnCount()), -1);
+    for (int column = 0; column < names_->columnCount(); ++column) {
+        const bool number = source_.isNumber && source_.isNumber(column);
+        QStandardItem* name = names_->horizontalHeaderItem(column);
+        const Qt::Alignment side = (number ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignVCenter;
+        if (name && name->textAlignment() != side)
+            name->setTextAlignment(side);
+        if (!number)
+            continue;
+        int& widest = fractionPx_[size_t(column)] = 0;
+        for (const QStringList& row : texts_)
+            widest = std::max(widest, FractionWidth(fontMetrics(), row.value(column)));
+    }
+}
+
+void RecordList::DrawCell(QPainter& painter, QRect cell, int column, const QString& text) const
+{
+    const bool number = size_t(column) < fractionPx_.size() && fractionPx_[size_t(column)] >= 0;
+    const int behind = number ? fractionPx_[size_t(column)] - FractionWidth(fontMetrics(), text) : 0;
+    if (number && fontMetrics().horizontalAdvance(text) + behind <= cell.width())
+        cell.setRight(cell.right() - behind);
+    painter.drawText(cell, int(Qt::AlignVCenter | (number ? Qt::AlignRight : Qt::AlignLeft)) | Qt::TextSingleLine,
+                     fontMetrics().elidedText(text, Qt::ElideRight, cell.width()));
 }
 
 QString RecordList::Shown(const QString& text) const
@@ -202,9 +238,7 @@ void RecordList::paintEvent(QPaintEvent*)
             QRect cell(header_->sectionPosition(column) - offset, line.top(), header_->sectionSize(column),
                        line.height());
             cell.adjust(kMarginPx, 0, -kMarginPx, 0);
-            const QString text = Shown(texts_[i].value(column));
-            painter.drawText(cell, int(Qt::AlignVCenter | Qt::AlignLeft) | Qt::TextSingleLine,
-                             fontMetrics().elidedText(text, Qt::ElideRight, cell.width()));
+            DrawCell(painter, cell, column, Shown(texts_[i].value(column)));
         }
     }
 }

@@ -50,6 +50,8 @@ private:
     void PlaceHeader();
     void UpdateScrollBars();
     void ReadRows();
+    void MeasureNumbers();
+    void DrawCell(QPainter& painter, QRect cell, int column, const QString& text) const;
     void FitColumns();
     void NarrowWidestColumn();
     void BringIntoSight(qint64 row);
@@ -63,6 +65,7 @@ private:
     qint64 selected_ = -1;
     qint64 top_ = 0;                 // the first row in sight
     std::vector<QStringList> texts_; // from `top_` on
+    std::vector<int> fractionPx_;    // of each column: the widest; -1: it holds no numbers
     bool sizedByHand_ = false;       // the columns: they are not fitted any more
     bool fitting_ = false;
     bool syncing_ = false;

@@ -83,7 +83,9 @@ void CommandActions::Show(int id, const CommandState& state)
     const QString tip = StringText(state.tip.value_or(entry.def->tip));
     const QString keys = action->shortcut().toString(QKeySequence::NativeText);
     action->setEnabled(state.enabled);
-    action->setText(StringText(state.text.value_or(entry.def->text)));
+    const QString text = StringText(state.text.value_or(entry.def->text));
+    action->setText(entry.def->asks ? StringText(Str::CommandThatAsks, {text}) : text);
+    action->setIconText(QString(text).remove(u'&').remove(QStringLiteral("...")).trimmed());
     action->setToolTip(keys.isEmpty() || !keysInTips_ ? tip : StringText(Str::TipWithKeys, {tip, keys}));
     action->setStatusTip(tip);
     if (entry.def->checkable)

@@ -40,6 +40,7 @@ struct CommandDef {
     unsigned opens = 0;     // the menu behind the entry
     bool checkable = false; // shows a tick
     bool built = true;      // false: disabled for now
+    bool asks = false;      // a dialog follows: its entry in a menu ends in "…"
 };
 
 // Whether a command can be given now, and how it shows. What is not said stays as in its row.

@@ -173,7 +173,18 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
                              ? FilterDraft::PresetYesNo(displayText)
                              : single_->Operator());
     resize(sizeHint().expandedTo({60 * fontMetrics().averageCharWidth(), 0}));
-    QTimer::singleShot(kFocusDelayMs, single_, &FilterTerm::FocusValue);
+    QTimer::singleShot(kFocusDelayMs, single_, [this] {
+        if (tabs_->currentIndex() == 0)
+            single_->FocusValue();
+    });
+}
+
+void CFilterDialog::ShowExpression(const QString& condition)
+{
+    tabs_->setCurrentIndex(1);
+    expression_->setPlainText(condition);
+    expression_->moveCursor(QTextCursor::End);
+    QTimer::singleShot(kFocusDelayMs, this, [this] { expression_->setFocus(Qt::TabFocusReason); });
 }
 
 QWidget* CFilterDialog::BasicPage()

@@ -58,6 +58,9 @@ public:
     CFilterDialog(FieldLists& lists, const QString& table, const QString& field, const QString& displayText,
                   Apply apply, QWidget* parent);
 
+    // Begins with a condition that is to be changed.
+    void ShowExpression(const QString& condition);
+
     // Empty: nothing to filter by, as after Cancel.
     QString Condition() const;
 

@@ -88,6 +88,8 @@ QToolButton* NavigationRow::AddButton(QAction* action)
     button->setFocusPolicy(Qt::TabFocus);
     button->setMinimumSize(kTouchPx, kTouchPx);
     button->setAccessibleName(action->iconText());
+    connect(action, &QAction::changed, button,
+            [button, action] { button->setAccessibleName(action->iconText()); });
     layout()->addWidget(button);
     return button;
 }

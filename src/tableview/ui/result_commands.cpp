@@ -69,6 +69,25 @@ bool ResultCommands::FilterByExpression()
     return true;
 }
 
+bool ResultCommands::ChangeFilter(int filter)
+{
+    const std::vector<OpenResult::Filter>& filters = browser_.Filters();
+    if (!browser_.WriteEdit() || filter < 0 || size_t(filter) >= filters.size())
+        return false;
+    FieldLists lists(connection_, browser_.Database(), prompt_);
+    CFilterDialog dialog(
+        lists, browser_.TableOf(browser_.SelectedField()), SelectedColumn(), browser_.SelectedText(),
+        [this, filter](const QString& condition) {
+            const WaitCursor waiting;
+            return browser_.ChangeFilter(filter, condition);
+        },
+        &view_);
+    dialog.ShowExpression(filters[size_t(filter)].condition);
+    FillSmallWindow(dialog, view_);
+    dialog.exec();
+    return true;
+}
+
 bool ResultCommands::SortByExpression()
 {
     if (!browser_.WriteEdit())

@@ -28,6 +28,7 @@ public:
 
     // Each returns whether it was carried out; the user's Cancel counts as carried out.
     bool FilterByExpression();
+    bool ChangeFilter(int filter); // by its place among the browser's
     bool SortByExpression();
     bool DeleteAll();
     bool UpdateAll();

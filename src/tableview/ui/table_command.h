@@ -7,7 +7,7 @@
 namespace mirel {
 
 // All that the table view does on a key, a button or a menu entry. What each is called and does stands in the
-// table in table_view_commands.cpp.
+// table in tableview/ui/table_*_rows.cpp.
 enum class TableCommand {
     First,
     Previous,

@@ -7,7 +7,7 @@
 #include "platform/ui/wait_cursor.h"
 #include "resources/string_table.h"
 #include "tableview/ui/cell_strip.h"
-#include "tableview/ui/filter_chip.h"
+#include "tableview/ui/filter_bar.h"
 #include "tableview/ui/find_line.h"
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/record_grid.h"
@@ -45,7 +45,7 @@ CTableView::CTableView(DbConnection& connection, const DatabaseLocation& databas
     , error_(new ErrorLine(this))
 {
     CreateActions();
-    chip_ = new FilterChip(ActionOf(Command::RemoveFilter), this);
+    filters_ = new FilterBar(FilterBar::Offers::All, this);
     findLine_ = new FindLine(
         browser_, {.next = ActionOf(Command::FindNext), .previous = ActionOf(Command::FindPrevious)}, this);
     navigation_ = new NavigationRow({.first = ActionOf(Command::First),
@@ -70,9 +70,9 @@ void CTableView::LayOut()
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(spacing::kTight);
+    column->addWidget(filters_);
     column->addWidget(stack_, 1);
     column->addWidget(findLine_);
-    column->addWidget(chip_);
     column->addWidget(error_);
     column->addWidget(strip_);
     column->addWidget(navigation_);
@@ -122,6 +122,17 @@ void CTableView::ConnectParts()
         browser_.EditChecked(checked);
         ShowState();
     });
+    connect(filters_, &FilterBar::removed, this, [this](int filter) {
+        ChangeFilters([filter](RecordBrowser& browser) { return browser.TakeFilterOff(filter); });
+    });
+    connect(filters_, &FilterBar::switched, this, [this](int filter) {
+        ChangeFilters([filter](RecordBrowser& browser) { return browser.SwitchFilter(filter); });
+    });
+    connect(filters_, &FilterBar::changeRequested, this, [this](int filter) {
+        Settle(resultCommands_->ChangeFilter(filter));
+        stack_->currentWidget()->setFocus();
+    });
+    connect(filters_, &FilterBar::addRequested, this, [this] { Do(Command::FilterExpression); });
     connect(findLine_, &FindLine::moved, this, [this] { Settle(!browser_.WriteFailed()); });
     connect(findLine_, &FindLine::closed, stack_, [this] { stack_->currentWidget()->setFocus(); });
     connect(zoomEdit_, &MemoEdit::edited, this, [this](const QString& text) {
@@ -143,6 +154,13 @@ void CTableView::ConnectParts()
         if (state == Qt::ApplicationActive && isVisible())
             TakeUpChanges();
     });
+}
+
+void CTableView::ChangeFilters(const std::function<bool(RecordBrowser&)>& change)
+{
+    const WaitCursor waiting;
+    Settle(change(browser_));
+    stack_->currentWidget()->setFocus();
 }
 
 void CTableView::TakeUpChanges()
@@ -193,11 +211,8 @@ bool CTableView::RunAgain()
 bool CTableView::RunRenamed(const QString& title, const std::function<QString(const QString&)>& renamed)
 {
     const WaitCursor waiting;
-    const QString base = browser_.BaseStatement();
-    const QString current = browser_.Statement();
     SetTitle(title);
-    const bool opened = browser_.Open(renamed(base)) && (current == base || browser_.Rewrite(renamed(current)));
-    return Settle(opened);
+    return Settle(browser_.OpenRenamed(renamed));
 }
 
 void CTableView::SetLook(const ViewLook& look)
@@ -263,7 +278,7 @@ void CTableView::ShowState()
         ShowReason();
     else if (wasRefused || notedAt_ != CellPlace{browser_.SelectedRecord(), browser_.SelectedField()})
         error_->Clear();
-    chip_->ShowConditions(browser_.Conditions());
+    filters_->Show(browser_.Filters());
     ShowZoom();
     ShowActions();
     navigation_->ShowCounter(browser_.CounterText());

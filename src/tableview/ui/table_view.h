@@ -20,7 +20,7 @@ namespace mirel {
 class CellStrip;
 class CommandActions;
 class ErrorLine;
-class FilterChip;
+class FilterBar;
 class FindLine;
 class FormStore;
 class MemoEdit;
@@ -102,6 +102,7 @@ private:
     void Note(const QString& text); // until another cell is selected
     void ShowActions();
 
+    void ChangeFilters(const std::function<bool(RecordBrowser&)>& change);
     void Edit(const QString* typed); // null: as the cell is
     void Revert();
     void Copy(FieldNames names);
@@ -128,7 +129,7 @@ private:
     CellStrip* strip_;
     ErrorLine* error_;
     FindLine* findLine_ = nullptr;
-    FilterChip* chip_ = nullptr;
+    FilterBar* filters_ = nullptr;
     NavigationRow* navigation_ = nullptr;
     QTimer countTimer_;
     bool zoomed_ = false;
