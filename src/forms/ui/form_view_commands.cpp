@@ -1,3 +1,4 @@
+#include "forms/control_types.h"
 #include "forms/ui/form_eng_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/form_surface.h"
@@ -124,7 +125,7 @@ struct CFormEngView::Commands {
     {
         const int control = view.CommandControl();
         const ControlType type = control >= 0 ? view.form_.Controls()[size_t(control)].type : ControlType::None;
-        return {.enabled = type == ControlType::EditBox || type == ControlType::DropDownBox};
+        return {.enabled = Has(type, ShowsText)};
     }
     static State CanScrollUp(const CFormEngView& view)
     {
