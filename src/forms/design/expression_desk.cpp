@@ -261,6 +261,7 @@ void ExpressionDesk::AddAssignmentLosses(const ControlDef& control, const FormDe
 QStringList ExpressionDesk::LossesOf(const FormDef& form)
 {
     Open(form.tableName.Text());
+    quiet_.SetPatience(0); // what sums come to tells nothing here
     QStringList all;
     for (const ControlDef& control : form.controls) {
         for (const DeskQuestion& question : ExpressionsOf(control)) {
@@ -272,6 +273,7 @@ QStringList ExpressionDesk::LossesOf(const FormDef& form)
     }
     for (const QString& circle : CirclesOf(form))
         all += StringText(Str::DeskCircle, {circle});
+    quiet_.SetPatience(QuietPrompt::kUsualPatienceMs);
     return all;
 }
 

@@ -32,16 +32,6 @@ FormMaker::FormMaker(FormDef form, Start start, MakerSurroundings surroundings)
     }
 }
 
-void FormMaker::FollowName(const QString& name)
-{
-    storedName_ = name;
-    stored_.SetName(name);
-    const bool modified = design_.IsModified();
-    design_.Change([&name](FormDef& form) { form.SetName(name); });
-    if (!modified)
-        design_.MarkSaved();
-}
-
 bool FormMaker::Tell(Str message, const QStringList& arguments)
 {
     surroundings_.prompt.Show({message, arguments});

@@ -40,8 +40,6 @@ public:
     const MakerSurroundings& Surroundings() const { return surroundings_; }
     // The name under which the store has it; empty: not saved yet.
     const QString& StoredName() const { return storedName_; }
-    // Under another name: others have renamed the form.
-    void FollowName(const QString& name);
 
     // --- the form's table ---------------------------------------------------------------------------------
 

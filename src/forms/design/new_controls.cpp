@@ -190,7 +190,8 @@ private:
         // A label stands at the top of its place, the text of a box in the middle of its own.
         Add(LabelFor(form_, field.name + u':', {kMargin, top_ + 2, labelWidth_, measure_.Box() - 2}));
         Add(std::move(box));
-        saved_.push_back({FieldSource(table_, field.name), u"&["_s + form_.controls.back().name.Text() + u']'});
+        saved_.push_back(
+            {FieldSource(table_, field.name), u'&' + BracketedName(form_.controls.back().name.Text())});
         top_ += height + kRowGap;
         ++form_.counterA;
         ++form_.counterB;

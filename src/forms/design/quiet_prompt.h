@@ -9,10 +9,9 @@ namespace mirel {
 // For what nobody asked for: answers No, shows nothing, and stops work after a moment.
 class QuietPrompt : public UserPrompt {
 public:
-    explicit QuietPrompt(qint64 patienceMs = 300)
-        : patienceMs_(patienceMs)
-    {
-    }
+    static constexpr qint64 kUsualPatienceMs = 300;
+
+    void SetPatience(qint64 ms) { patienceMs_ = ms; }
 
     bool AskYesNo(const UserMessage&) override { return false; }
     void Show(const UserMessage&) override {}
@@ -34,7 +33,7 @@ private:
         qint64 patienceMs;
         QElapsedTimer since;
     };
-    qint64 patienceMs_;
+    qint64 patienceMs_ = kUsualPatienceMs;
 };
 
 } // namespace mirel
