@@ -43,7 +43,8 @@ struct PropertyDef {
     std::span<const PropertyChoice> choices{};
     qint32 least = std::numeric_limits<qint32>::min();
     qint32 most = std::numeric_limits<qint32>::max();
-    int maxLength = 0; // of a text; 0: any
+    int maxLength = 0;          // of a text; 0: any
+    bool followsSelect = false; // of a query: what stands behind "SELECT * "
 };
 
 // A line of a property sheet. Writing changes the fields that the line is about and leaves every other byte of the

@@ -234,8 +234,10 @@ private:
 // A text of several lines: a statement, or the items of a drop-down box.
 class LinesEditor : public PropertyEditor {
 public:
-    LinesEditor(const PropertyDef& def, QWidget* parent)
+    LinesEditor(const PropertyDef& def, const SheetContext& context, QWidget* parent)
         : PropertyEditor(parent)
+        , context_(context)
+        , followsSelect_(def.followsSelect)
         , text_(new QPlainTextEdit(this))
     {
         text_->setAccessibleName(StringText(def.caption));
@@ -248,8 +250,9 @@ public:
         setFocusProxy(text_);
         if (def.kind == PropertyKind::Query) {
             auto* builder = new QPushButton(StringText(Str::PropBuilder), this);
-            builder->setEnabled(false);
-            builder->setToolTip(StringText(Str::PropBuilderTip));
+            builder->setEnabled(bool(context.dialogs.buildQuery));
+            builder->setToolTip(builder->isEnabled() ? QString() : StringText(Str::PropBuilderTip));
+            connect(builder, &QPushButton::clicked, this, &LinesEditor::Build);
             column->addWidget(builder, 0, Qt::AlignLeft);
         }
         connect(text_, &QPlainTextEdit::textChanged, this, [this] {
@@ -269,6 +272,16 @@ public:
     bool IsWide() const override { return true; }
 
 private:
+    void Build()
+    {
+        MakerDialogs::Query query{text_->toPlainText(), context_.maker.Design().Form().tableName.Text(),
+                                  followsSelect_};
+        if (context_.dialogs.buildQuery(query, *this))
+            text_->setPlainText(query.text);
+    }
+
+    SheetContext context_;
+    bool followsSelect_;
     QPlainTextEdit* text_;
     bool showing_ = false;
 };
@@ -347,7 +360,7 @@ PropertyEditor* MakePropertyEditor(const PropertyDef& def, const SheetContext& c
         return new ExpressionField(def, context, parent);
     case PropertyKind::Query:
     case PropertyKind::Items:
-        return new LinesEditor(def, parent);
+        return new LinesEditor(def, context, parent);
     case PropertyKind::Columns:
     case PropertyKind::Assignments:
         return new PairEditor(def, context, parent);

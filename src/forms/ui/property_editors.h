@@ -14,6 +14,12 @@ namespace mirel {
 struct MakerDialogs {
     std::function<bool(TextStyle& style, QWidget& parent)> chooseFont;
     std::function<bool(quint32& color, QWidget& parent)> chooseColor;
+    struct Query {
+        QString text;
+        QString table;
+        bool followsSelect = false; // the text stands behind "SELECT * "
+    };
+    std::function<bool(Query& query, QWidget& parent)> buildQuery; // null: there is no query builder
 };
 
 // What the editors of a property sheet work on. All of it must outlive them.
