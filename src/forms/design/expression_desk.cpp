@@ -182,7 +182,8 @@ DeskAnswer ExpressionDesk::Evaluate(const DeskQuestion& question, const FormDef&
     }
     answer.value = question.ticks ? QString(HoldsOnRecord(*binding.tree, source_.Context()) ? u'1' : u'0')
                                   : TextOnRecord(*binding.tree, source_.Context());
-    const bool isNull = binding.tree->null || (binding.tree->suppressed && !question.ticks);
+    // A condition that is null does not hold, and that is all a box shows of it.
+    const bool isNull = !question.ticks && (binding.tree->null || binding.tree->suppressed);
     answer.state = isNull ? DeskAnswer::State::Null : DeskAnswer::State::Value;
     return answer;
 }

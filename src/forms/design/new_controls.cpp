@@ -235,7 +235,8 @@ ControlDef NewControl(const FormDef& form, ControlType type, const QString& name
     const ControlTypeDef& row = TypeOf(type);
     const TextMeasure measure(form.textStyle);
     const bool fixed = Has(type, IsTicked);
-    const int width = fixed ? row.width : std::max(measure.Scaled(row.width), 3);
+    const int widest = RightEdge(form) - kMargin;
+    const int width = fixed ? row.width : std::clamp(measure.Scaled(row.width), 3, widest);
     const int height = fixed ? row.height : std::max(measure.Scaled(row.height), 3);
     const int left = std::max(std::min(at.x(), RightEdge(form) - width), std::min(at.x(), 0));
     ControlDef control = Bare(form, type, name, {left, at.y(), width, height});

@@ -141,6 +141,8 @@ QString ShownFieldSource(const ControlDef& control)
 }
 void ShowField(ControlDef& control, const QString& source)
 {
+    if (ShownFieldSource(control) == source)
+        return;
     if (source.isEmpty()) {
         control.fieldBound = 0;
         return;

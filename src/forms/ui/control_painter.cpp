@@ -19,6 +19,7 @@ using namespace Qt::StringLiterals;
 
 constexpr int kInsetPx = 4;
 constexpr int kArrowPx = 14;
+constexpr qreal kLeastCaption = 0.85;
 constexpr size_t kMostFonts = 32;
 constexpr qsizetype kMostTexts = 5000;
 
@@ -131,11 +132,20 @@ void ControlPainter::Paint(QPainter& painter, const ControlDef& control, const Q
     const bool hasArrow = Has(type, HasItems) || control.editKind == EditKind::DatePicker ||
                           control.editKind == EditKind::Extendable;
     if (hasArrow && text.width() > kArrowPx) {
-        DrawArrow(painter, QRect(place.right() - kArrowPx, place.top(), kArrowPx, std::min(place.height(), 24)),
-                  edge);
+        DrawArrow(
+            painter,
+            QRect(place.right() - kArrowPx, place.top(), kArrowPx, std::min(place.height(), int(24 * scale))),
+            edge);
         text.setRight(text.right() - kArrowPx);
     }
-    const QFont& font = FontFor(control.textStyle, scale, isLabel ? 0 : std::max(place.height() - 4, 1));
+    QFont font = FontFor(control.textStyle, scale, std::max(place.height() - (isLabel ? 0 : 4), 1));
+    const QString& shown = TextOf(control);
+    // A caption is narrowed before it is cut, as in the running form.
+    if (Has(type, HasCaption)) {
+        const int width = QFontMetrics(font).horizontalAdvance(shown);
+        if (width > text.width() && place.height() < 2 * QFontMetrics(font).height())
+            font.setPointSizeF(font.pointSizeF() * std::max(qreal(text.width()) / width, kLeastCaption));
+    }
     painter.setFont(font);
     const QFontMetrics metrics(font);
     const bool single = place.height() < 2 * metrics.height() || isButton;
@@ -144,8 +154,9 @@ void ControlPainter::Paint(QPainter& painter, const ControlDef& control, const Q
         ink = Blend(ink, colors.color(groundRole), 0.72F); // it stands for what will be there
     painter.setPen(ink);
     int flags = single ? Qt::AlignVCenter : Qt::AlignTop;
-    flags |= isButton ? Qt::AlignHCenter : int(AlignmentOf(control.windowStyle));
-    const QString& shown = TextOf(control);
+    // The low bits of a drop-down box's style are its kind.
+    const quint32 alignBits = Has(type, HasItems) ? 0 : control.windowStyle;
+    flags |= isButton ? Qt::AlignHCenter : int(AlignmentOf(alignBits));
     if (Has(type, HasRows)) {
         const int head = std::min(metrics.height() + 6, place.height());
         painter.drawText(text.adjusted(0, 0, 0, head - place.height()), Qt::AlignVCenter | Qt::AlignLeft,

@@ -4,11 +4,13 @@
 #include "forms/ui/expression_desk_dialog.h"
 #include "forms/ui/expression_highlighter.h"
 #include "platform/ui/look_roles.h"
+#include "platform/ui/wrapped_text.h"
 #include "resources/string_table.h"
 
 #include <QLabel>
 #include <QPlainTextEdit>
 #include <QPushButton>
+#include <QResizeEvent>
 #include <QVBoxLayout>
 
 namespace mirel {
@@ -58,8 +60,8 @@ ExpressionField::ExpressionField(const PropertyDef& def, const SheetContext& con
     new ExpressionHighlighter(*text_);
     for (QLabel* label : {answer_, losses_}) {
         label->setTextFormat(Qt::PlainText);
-        label->setWordWrap(true);
         label->setMinimumWidth(1);
+        label->hide();
     }
     Tint(*answer_, LookRole::Dim);
     Tint(*losses_, LookRole::Warning);
@@ -120,10 +122,25 @@ void ExpressionField::ShowAnswer()
         text = question.overAll ? StringText(Str::DeskWhole, {QString::number(count), text})
                                 : StringText(Str::DeskValue, {QString::number(context_.desk.Record() + 1), text});
     }
-    answer_->setText(isEmpty && question.text.isEmpty() ? QString() : text);
-    answer_->setVisible(!answer_->text().isEmpty());
-    losses_->setText((answer.losses + answer.reasons).join(QLatin1Char('\n')));
-    losses_->setVisible(!losses_->text().isEmpty());
+    answerText_ = isEmpty && question.text.isEmpty() ? QString() : text;
+    lossText_ = (answer.losses + answer.reasons).join(QLatin1Char('\n'));
+    ShowLines();
+}
+
+// Broken by hand: a scrolled page makes no room for labels that break their lines themselves.
+void ExpressionField::ShowLines()
+{
+    for (const auto& [label, text] : {std::pair(answer_, answerText_), std::pair(losses_, lossText_)}) {
+        label->setText(WrappedText(text, label->font(), width()));
+        label->setVisible(!text.isEmpty());
+    }
+}
+
+void ExpressionField::resizeEvent(QResizeEvent* event)
+{
+    PropertyEditor::resizeEvent(event);
+    if (event->oldSize().width() != event->size().width())
+        ShowLines();
 }
 
 void ExpressionField::OpenDesk()

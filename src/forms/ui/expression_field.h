@@ -22,7 +22,11 @@ public:
     void Show(const QString& value) override;
     bool IsWide() const override { return true; }
 
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+
 private:
+    void ShowLines();
     DeskQuestion Question() const;
     void ShowAnswer();
     void OpenDesk();
@@ -31,6 +35,8 @@ private:
     QPlainTextEdit* text_;
     QLabel* answer_;
     QLabel* losses_;
+    QString answerText_;
+    QString lossText_;
     QTimer wait_; // until typing rests
     quint64 shown_ = 0;
     bool showing_ = false;

@@ -6,6 +6,7 @@
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
+#include <QApplication>
 #include <QDialogButtonBox>
 #include <QMimeData>
 #include <QPainter>
@@ -31,10 +32,8 @@ public:
         const int typeWidth = item.fontMetrics.horizontalAdvance(type);
         const int room = item.rect.width() - typeWidth - 2 * spacing::kGap;
         item.text = item.fontMetrics.elidedText(item.text, Qt::ElideMiddle, std::max(room, item.rect.width() / 2));
-        QStyledItemDelegate::paint(painter, item, index);
-        const QStyle* style = item.widget ? item.widget->style() : nullptr;
-        if (style)
-            style->drawControl(QStyle::CE_ItemViewItem, &item, painter, item.widget);
+        const QStyle* style = item.widget ? item.widget->style() : QApplication::style();
+        style->drawControl(QStyle::CE_ItemViewItem, &item, painter, item.widget);
         if (room < item.rect.width() / 2)
             return;
         const bool selected = (item.state & QStyle::State_Selected) != 0;

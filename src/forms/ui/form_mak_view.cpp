@@ -105,7 +105,9 @@ void CFormMakView::LayOut()
     sheetPanel_->setFocusPolicy(Qt::NoFocus);
     sheetPanel_->viewport()->setAutoFillBackground(false);
     sheet_->setAutoFillBackground(false);
-    status_->setContentsMargins(spacing::kGap, spacing::kTight, spacing::kGap, spacing::kTight);
+
+    fieldPanel_->hide(); // until there is room for them
+    sheetPanel_->hide();
 
     auto* middle = new QHBoxLayout;
     middle->setSpacing(0);
@@ -117,7 +119,10 @@ void CFormMakView::LayOut()
     column->setSpacing(0);
     column->addWidget(toolBar_);
     column->addLayout(middle, 1);
-    column->addWidget(status_);
+    auto* line = new QHBoxLayout;
+    line->setContentsMargins(spacing::kGap, spacing::kTight, spacing::kGap, spacing::kTight);
+    line->addWidget(status_);
+    column->addLayout(line);
     setFocusProxy(surface_);
     setContextMenuPolicy(Qt::NoContextMenu);
 }

@@ -98,8 +98,9 @@ void PropertySheet::ShowState()
                       });
     if (!same && !writing_) {
         table_ = table;
-        lines_ = std::move(lines);
+        shownLines_ = std::exchange(lines_, std::move(lines));
         Build(control);
+        shownLines_.clear();
     }
     if (!same && writing_)
         return; // it is built when the line that was written is done with it
@@ -110,6 +111,10 @@ void PropertySheet::ShowState()
 
 void PropertySheet::Build(int control)
 {
+    // A line that stays keeps the focus: the arrow keys in one change what lines there are.
+    const PropertyDef* focused = nullptr;
+    if (built_ && control == context_.control)
+        focused = FocusedLine();
     built_ = true;
     context_.control = control;
     delete page_;
@@ -133,6 +138,21 @@ void PropertySheet::Build(int control)
     }
     column->addStretch(1);
     column_->addWidget(page_, 1);
+    page_->show(); // or it could not take the focus
+    for (const Line& line : lines_) {
+        if (focused == (line.control ? &line.control->def : &line.form->def))
+            line.editor->setFocus();
+    }
+}
+
+const PropertyDef* PropertySheet::FocusedLine() const
+{
+    const QWidget* focus = QApplication::focusWidget();
+    for (const Line& line : shownLines_) {
+        if (focus && line.editor->isAncestorOf(focus))
+            return line.control ? &line.control->def : &line.form->def;
+    }
+    return nullptr;
 }
 
 void PropertySheet::AddLine(QVBoxLayout& column, Line& line, int number)

@@ -30,6 +30,7 @@ private:
     };
     std::vector<Line> LinesFor(int control) const;
     void Build(int control);
+    const PropertyDef* FocusedLine() const; // null: none
     void AddLine(QVBoxLayout& column, Line& line, int number);
     void ShowTargets();
     void Write(const Line& line, int number, const QString& value);
@@ -39,6 +40,7 @@ private:
     QWidget* page_ = nullptr;
     QVBoxLayout* column_;
     std::vector<Line> lines_;
+    std::vector<Line> shownLines_; // while others take their place
     QStringList targets_;
     bool built_ = false;
     bool writing_ = false;
