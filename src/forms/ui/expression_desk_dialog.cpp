@@ -26,6 +26,7 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kRestMs = 150;
+constexpr int kHelpFromHeight = 280;
 constexpr int kInsertRole = Qt::UserRole;
 constexpr int kHelpRole = Qt::UserRole + 1;
 
@@ -168,6 +169,7 @@ void CExpressionDesk::LayOut()
     column->addWidget(buttons);
     resize(line * 32, line * 26);
     FillSmallWindow(*this, *parentWidget()->window());
+    help_->setVisible(height() >= kHelpFromHeight);
 }
 
 QString CExpressionDesk::Text() const
@@ -225,12 +227,8 @@ void CExpressionDesk::ShowAnswer()
     const int tab = tabs_->indexOf(notes_);
     const QString title = StringText(Str::DeskNotes);
     tabs_->setTabText(tab, notes.isEmpty() ? title : title + u" (%1)"_s.arg(notes.size()));
-    if (!answer.losses.isEmpty())
-        help_->setText(answer.losses.join(u'\n'));
-    else if (!answer.reasons.isEmpty())
-        help_->setText(answer.reasons.join(u'\n'));
-    else
-        help_->setText(StringText(Str::DeskHelpHint));
+    // All of them are among the notes.
+    help_->setText(notes.isEmpty() ? StringText(Str::DeskHelpHint) : notes.first());
 }
 
 void CExpressionDesk::accept()

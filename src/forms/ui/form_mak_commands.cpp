@@ -533,7 +533,7 @@ void CFormMakView::CreateToolBar()
     toolBar_->setIconSize(QSize(side, side));
     actions_->FillToolBar(*toolBar_, ToolBar);
     for (QToolButton* button : toolBar_->findChildren<QToolButton*>())
-        button->setFocusPolicy(Qt::NoFocus); // a tap on the palette leaves the surface the keys
+        button->setFocusPolicy(Qt::TabFocus); // a tap on the palette leaves the surface the keys
 }
 
 QList<KeyHint> CFormMakView::Keys() const

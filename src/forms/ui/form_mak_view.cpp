@@ -38,6 +38,7 @@ constexpr int kSheetWidth = 268;
 constexpr int kFieldsWidth = 172;
 constexpr int kAroundPx = 24;
 constexpr qreal kMostFirstZoom = 1.75;
+constexpr qreal kLeastFirstZoom = 0.85;
 constexpr QSize kPreferred(900, 620);
 
 } // namespace
@@ -278,8 +279,10 @@ void CFormMakView::FitZoom()
     if (zoomByHand_)
         return;
     const int room = scroller_->viewport()->width() - (width() >= kSheetFromWidth ? kAroundPx : 0);
-    const qreal fitting = std::floor(4.0 * room / std::max(maker_.Design().Form().width, 1)) / 4;
-    const qreal zoom = std::clamp(fitting, 1.0, kMostFirstZoom);
+    const qreal exact = qreal(room) / std::max(maker_.Design().Form().width, 1);
+    qreal zoom = std::clamp(std::floor(4 * exact) / 4, 1.0, kMostFirstZoom);
+    if (exact < 1 && exact >= kLeastFirstZoom) // what little it is too wide is squeezed
+        zoom = exact;
     if (zoom != surface_->Zoom())
         surface_->SetZoom(zoom);
     ShowStatus();

@@ -21,7 +21,7 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kRowsShown = 5;
-constexpr int kButtonsInRow = 3;
+constexpr int kButtonsInRow = 2;
 
 // Offers the fields of the form's table for the targets of assignments; others may be typed.
 class TargetDelegate : public QStyledItemDelegate {
