@@ -55,7 +55,7 @@ protected:
         ASSERT_TRUE(UsePalette(u"light"));
         ASSERT_TRUE(commands_.NewDatabase(PathOf(u"shop.cdb"_s)));
         ASSERT_TRUE(session_.GetCatalog().ExecuteStatement(
-            session_.Path(),
+            session_.Location(),
             u"CREATE TABLE [Birds] ([Name] Varchar(40),[Seen] Datetime,[Wild] Bit,[Size] Varchar(10),[Wings] SmallInt)"_s));
         commands_.Refill();
         state_.SetTab(MainTab::Table);
@@ -229,7 +229,7 @@ protected:
     QString Value(const QString& statement)
     {
         DbRecordset rows(connection_);
-        EXPECT_TRUE(rows.Open(statement, session_.Path(), CursorType::ForwardOnly, LockType::ReadOnly));
+        EXPECT_TRUE(rows.Open(statement, session_.Location(), CursorType::ForwardOnly, LockType::ReadOnly));
         return rows.IsEof() ? u"none"_s : rows.ValueText(0);
     }
 

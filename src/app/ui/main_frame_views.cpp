@@ -155,7 +155,7 @@ CFormMakView* CMainFrame::MakeMaker(const FormDef& form, FormMaker::Start start)
     const FormViewSettings options = ReadFormViewSettings(settings_);
     auto* maker = new CFormMakView(form, start,
                                    {.maker = {.connection = session_.Connection(),
-                                              .database = session_.Path(),
+                                              .database = session_.Location(),
                                               .store = session_.Store(),
                                               .prompt = session_.Prompt()},
                                     .dialogs = MakerDialogsOf(),

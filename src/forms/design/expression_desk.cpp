@@ -98,7 +98,7 @@ std::vector<DeskQuestion> ExpressionsOf(const ControlDef& control)
     return found;
 }
 
-ExpressionDesk::ExpressionDesk(DbConnection& connection, QString database, YesNoWords words)
+ExpressionDesk::ExpressionDesk(DbConnection& connection, DatabaseLocation database, YesNoWords words)
     : source_(
           connection, std::move(database), quiet_, std::move(words),
           [this](QStringView name) { return TextOfControl(name); }, &QDateTime::currentDateTime)

@@ -45,7 +45,7 @@ struct DeskAnswer {
 // Connection must outlive the desk. Nothing is ever asked or reported.
 class ExpressionDesk {
 public:
-    ExpressionDesk(DbConnection& connection, QString database, YesNoWords words);
+    ExpressionDesk(DbConnection& connection, DatabaseLocation database, YesNoWords words);
     Q_DISABLE_COPY_MOVE(ExpressionDesk)
 
     // The records of that table; does nothing when they are open already.

@@ -237,7 +237,7 @@ bool FormMaker::Import(const QString& path)
 bool FormMaker::Export(const QString& path)
 {
     UserPrompt& prompt = surroundings_.prompt;
-    if (IsSameFile(path, surroundings_.database) || IsSameFile(path, surroundings_.store.Path()))
+    if (IsSameFile(path, surroundings_.database.FilePath()) || IsSameFile(path, surroundings_.store.Path()))
         return Tell(Str::FileCreationFail, {path});
     if (QFileInfo::exists(path) && !prompt.AskYesNo({Str::MakerFileExists, {path}}))
         return false;

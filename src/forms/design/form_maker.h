@@ -16,7 +16,7 @@ namespace mirel {
 // What a form maker works with. All of it must outlive the maker.
 struct MakerSurroundings {
     DbConnection& connection;
-    QString database; // the file's full path
+    DatabaseLocation database;
     FormStore& store;
     UserPrompt& prompt;
 };

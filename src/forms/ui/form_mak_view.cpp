@@ -416,7 +416,7 @@ void CFormMakView::ImportForm()
     if (!maker_.MayImport())
         return;
     const QString path =
-        ChooseFile(*this, FormFile(Str::MakerImport, FileUse::Open, surroundings_.maker.database, {}));
+        ChooseFile(*this, FormFile(Str::MakerImport, FileUse::Open, surroundings_.maker.database.FilePath(), {}));
     if (path.isEmpty())
         return;
     surface_->hide(); // while it is built again
@@ -428,8 +428,8 @@ void CFormMakView::ImportForm()
 void CFormMakView::ExportForm()
 {
     const QString name = maker_.Design().Form().name.Text() + u".pfs"_s;
-    const QString path =
-        ChooseFile(*this, FormFile(Str::MakerExport, FileUse::Create, surroundings_.maker.database, name));
+    const QString path = ChooseFile(
+        *this, FormFile(Str::MakerExport, FileUse::Create, surroundings_.maker.database.FilePath(), name));
     if (!path.isEmpty())
         (void)maker_.Export(path);
 }
