@@ -154,7 +154,7 @@ std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int co
 
 bool RunningForm::ShowsNumbers(int control, int column)
 {
-    if (!controls_.Is(control, ControlType::List) || !HasResult() || column < 0 ||
+    if (!controls_.Is(control, HasRows) || !HasResult() || column < 0 ||
         column >= controls_[control].columns.size())
         return false;
     const ControlBinding& binding = controls_.Bindings()[size_t(control)];
