@@ -4,6 +4,9 @@
 // mirel-bench-window grid PICTURE ROWS    the same with a QTableView over so many rows
 // mirel-bench-window page DATABASE        turning pages of the table Birds, against a QTableView in turns; prints
 //                                         a line as mirel-bench-engine does
+// mirel-bench-window drag                 dragging controls in the form maker
+#include "forms/ui/design_surface.h"
+#include "forms/ui/form_mak_view.h"
 #include "tableview/record_browser.h"
 #include "tableview/ui/record_grid.h"
 
@@ -14,6 +17,7 @@
 #include <QLabel>
 #include <QMainWindow>
 #include <QMenuBar>
+#include <QMouseEvent>
 #include <QScrollBar>
 #include <QTableView>
 
@@ -149,6 +153,65 @@ int TurnPages(const QString& database)
     return 0;
 }
 
+// One move event of a drag with its repaint, for one control of 300 and for all of them.
+int DragControls()
+{
+    FormDef form;
+    form.SetName(u"Drag");
+    form.width = 620;
+    form.height = 640;
+    for (int i = 0; i < 300; ++i) {
+        ControlDef control;
+        control.type = ControlTypes()[size_t(i) % ControlTypes().size()].type;
+        control.windowStyle = TypeOf(control.type).windowStyle;
+        control.name.Set(u"Control %1"_s.arg(i));
+        control.left = i % 10 * 60 + 5;
+        control.top = i / 10 * 20 + 5;
+        control.width = 55;
+        control.height = 18;
+        form.AddControl(control);
+    }
+    DbConnection connection;
+    SilentPrompt prompt;
+    FormStore store;
+    CFormMakView view(form, FormMaker::Start::Stored,
+                      {.maker = {connection, {}, store, prompt}, .dialogs = {}, .words = {}});
+    view.resize(kWindowSize);
+    view.show();
+    DesignSurface& surface = view.Surface();
+    for (const bool all : {false, true}) {
+        if (all)
+            view.Maker().Design().SelectAll();
+        else
+            view.Maker().Design().SelectOnly(155);
+        surface.ShowState();
+        QCoreApplication::processEvents();
+        QPointF at = surface.RectOf(155).center();
+        const auto send = [&](QEvent::Type type, Qt::MouseButton button) {
+            QMouseEvent event(type, at, surface.mapToGlobal(at), button, Qt::LeftButton, {});
+            QCoreApplication::sendEvent(&surface, &event);
+            QCoreApplication::processEvents();
+        };
+        send(QEvent::MouseButtonPress, Qt::LeftButton);
+        constexpr int kMoves = 200;
+        double sum = 0;
+        double worst = 0;
+        for (int move = 0; move < kMoves; ++move) {
+            at += move % 2 ? QPointF(-11, 14) : QPointF(13, -12);
+            const double begin = ProcessorMs();
+            send(QEvent::MouseMove, Qt::NoButton);
+            const double took = ProcessorMs() - begin;
+            sum += took;
+            worst = std::max(worst, took);
+        }
+        send(QEvent::MouseButtonRelease, Qt::LeftButton);
+        std::printf("drag %s of 300 controls, a move event with its repaint\t%.3f ms\tworst %.3f ms\n",
+                    all ? "all" : "one", sum / kMoves, worst);
+    }
+    view.GiveUpEdits();
+    return 0;
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -167,5 +230,7 @@ int main(int argc, char** argv)
     }
     if (what == u"page")
         return TurnPages(words.value(2));
-    Fail(u"mirel-bench-window bare|grid|page …"_s);
+    if (what == u"drag")
+        return DragControls();
+    Fail(u"mirel-bench-window bare|grid|page|drag …"_s);
 }

@@ -274,34 +274,20 @@ bool MainViewCommands::DeleteFromStore(const MainEntry& entry)
     return deleted;
 }
 
-void MainViewCommands::New()
+std::optional<FormDef> MainViewCommands::New()
 {
     const NewOutcome outcome = OutcomeOfNew(state_);
     if (outcome.message)
         session_.Prompt().Show({*outcome.message, {}});
-    else if (outcome.make == EntryKind::Form)
-        NewForm(state_.CurrentTable());
+    return outcome.make == EntryKind::Form ? NewForm(state_.CurrentTable()) : std::nullopt;
 }
 
-void MainViewCommands::NewForm(const QString& table)
+std::optional<FormDef> MainViewCommands::NewForm(const QString& table)
 {
     UserPrompt& prompt = session_.Prompt();
     if (!prompt.AskYesNo({Str::CreateFormForTable, {table}}))
-        return;
-    std::optional<FormDef> form = DefaultFormOf(session_.Connection(), session_.Location(), table, prompt);
-    if (!form)
-        return;
-    const bool stored = session_.Store().Apply([&form](FormStore& store) {
-        form->SetName(FreeFormName(store, form->name.Text()));
-        store.AddForm(*form);
-        return true;
-    });
-    if (!stored) {
-        prompt.ShowError(session_.Store().LastError());
-        return;
-    }
-    Refill();
-    state_.Select({EntryKind::Form, form->name.Text(), table, false});
+        return std::nullopt;
+    return DefaultFormOf(session_.Connection(), session_.Location(), table, prompt);
 }
 
 std::optional<TableRequest> MainViewCommands::RequestOfSelected() const

@@ -81,9 +81,9 @@ public:
     bool DeleteSelected(); // asks; does nothing on the favorites
     bool RenameSelected(); // asks for the name, and offers to mend what refers to the old one
 
-    // On the tab in front: asks, makes the default form of the selected table and selects it; or says what must be
-    // chosen first.
-    void New();
+    // On the tab in front: asks, and gives the default form of the selected table, which is not in the store yet;
+    // or says what must be chosen first.
+    std::optional<FormDef> New();
 
     // What the table view is to show for the selected entry; empty for a form, or when there is nothing to show.
     std::optional<TableRequest> RequestOfSelected() const;
@@ -101,7 +101,7 @@ private:
     bool DropTable(const QString& name);
     bool RenameTable(const QString& name, const QString& newName);
     bool DeleteFromStore(const MainEntry& entry);
-    void NewForm(const QString& table);
+    std::optional<FormDef> NewForm(const QString& table);
 
     DatabaseSession& session_;
     MainViewState& state_;

@@ -1,6 +1,7 @@
 #include "app/sample_forms.h"
 
 #include "forms/control_source.h"
+#include "forms/design/new_controls.h"
 
 #include <QRect>
 
@@ -12,7 +13,8 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-constexpr QStringView kTable = u"Bird Strikes";
+constexpr QStringView kStrikes = u"Bird Strikes";
+constexpr QStringView kOrders = u"Orders";
 
 // A handheld's screen is 240 pixels wide; the surface leaves room for a scroll bar's edge.
 constexpr int kWidth = 230;
@@ -28,18 +30,13 @@ constexpr quint32 kDropDownStyle = 0x50210002;
 constexpr quint32 kButtonStyle = 0x50010000;
 constexpr quint32 kListStyle = 0x50b10000;
 
-QString FieldSource(QStringView field)
-{
-    return u"[%1].[%2]"_s.arg(kTable, field);
-}
-
 // A form put together control by control, from the top down.
 class FormSheet {
 public:
-    explicit FormSheet(QStringView name)
+    FormSheet(QStringView name, QStringView table)
     {
         form_.SetName(name);
-        form_.SetTableName(kTable);
+        form_.SetTableName(table);
         form_.textStyle.pointSize = kPointSize;
         form_.formScrollBar = 1;
         form_.width = kWidth;
@@ -67,7 +64,7 @@ public:
         ControlDef& box = Add(ControlType::EditBox, field, place, kEditStyle);
         box.fieldBound = 1;
         box.editKind = kind;
-        SetSource(box, FieldSource(field), SourceScope::Record);
+        SetSource(box, Source(field), SourceScope::Record);
         return box;
     }
     void WholeBox(QStringView name, const QString& expression, const QRect& place)
@@ -103,6 +100,10 @@ public:
         return std::move(form_);
     }
     FormDef& Form() { return form_; }
+    QString Source(const QString& field) const { return FieldSource(form_.tableName.Text(), field); }
+    QString Source(QStringView field) const { return Source(field.toString()); }
+    // The field gets what the control of that name holds.
+    SourceAssignment From(QStringView field) const { return {Source(field), u"&[%1]"_s.arg(field)}; }
 
 private:
     ControlDef& Add(ControlType type, QStringView name, const QRect& place, quint32 windowStyle)
@@ -133,7 +134,7 @@ private:
 
 FormDef StrikesForm()
 {
-    FormSheet sheet(u"Strikes");
+    FormSheet sheet(u"Strikes", kStrikes);
     sheet.Title(u"Bird strikes", {kMargin, 4, 140, kLineHeight});
     sheet.Counter({146, 4, 80, kLineHeight});
     sheet.Label(u"Search:", {kMargin, 28, 44, 22});
@@ -146,9 +147,9 @@ FormDef StrikesForm()
                 {176, 28, 50, 22})
         .option1 = 1;
     sheet.List(u"strikes",
-               {{u"Date"_s, FieldSource(u"Flight Date")},
-                {u"Cost $"_s, FieldSource(u"Cost Total $")},
-                {u"Airport"_s, FieldSource(u"Airport Name")}},
+               {{u"Date"_s, sheet.Source(u"Flight Date"_s)},
+                {u"Cost $"_s, sheet.Source(u"Cost Total $"_s)},
+                {u"Airport"_s, sheet.Source(u"Airport Name"_s)}},
                {kMargin, 54, kInnerWidth, 84});
     int top = 142;
     const auto row = [&](QStringView label, QStringView field) {
@@ -196,7 +197,7 @@ constexpr std::array kEntryRows = {
 
 FormDef StrikeEntryForm()
 {
-    FormSheet sheet(u"Strike entry");
+    FormSheet sheet(u"Strike entry", kStrikes);
     sheet.Form().SetDefaultQuery(u"SELECT * FROM [Bird Strikes] ORDER BY [Flight Date] DESC");
     sheet.Form().defaultQueryOnStartup = 1;
     sheet.Title(u"One strike", {kMargin, 4, 140, kLineHeight});
@@ -210,13 +211,58 @@ FormDef StrikeEntryForm()
             sheet.FieldBox(row.field, place, row.kind).lines = row.kind == EditKind::Extendable ? 3 : -1;
         else
             sheet.DropDown(row.field, {{}, row.items.toString()}, place, true);
-        saved.push_back({FieldSource(row.field), u"&[%1]"_s.arg(row.field)});
+        saved.push_back(sheet.From(row.field));
         top += kRowStep;
     }
     top += 2;
-    sheet.Button(u"Save", ButtonFunction::Update, JoinAssignments(saved), {kMargin, top, 70, 24});
-    sheet.Button(u"Clear", ButtonFunction::ClearForm, {}, {80, top, 70, 24});
-    sheet.Button(u"Delete", ButtonFunction::DeleteRecord, {}, {156, top, 70, 24});
+    // No button empties the boxes: what is then typed would be saved over the record that is shown.
+    sheet.Button(u"Save", ButtonFunction::Update, JoinAssignments(saved), {kMargin, top, 56, 24});
+    sheet.Button(u"Add as new", ButtonFunction::Insert, JoinAssignments(saved), {64, top, 94, 24});
+    sheet.Button(u"Delete", ButtonFunction::DeleteRecord, {}, {162, top, 64, 24});
+    return sheet.Done();
+}
+
+// The lines of one order are the records with its number.
+FormDef OrderForm()
+{
+    FormSheet sheet(u"Order", kOrders);
+    sheet.Form().SetDefaultQuery(u"SELECT * FROM Orders WHERE Number = 1001");
+    sheet.Form().defaultQueryOnStartup = 1;
+    sheet.Title(u"Order", {kMargin, 4, 60, kLineHeight});
+    sheet.DropDown(u"Which", {u"SELECT DISTINCT Number FROM Orders ORDER BY Number"_s, {}}, {66, 4, 90, 22},
+                   false);
+    sheet.Button(u"Open", ButtonFunction::Select, u"SELECT * WHERE Number = &[Which]"_s, {160, 4, 66, 22});
+    int top = 32;
+    const auto row = [&](QStringView label, QStringView field, int width, EditKind kind = EditKind::Plain) {
+        sheet.Label(label, {kMargin, top, 60, kLineHeight});
+        sheet.FieldBox(field, {68, top, width, kLineHeight}, kind);
+        top += kRowStep;
+    };
+    row(u"Number:", u"Number", 60);
+    row(u"Customer:", u"Customer", 158);
+    row(u"Ordered:", u"Ordered", 158, EditKind::DatePicker);
+    sheet.List(u"lines",
+               {{u"Item"_s, sheet.Source(u"Item"_s)},
+                {u"Qty"_s, sheet.Source(u"Quantity"_s)},
+                {u"Price"_s, sheet.Source(u"Price"_s)},
+                {u"Amount"_s, u"ROUND([Quantity]*[Price],2)"_s}},
+               {kMargin, top, kInnerWidth, 84});
+    top += 88;
+    sheet.Label(u"Total:", {kMargin, top, 60, kLineHeight});
+    sheet.WholeBox(u"Total", u"ROUND(SUM([Quantity]*[Price]),2)"_s, {68, top, 80, kLineHeight});
+    sheet.Counter({152, top, 74, kLineHeight});
+    top += kRowStep + 4;
+    row(u"Item:", u"Item", 158);
+    row(u"Quantity:", u"Quantity", 60);
+    row(u"Price:", u"Price", 80);
+    top += 2;
+    const std::vector<SourceAssignment> line = {sheet.From(u"Item"), sheet.From(u"Quantity"),
+                                                sheet.From(u"Price")};
+    std::vector<SourceAssignment> added = {sheet.From(u"Number"), sheet.From(u"Customer"), sheet.From(u"Ordered")};
+    added.insert(added.end(), line.begin(), line.end());
+    sheet.Button(u"Save line", ButtonFunction::Update, JoinAssignments(line), {kMargin, top, 72, 24});
+    sheet.Button(u"Add line", ButtonFunction::Insert, JoinAssignments(added), {80, top, 70, 24});
+    sheet.Button(u"Delete line", ButtonFunction::DeleteRecord, {}, {154, top, 72, 24});
     return sheet.Done();
 }
 
@@ -226,6 +272,7 @@ void AddSampleForms(FormStore& store)
 {
     store.AddForm(StrikesForm());
     store.AddForm(StrikeEntryForm());
+    store.AddForm(OrderForm());
 }
 
 } // namespace mirel

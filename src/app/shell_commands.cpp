@@ -55,7 +55,7 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
     case ExportCsv:
         return {entry.kind != EntryKind::Form && !entry.missing, Str::TipExportCsv};
     case Edit:
-        return {entry.kind == EntryKind::Table && !entry.missing, ToolsOf(entry.kind).editTip};
+        return {entry.kind != EntryKind::Query && !entry.missing, ToolsOf(entry.kind).editTip};
     case Rename:
         return {!entry.missing, Str::TipRename};
     default:

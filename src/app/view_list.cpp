@@ -9,6 +9,8 @@ namespace {
 
 constexpr qsizetype kMostViews = 200; // of a profile that somebody damaged
 
+const QString kDesign = QStringLiteral("design:");
+
 MainTab TabOf(EntryKind kind)
 {
     switch (kind) {
@@ -27,8 +29,10 @@ MainTab TabOf(EntryKind kind)
 QString ViewListText(const ViewList& views)
 {
     QStringList words{QString::number(views.front)};
-    for (const ViewKey& view : views.views)
-        words += QString::fromLatin1(QUrl::toPercentEncoding(FavoriteText({view.kind, view.name, {}, false})));
+    for (const ViewKey& view : views.views) {
+        const QString text = FavoriteText({view.kind, view.name, {}, false});
+        words += QString::fromLatin1(QUrl::toPercentEncoding(view.design ? kDesign + text : text));
+    }
     return words.join(u' ');
 }
 
@@ -40,10 +44,11 @@ ViewList ReadViewList(QStringView text)
     const int front = words.value(0).toInt(&isNumber);
     for (qsizetype i = 1; isNumber && i < std::min(words.size(), kMostViews); ++i) {
         const QString word = QUrl::fromPercentEncoding(words[i].toUtf8());
-        const std::optional<MainEntry> entry = FavoriteOfText(word);
+        const bool design = word.startsWith(kDesign);
+        const std::optional<MainEntry> entry = FavoriteOfText(design ? word.sliced(kDesign.size()) : word);
         if (!entry)
             continue;
-        const ViewKey view{entry->kind, entry->name};
+        const ViewKey view{entry->kind, entry->name, design};
         if (std::ranges::find(views.views, view) != views.views.end())
             continue;
         views.views.push_back(view);

@@ -10,6 +10,7 @@ namespace mirel {
 struct ViewKey {
     EntryKind kind = EntryKind::Table;
     QString name;
+    bool design = false; // the form maker on it, in place of the form
 
     friend bool operator==(const ViewKey&, const ViewKey&) = default;
 };

@@ -50,6 +50,7 @@ ExitStatus RunFormsDump(Run& run);
 ExitStatus RunFormsExport(Run& run);
 ExitStatus RunFormsImport(Run& run);
 ExitStatus RunFormsDelete(Run& run);
+ExitStatus RunFormsEdit(Run& run);
 
 // form_show_command.cpp
 ExitStatus RunFormsShow(Run& run);

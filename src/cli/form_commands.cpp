@@ -1,6 +1,7 @@
 #include "cli/cell_text.h"
 #include "cli/commands.h"
 #include "cli/form_json.h"
+#include "cli/form_json_reader.h"
 #include "cli/run.h"
 #include "forms/default_form.h"
 #include "forms/form_file.h"
@@ -163,6 +164,41 @@ ExitStatus RunFormsImport(Run& run)
         else
             run.Prompt().Show({Str::FormNameTaken, {form->name.Text()}});
         return isFree;
+    });
+    return stored ? ExitStatus::Done : ExitStatus::Failed;
+}
+
+ExitStatus RunFormsEdit(Run& run)
+{
+    FormStore* store = OpenStore(run);
+    if (!store)
+        return ExitStatus::Failed;
+    QFile file(run.PathArgument(2));
+    if (!file.open(QIODevice::ReadOnly)) {
+        run.Prompt().Show({Str::CliFormFileUnreadable, {run.Argument(2), file.errorString()}});
+        return ExitStatus::Failed;
+    }
+    UserMessage fault;
+    const std::optional<FormDef> form = ReadFormJson(file.readAll(), fault);
+    if (!form) {
+        run.Prompt().Show(fault);
+        return ExitStatus::Failed;
+    }
+    const QString name = run.Argument(1);
+    const QString newName = form->name.Text();
+    if (newName.trimmed().isEmpty()) {
+        run.Prompt().Show({Str::CliFormWithoutName, {}});
+        return ExitStatus::Failed;
+    }
+    const bool stored = Apply(run, *store, [&](FormStore& forms) {
+        if (!FindForm(run, forms, name))
+            return false;
+        if (newName != name && forms.FindForm(newName)) {
+            run.Prompt().Show({Str::FormNameTaken, {newName}});
+            return false;
+        }
+        *forms.FindForm(name) = *form;
+        return true;
     });
     return stored ? ExitStatus::Done : ExitStatus::Failed;
 }

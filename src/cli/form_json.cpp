@@ -1,6 +1,7 @@
 #include "cli/form_json.h"
 
 #include "cli/json_writer.h"
+#include "forms/control_types.h"
 
 #include <algorithm>
 #include <concepts>
@@ -182,10 +183,10 @@ void WriteRunningControl(Output& output, RunningForm& form, int index)
     object.Put("name", control.name);
     object.Put("type", control.type);
     object.Put("text", form.ShownText(index));
-    if (control.type == ControlType::DropDownBox) {
+    if (Has(control.type, HasItems)) {
         object.Key("items");
         WriteTexts(output, control.items);
-    } else if (control.type == ControlType::List) {
+    } else if (Has(control.type, HasRows)) {
         object.Key("columns");
         WriteTexts(output, control.columns);
         object.Key("rows");

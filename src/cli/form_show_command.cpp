@@ -88,21 +88,17 @@ private:
     {
         RunningForm& form = *forms_.back();
         const YesNoWords& words = form.Settings().words;
-        switch (form.Controls()[size_t(index)].type) {
-        case ControlType::EditBox:
-        case ControlType::DropDownBox:
+        const ControlType type = form.Controls()[size_t(index)].type;
+        if (Has(type, ShowsText)) {
             form.SetText(index, text);
             return true;
-        case ControlType::CheckBox:
+        }
+        if (Has(type, IsTicked)) {
             form.SetTicked(index, text == u"1" || text == words.yes);
             return text == u"1" || text == u"0" || text == words.yes || text == words.no;
-        case ControlType::List: // a row, from 1
-            return form.SelectListRow(index, text.toLongLong() - 1) != RunningForm::Outcome::Failed;
-        case ControlType::Label:
-        case ControlType::Button:
-        case ControlType::None:
-            break;
         }
+        if (Has(type, HasRows)) // a row, from 1
+            return form.SelectListRow(index, text.toLongLong() - 1) != RunningForm::Outcome::Failed;
         return false;
     }
 
@@ -111,7 +107,7 @@ private:
         RunningForm& form = *forms_.back();
         const auto controls = form.Controls();
         const auto button = std::ranges::find_if(controls, [&name](const ControlRun& control) {
-            return control.type == ControlType::Button && control.name == name;
+            return Has(control.type, IsPressed) && control.name == name;
         });
         if (button == controls.end()) {
             run_.Prompt().Show({Str::NoSuchButton, {name}});

@@ -2,6 +2,7 @@
 
 #include "expr/evaluation.h"
 #include "expr/expr_parser.h"
+#include "forms/control_types.h"
 #include "platform/user_locale.h"
 
 namespace mirel {
@@ -77,12 +78,20 @@ std::vector<ControlBinding::Column> BindColumns(const ControlDef& control)
 ControlBinding BindControl(const ControlDef& control)
 {
     ControlBinding binding;
-    if (control.type == ControlType::List)
+    switch (SourceKindOf(control.type)) {
+    case SourceKind::Columns:
         binding.columns = BindColumns(control);
-    else if (control.type == ControlType::DropDownBox)
+        break;
+    case SourceKind::Items:
         BindDropDown(control, binding);
-    else if (control.type == ControlType::EditBox || control.type == ControlType::CheckBox)
+        break;
+    case SourceKind::Expression:
         BindSource(control, binding);
+        break;
+    case SourceKind::Function:
+    case SourceKind::None:
+        break;
+    }
     if (binding.tree) {
         binding.wholeResult = control.sourceScope == SourceScope::WholeResult;
         CollectAggregates(*binding.tree, binding.aggregates);

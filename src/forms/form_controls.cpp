@@ -10,16 +10,6 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-bool HoldsValue(ControlType type)
-{
-    return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
-}
-
-bool ShowsText(ControlType type)
-{
-    return type == ControlType::EditBox || type == ControlType::DropDownBox;
-}
-
 bool IsClock(const ControlDef& control, const ControlBinding& binding)
 {
     if (control.type != ControlType::EditBox || !binding.tree)
@@ -35,9 +25,9 @@ ControlRun MakeRun(const ControlDef& definition, const ControlBinding& binding, 
     control.windowId = windowId;
     control.type = definition.type;
     control.name = definition.name.Text();
-    if (control.type == ControlType::Label || control.type == ControlType::Button)
+    if (Has(control.type, HasCaption))
         control.text = control.name;
-    else if (ShowsText(control.type) && definition.fieldBound != 0)
+    else if (Has(control.type, ShowsText) && definition.fieldBound != 0)
         control.text = definition.defaultValue.Text();
     for (const ControlBinding::Column& column : binding.columns)
         control.columns += column.name;
@@ -57,7 +47,7 @@ FormControls::FormControls(const FormDef& form)
         bindings_.push_back(std::move(binding));
         const QString name = definition.name.Text().trimmed(); // references are trimmed, too
         const int known = names_.value(name, -1);
-        if (known < 0 || (!HoldsValue((*this)[known].type) && HoldsValue(definition.type)))
+        if (known < 0 || (!Has((*this)[known].type, HoldsValue) && Has(definition.type, HoldsValue)))
             names_[name] = index;
     }
     MarkUpdateReferences(form);
@@ -104,9 +94,9 @@ void FormControls::MarkUpdateReferences(const FormDef& form)
     }
 }
 
-bool FormControls::Is(int control, ControlType type) const
+bool FormControls::Is(int control, ControlTrait trait) const
 {
-    return control >= 0 && control < int(controls_.size()) && (*this)[control].type == type;
+    return control >= 0 && control < int(controls_.size()) && Has((*this)[control].type, trait);
 }
 
 int FormControls::Find(QStringView name) const
@@ -117,13 +107,13 @@ int FormControls::Find(QStringView name) const
 int FormControls::FindInput(QStringView name) const
 {
     const int control = Find(name);
-    return control >= 0 && HoldsValue((*this)[control].type) ? control : -1;
+    return control >= 0 && Has((*this)[control].type, HoldsValue) ? control : -1;
 }
 
 QString FormControls::ShownText(int index) const
 {
     const ControlRun& control = (*this)[index];
-    if (control.type == ControlType::CheckBox)
+    if (Has(control.type, IsTicked))
         return control.ticked ? u"1"_s : u"0"_s;
     return control.text;
 }
@@ -174,7 +164,7 @@ void FormControls::Show(size_t index, const FormSource& result)
     const ExprTree& tree = IsItem(binding, result.Context()) ? binding.ownField : binding.tree;
     if (!tree)
         return;
-    if (control.type == ControlType::CheckBox) {
+    if (Has(control.type, IsTicked)) {
         binding.recordTicked = HoldsOnRecord(*tree, result.Context());
         if (control.edited)
             MarkEdited(control, control.ticked != binding.recordTicked);
@@ -207,7 +197,7 @@ void FormControls::ShowRecord(const FormSource& result, Edits edits)
         ForgetEdits();
     for (const int control : order_) {
         const auto i = size_t(control);
-        if (controls_[i].type == ControlType::List)
+        if (Has(controls_[i].type, HasRows))
             ShowPlaceInList(controls_[i], result);
         if (!ShowsRecord(i))
             continue;
@@ -245,7 +235,7 @@ void FormControls::Touch(int control)
 void FormControls::TouchLists()
 {
     for (ControlRun& control : controls_) {
-        if (control.type == ControlType::List)
+        if (Has(control.type, HasRows))
             Touch(control);
     }
 }
@@ -359,7 +349,7 @@ void FormControls::ClearInputs()
     for (ControlRun& control : controls_) {
         if (control.type == ControlType::EditBox)
             ShowText(control, {});
-        else if (control.type == ControlType::CheckBox)
+        else if (Has(control.type, IsTicked))
             ShowTicked(control, false);
     }
 }

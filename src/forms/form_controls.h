@@ -4,6 +4,7 @@
 #include "forms/assignment.h"
 #include "forms/control_binding.h"
 #include "forms/control_run.h"
+#include "forms/control_types.h"
 #include "forms/form_query.h"
 #include "forms/form_source.h"
 
@@ -25,8 +26,8 @@ public:
 
     std::span<const ControlRun> All() const { return controls_; }
     const ControlRun& operator[](int control) const { return controls_[size_t(control)]; }
-    bool Is(int control, ControlType type) const; // false for an index out of range
-    int Find(QStringView name) const;             // the first that can hold a value, else the first; -1: none
+    bool Is(int control, ControlTrait trait) const; // false for an index out of range
+    int Find(QStringView name) const;               // the first that can hold a value, else the first; -1: none
     // Grows with every change of what a control shows.
     quint64 Revision() const { return revision_; }
 

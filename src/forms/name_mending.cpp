@@ -4,6 +4,7 @@
 #include "data/table_statements.h"
 #include "expr/operators.h"
 #include "forms/control_source.h"
+#include "forms/control_types.h"
 #include "provider/dialect/lexer.h"
 #include "provider/dialect/parser.h"
 
@@ -333,7 +334,7 @@ public:
         QStringList tables = {table_};
         tables += TablesOfStatement(form.defaultQuery.Text());
         for (const ControlDef& control : form.controls) {
-            if (control.type == ControlType::Button && control.buttonFunction == ButtonFunction::Select)
+            if (Has(control.type, IsPressed) && control.buttonFunction == ButtonFunction::Select)
                 tables += TablesOfStatement(control.source.Text());
         }
         mayBeBare_ = tables.contains(change.table, Qt::CaseInsensitive);
@@ -375,10 +376,10 @@ private:
 void FormMender::MendControl(ControlDef& control)
 {
     const QString source = control.source.Text();
-    switch (control.type) {
-    case ControlType::Button:
+    switch (SourceKindOf(control.type)) {
+    case SourceKind::Function:
         return MendButton(control);
-    case ControlType::List: {
+    case SourceKind::Columns: {
         std::vector<SourceColumn> columns = SplitListColumns(source);
         const std::vector<SourceColumn> before = columns;
         for (SourceColumn& column : columns)
@@ -387,10 +388,9 @@ void FormMender::MendControl(ControlDef& control)
             control.SetSource(JoinListColumns(columns));
         return;
     }
-    case ControlType::DropDownBox:
+    case SourceKind::Items:
         return MendDropDown(control);
-    case ControlType::EditBox:
-    case ControlType::CheckBox:
+    case SourceKind::Expression:
         if (control.hasSource != 0 && !source.isEmpty())
             return Put(control.source, mender_.Expression(source, ExprMode::Condition, mayBeBare_));
         // Other controls refer to its name, so it gets a source instead.
@@ -400,8 +400,7 @@ void FormMender::MendControl(ControlDef& control)
             mender_.Note();
         }
         return;
-    case ControlType::None:
-    case ControlType::Label:
+    case SourceKind::None:
         return;
     }
 }

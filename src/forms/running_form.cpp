@@ -106,7 +106,7 @@ void RunningForm::FillDropDowns()
     // A query that fails leaves its own box empty. One message is enough: the next is likely to fail likewise.
     OnFailure onFailure = OnFailure::Tell;
     for (int i = 0; i < int(Controls().size()) && timer.elapsed() < kBudgetMs; ++i) {
-        if (controls_.Is(i, ControlType::DropDownBox) && !FillDropDown(i, onFailure))
+        if (controls_.Is(i, HasItems) && !FillDropDown(i, onFailure))
             onFailure = OnFailure::BeSilent;
     }
     itemsOfQuery_.clear();
@@ -114,7 +114,7 @@ void RunningForm::FillDropDowns()
 
 void RunningForm::RefreshItems(int control)
 {
-    if (controls_.Is(control, ControlType::DropDownBox))
+    if (controls_.Is(control, HasItems))
         (void)FillDropDown(control);
     itemsOfQuery_.clear();
 }
@@ -147,14 +147,14 @@ void RunningForm::RecomputeAggregates()
 
 std::vector<QStringList> RunningForm::ListRows(int control, qint64 first, int count)
 {
-    if (!controls_.Is(control, ControlType::List) || !HasResult() || first < 0 || count <= 0)
+    if (!controls_.Is(control, HasRows) || !HasResult() || first < 0 || count <= 0)
         return {};
     return controls_.ListRows(control, source_, first, count);
 }
 
 bool RunningForm::ShowsNumbers(int control, int column)
 {
-    if (!controls_.Is(control, ControlType::List) || !HasResult() || column < 0 ||
+    if (!controls_.Is(control, HasRows) || !HasResult() || column < 0 ||
         column >= controls_[control].columns.size())
         return false;
     const ControlBinding& binding = controls_.Bindings()[size_t(control)];
@@ -205,19 +205,19 @@ std::vector<QStringList> RunningForm::RecordTexts(qint64 first, int count)
 
 void RunningForm::SetText(int index, const QString& text)
 {
-    if (controls_.Is(index, ControlType::EditBox) || controls_.Is(index, ControlType::DropDownBox))
+    if (controls_.Is(index, ShowsText))
         controls_.SetText(index, text);
 }
 
 void RunningForm::SetTicked(int index, bool ticked)
 {
-    if (controls_.Is(index, ControlType::CheckBox))
+    if (controls_.Is(index, IsTicked))
         controls_.SetTicked(index, ticked);
 }
 
 RunningForm::Outcome RunningForm::SelectListRow(int index, qint64 row)
 {
-    if (!controls_.Is(index, ControlType::List) || row < 0 || row >= source_.Count())
+    if (!controls_.Is(index, HasRows) || row < 0 || row >= source_.Count())
         return Outcome::Failed;
     if (row == source_.Index())
         return Outcome::Done;
@@ -229,7 +229,7 @@ RunningForm::Outcome RunningForm::SelectListRow(int index, qint64 row)
 
 RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
 {
-    if (!controls_.Is(index, ControlType::List) || source_.Count() < 1 || column < 0 ||
+    if (!controls_.Is(index, HasRows) || source_.Count() < 1 || column < 0 ||
         column >= controls_[index].columns.size())
         return Outcome::Done;
     const ControlBinding& binding = controls_.Bindings()[size_t(index)];

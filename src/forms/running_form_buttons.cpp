@@ -47,7 +47,7 @@ bool RunningForm::OpenFirstResult()
     if (!callQuery_.isEmpty())
         return RunQuery(callQuery_, callRecord_) == Outcome::Done;
     const auto button = std::ranges::find_if(form_.controls, [](const ControlDef& control) {
-        return control.type == ControlType::Button && control.buttonFunction == ButtonFunction::Select &&
+        return Has(control.type, IsPressed) && control.buttonFunction == ButtonFunction::Select &&
                control.option1 != 0;
     });
     if (button != form_.controls.end())
@@ -93,7 +93,7 @@ int RunningForm::FirstUpdateButton() const
 {
     const std::span<const ControlRun> controls = Controls();
     const auto button = std::ranges::find_if(controls, [](const ControlRun& control) {
-        return control.type == ControlType::Button && control.definition->buttonFunction == ButtonFunction::Update;
+        return Has(control.type, IsPressed) && control.definition->buttonFunction == ButtonFunction::Update;
     });
     return button == controls.end() ? -1 : int(button - controls.begin());
 }
@@ -101,8 +101,7 @@ int RunningForm::FirstUpdateButton() const
 RunningForm::Outcome RunningForm::PressButton(int control)
 {
     whyFailed_.clear();
-    return controls_.Is(control, ControlType::Button) ? RunButton(*controls_[control].definition)
-                                                      : Outcome::Failed;
+    return controls_.Is(control, IsPressed) ? RunButton(*controls_[control].definition) : Outcome::Failed;
 }
 
 RunningForm::Outcome RunningForm::RunButton(const ControlDef& button)

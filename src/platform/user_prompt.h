@@ -47,6 +47,11 @@ public:
         (void)third;
         return AskYesNo(question) ? Answer::Yes : Answer::No;
     }
+    // Whether to keep what would be lost. Third, which leaving the question means as well: neither, go back.
+    virtual Answer AskYesNoCancel(const UserMessage& question)
+    {
+        return AskYesNo(question) ? Answer::Yes : Answer::No;
+    }
     // A question with a plain line below it that says what the answer means (empty: none), and the answer that a
     // mere Enter gives.
     enum class Preset { No, Yes };

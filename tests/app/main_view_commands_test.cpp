@@ -204,24 +204,23 @@ TEST_F(MainViewCommandsTest, AnEntryBecomesAStatementThatAFilterCanBeAppendedTo)
 TEST_F(MainViewCommandsTest, NewSaysWhatMustBeChosenFirst)
 {
     program_->state.SetTab(MainTab::Query);
-    program_->commands.New();
+    EXPECT_FALSE(program_->commands.New());
     EXPECT_EQ(prompt_.shown, QStringList{u"Please choose a Database and Table first."_s});
 }
 
-TEST_F(MainViewCommandsTest, NewMakesAFormForTheSelectedTableAndAsksFirst)
+TEST_F(MainViewCommandsTest, NewGivesTheDefaultFormOfTheSelectedTableAndAsksFirst)
 {
     ASSERT_TRUE(MakeShop());
     program_->SelectOn(MainTab::Table, u"Birds");
     program_->state.SetTab(MainTab::Form);
-    prompt_.answers = {false, true, true};
-    program_->commands.New();
-    EXPECT_TRUE(program_->Names(MainTab::Form).isEmpty());
-    program_->commands.New();
-    program_->commands.New();
+    prompt_.answers = {false, true};
+    EXPECT_FALSE(program_->commands.New());
+    const std::optional<FormDef> form = program_->commands.New();
     EXPECT_EQ(prompt_.questions.last(), u"Create a form based on the table \"Birds\" ?"_s);
-    EXPECT_EQ(program_->Names(MainTab::Form), QStringList({u"DefaultForm"_s, u"DefaultForm2"_s}));
-    ASSERT_TRUE(program_->commands.CallOfSelected());
-    EXPECT_EQ(program_->commands.CallOfSelected()->form.name.Text(), u"DefaultForm2"_s);
+    ASSERT_TRUE(form);
+    EXPECT_EQ(form->name.Text(), u"DefaultForm"_s);
+    EXPECT_EQ(form->tableName.Text(), u"Birds"_s);
+    EXPECT_TRUE(program_->session.Store().Forms().empty()) << "it is saved in the form maker";
 }
 
 TEST_F(MainViewCommandsTest, TheSampleIsMadeOnceAndIsTheUsersFromThenOn)

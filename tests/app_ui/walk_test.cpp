@@ -7,9 +7,14 @@
 #include "app/ui/look.h"
 #include "app/ui/message_box_prompt.h"
 #include "data/filter_condition.h"
+#include "forms/default_form.h"
 #include "forms/form_store.h"
+#include "forms/ui/expression_desk_dialog.h"
+#include "forms/ui/field_list.h"
 #include "forms/ui/form_eng_view.h"
+#include "forms/ui/form_mak_view.h"
 #include "forms/ui/form_options_dialog.h"
+#include "forms/ui/property_sheet.h"
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -250,6 +255,50 @@ TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
         popup->close();
     });
     EXPECT_FALSE(ChooseDay(u"2/3/1499"_s, window.pos(), window));
+}
+
+TEST_F(Walk, GoesThroughTheFormMaker)
+{
+    FormStore store(folder.filePath(u"walk.raf"_s));
+    std::optional<FormDef> form = DefaultFormOf(connection, path, u"People"_s, prompt);
+    ASSERT_TRUE(form);
+    ControlDef list;
+    list.type = ControlType::List;
+    list.SetSource(JoinListColumns({{u"Name"_s, u"People.Name"_s}}));
+    form->AddControl(list);
+    ControlDef items;
+    items.type = ControlType::DropDownBox;
+    items.SetSource(JoinDropDown({u"SELECT Name FROM People"_s, u"a"_s}));
+    form->AddControl(items);
+    FormMaker maker(*form, FormMaker::Start::New, {connection, path, store, prompt});
+    ExpressionDesk desk(connection, path, {});
+    const MakerDialogs dialogs;
+    for (int control = -1; control < maker.Design().Count(); ++control) {
+        if (control < 0)
+            maker.Design().SelectNone();
+        else
+            maker.Design().SelectOnly(control);
+        ExpectDialogFits(u"maker-sheet-%1"_s.arg(control),
+                         [&](QWidget& window) { return new CPropertySheet(maker, desk, dialogs, &window); });
+    }
+    ExpectDialogFits(u"maker-fields"_s,
+                     [&](QWidget& window) { return new CFieldsDialog(maker.Fields(), &window); });
+    int number = 0;
+    for (const QString& text : {u"UPPER(Name)+' '+TO_CHAR(Age)"_s, u"[Nmae]+SUM(Age) Name"_s, QString()}) {
+        ExpectDialogFits(u"maker-desk-%1"_s.arg(++number), [&](QWidget& window) {
+            auto* dialog = new CExpressionDesk(desk, maker, {.text = text}, &window);
+            dialog->findChild<QTabWidget*>()->setCurrentIndex(number);
+            return dialog;
+        });
+    }
+    for (const QSize size : {kUpright, kFlat, kDesktop}) {
+        CFormMakView view(*form, FormMaker::Start::New,
+                          {.maker = {connection, path, store, prompt}, .dialogs = {}, .words = {}});
+        view.resize(size);
+        view.show();
+        ExpectFits(view, u"maker"_s, size);
+        view.GiveUpEdits();
+    }
 }
 
 } // namespace

@@ -200,4 +200,81 @@ TEST_F(FormsCommands, DumpAllThatTheFileKeeps)
     EXPECT_TRUE(form[u"controls"][1][u"control_source"].isNull()); // a label has none
 }
 
+// --- edit ---------------------------------------------------------------------------------------------------
+
+class FormsEdit : public FormsCommands {
+protected:
+    QJsonObject Dumped() const
+    {
+        return QJsonDocument::fromJson(Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8()).object();
+    }
+    Ended Edit(const QByteArray& json, const QString& name = u"DefaultForm"_s) const
+    {
+        QFile file(folder_.filePath(u"form.json"_s));
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(json);
+        file.close();
+        return Run({u"forms"_s, u"edit"_s, u"a.cdb"_s, name, u"form.json"_s});
+    }
+};
+
+TEST_F(FormsEdit, TakesWhatDumpWritesAndChangesWhatWasChanged)
+{
+    const QByteArray dumped = Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8();
+    EXPECT_EQ(Edit(dumped).status, 0);
+    EXPECT_EQ(Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8(), dumped);
+
+    QByteArray changed = dumped;
+    changed.replace("\"form_name\":\"DefaultForm\"", "\"form_name\":\"Birds\"");
+    changed.replace("\"rec_counter\"", "\"count\"");
+    EXPECT_EQ(Edit(changed).status, 0);
+    EXPECT_EQ(Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8(), changed);
+    EXPECT_EQ(Edit(changed).status, 1) << "there is no DefaultForm now";
+    Do({u"forms"_s, u"default"_s, u"a.cdb"_s, u"My Birds"_s});
+    EXPECT_EQ(Edit(changed).status, 1) << "the name is another form's";
+    EXPECT_EQ(
+        Edit("{\"forms\":[{\"form_name\":\"Small\",\"controls\":[{\"name\":\"only\",\"control_type\":200}]}]}")
+            .status,
+        0)
+        << "what is left out is as on a new record";
+}
+
+TEST_F(FormsEdit, RefusesWhatItDoesNotUnderstandByItsPath)
+{
+    const QByteArray before = Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8();
+    struct Case {
+        QByteArray json;
+        QString told;
+    };
+    const auto control = [](const QByteArray& members) {
+        return "{\"forms\":[{\"form_name\":\"F\",\"controls\":[{},{" + members + "}]}]}";
+    };
+    for (const Case& each : {
+             Case{"", u"The file is no JSON: "_s},
+             Case{"[]", u"/: an object is wanted"_s},
+             Case{"{}", u"forms: one form is wanted, and 0 are there"_s},
+             Case{"{\"forms\":[{},{}]}", u"forms: one form is wanted, and 2 are there"_s},
+             Case{"{\"forms\":[{\"form_name\":\"F\"}],\"queries\":[{}]}",
+                  u"queries: queries cannot be replaced here"_s},
+             Case{control("\"lefft\":1"), u"forms[0].controls[1].lefft: there is no such member"_s},
+             Case{control("\"left\":\"1\""),
+                  u"forms[0].controls[1].left: a whole number from -2147483648 to 2147483647 is wanted"_s},
+             Case{control("\"left\":1.5"), u"forms[0].controls[1].left: a whole"_s},
+             Case{control("\"left\":1e300"), u"forms[0].controls[1].left: a whole"_s},
+             Case{control("\"option_1\":256"),
+                  u"forms[0].controls[1].option_1: a whole number from 0 to 255 is wanted"_s},
+             Case{control("\"text_style\":{\"face_name\":\"" + QByteArray(32, 'x') + "\"}"),
+                  u"forms[0].controls[1].text_style.face_name: at most 31 characters fit"_s},
+             Case{control("\"name\":\"a\\u0000b\""), u"forms[0].controls[1].name: a NUL cannot be kept"_s},
+             Case{control("\"reserved\":[1,2]"), u"forms[0].controls[1].reserved: an array is wanted"_s},
+             Case{control("\"reserved\":[1,2,3,4,5,6,7,\"8\"]"), u"forms[0].controls[1].reserved[7]: a whole"_s},
+         }) {
+        const Ended ended = Edit(each.json);
+        EXPECT_EQ(ended.status, 1) << each.json.toStdString();
+        EXPECT_TRUE(ended.err.startsWith(each.told)) << ended.err.toStdString();
+    }
+    EXPECT_EQ(Run({u"forms"_s, u"edit"_s, u"a.cdb"_s, u"DefaultForm"_s, u"no file"_s}).status, 1);
+    EXPECT_EQ(Do({u"forms"_s, u"dump"_s, u"a.cdb"_s}).toUtf8(), before);
+}
+
 } // namespace

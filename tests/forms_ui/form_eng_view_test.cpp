@@ -413,7 +413,7 @@ TEST_F(FormView, TheToolBarSaysWhatItDoesAndWhen)
           u"Delete Record"_s, u"Scroll Up"_s, u"Scroll Down"_s, u"Form Scroll Bar"_s})
         EXPECT_TRUE(std::ranges::any_of(actions, [&](QAction* action) { return action->toolTip() == tip; }))
             << tip.toStdString();
-    EXPECT_FALSE(ActionOf(Str::FormEdit)->isEnabled());
+    EXPECT_TRUE(ActionOf(Str::FormEdit)->isEnabled());
     EXPECT_FALSE(ActionOf(Str::FormPrevious)->isEnabled());
     EXPECT_TRUE(ActionOf(Str::FormNext)->isEnabled());
     ActionOf(Str::FormLast)->trigger();

@@ -13,6 +13,7 @@ class ScriptedPrompt : public UserPrompt {
 public:
     std::deque<bool> answers;
     std::deque<std::optional<QString>> texts;
+    bool cancels = false; // questions that can be cancelled
     qint64 stopAt = -1; // progress asks to stop once this many are done; -1: never
 
     QStringList questions; // what was asked
@@ -23,6 +24,11 @@ public:
     {
         questions += question.Text();
         return Take(answers, false);
+    }
+    Answer AskYesNoCancel(const UserMessage& question) override
+    {
+        const bool yes = AskYesNo(question);
+        return cancels ? Answer::Third : yes ? Answer::Yes : Answer::No;
     }
     void Show(const UserMessage& message) override { shown += message.Text(); }
     void ShowError(const QString& text) override { shown += text; }

@@ -52,6 +52,49 @@ bool ChooseFont(DisplayChoice& choice, QWidget& view)
     return choice.SetFont(dialog.Chosen());
 }
 
+// A form's text style and the description of a font hold the same; a color of none is the desktop's.
+bool ChooseTextStyle(TextStyle& style, QWidget& parent)
+{
+    FontDesc font;
+    font.faceName = style.faceName.IsEmpty() ? parent.font().family() : style.faceName.Text();
+    font.size = style.pointSize > 0 ? style.pointSize : parent.font().pointSize();
+    font.bold = style.bold != 0 ? 1 : 0;
+    font.italic = style.italic != 0 ? 1 : 0;
+    font.strikeout = style.strikeout != 0 ? 1 : 0;
+    font.underline = style.underline != 0 ? 1 : 0;
+    font.color = style.color == kDefaultColor ? RefOfColor(parent.palette().color(QPalette::Text)) : style.color;
+    CFontsDialog dialog(font, &parent);
+    if (dialog.exec() != QDialog::Accepted || dialog.Chosen() == font)
+        return false;
+    const FontDesc& chosen = dialog.Chosen();
+    if (chosen.faceName != font.faceName)
+        style.faceName.Set(chosen.faceName);
+    if (chosen.size != font.size)
+        style.pointSize = chosen.size;
+    if (chosen.color != font.color)
+        style.color = chosen.color;
+    const auto put = [](quint32& flag, int was, int is) {
+        if (was != is)
+            flag = quint32(is);
+    };
+    put(style.bold, font.bold, chosen.bold);
+    put(style.italic, font.italic, chosen.italic);
+    put(style.strikeout, font.strikeout, chosen.strikeout);
+    put(style.underline, font.underline, chosen.underline);
+    return true;
+}
+
+bool ChooseStoredColor(quint32& color, QWidget& parent)
+{
+    const std::optional<QColor> before = color == kDefaultColor ? std::nullopt : std::optional(ColorOfRef(color));
+    CColorsDialog dialog(before, CColorsDialog::Unset::Offered, &parent);
+    if (dialog.exec() != QDialog::Accepted)
+        return false;
+    const std::optional<QColor> chosen = dialog.Chosen();
+    color = chosen ? RefOfColor(*chosen) : kDefaultColor;
+    return true;
+}
+
 } // namespace
 
 ViewLook LookOf(const DisplayChoice& choice)
@@ -60,6 +103,11 @@ ViewLook LookOf(const DisplayChoice& choice)
             .line = ColorsOf(choice, ColorPart::Line),
             .lists = ColorsOf(choice, ColorPart::Lists),
             .buttons = ColorsOf(choice, ColorPart::Buttons)};
+}
+
+MakerDialogs MakerDialogsOf()
+{
+    return {.chooseFont = ChooseTextStyle, .chooseColor = ChooseStoredColor};
 }
 
 bool ChooseLook(DisplayChoice& choice, LookItem item, QWidget& view)

@@ -384,14 +384,18 @@ void CMainFrame::MakeNew()
 {
     if (OutcomeOfNew(state_).make == EntryKind::Table)
         return DesignTable({});
-    commands_.New();
+    if (const std::optional<FormDef> form = commands_.New())
+        DesignNewForm(*form);
     ShowState();
 }
 
 void CMainFrame::EditSelected()
 {
-    if (const std::optional<MainEntry> entry = state_.Selected(); entry && entry->kind == EntryKind::Table)
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (entry && entry->kind == EntryKind::Table)
         DesignTable(entry->name);
+    else if (entry && entry->kind == EntryKind::Form)
+        DesignForm(entry->name);
 }
 
 void CMainFrame::DesignTable(const QString& table)

@@ -3,6 +3,7 @@
 #include "app/file_state.h"
 #include "app/main_view_commands.h"
 #include "app/shell_commands.h"
+#include "forms/design/form_maker.h"
 #include "platform/ui/file_choice.h"
 #include "platform/ui/hosted_view.h"
 #include "platform/ui/view_command.h"
@@ -21,6 +22,7 @@ class QToolButton;
 namespace mirel {
 
 class CFormEngView;
+class CFormMakView;
 class CLumoView;
 class OpenViews;
 class CTableView;
@@ -56,6 +58,11 @@ public:
     CTableView* OpenTable(const TableRequest& request);
     // The frame's command 5001: runs a form in a form engine of its own, also when one runs that form already.
     CFormEngView* OpenForm(const FormCall& call);
+    // The frame's command 5002: opens a new form in the form maker, where it is saved when the user says so.
+    CFormMakView* DesignNewForm(const FormDef& form);
+    // Opens a form of the store in the form maker, or brings forward the one it is open in; null: there is no such
+    // form.
+    CFormMakView* DesignForm(const QString& name);
     // Opens a table, form or query of the database by its name; null as above.
     HostedView* OpenView(const ViewKey& key);
     // The views that were open on this database at the end of the last run. Each is read when it first comes to
@@ -107,6 +114,10 @@ private:
     // Views.
     CTableView* MakeTable(const TableRequest& request);
     CFormEngView* MakeForm(const FormCall& call);
+    CFormMakView* MakeMaker(const FormDef& form, FormMaker::Start start);
+    void RunFromMaker(CFormMakView& maker, const FormCall& call);
+    void EditRunning(CFormEngView& form);
+    void FollowMaker(CFormMakView& maker);
     HostedView* MakeView(const ViewKey& key);
     void ConnectView(HostedView& view);
     void SpreadOptions();

@@ -6,6 +6,7 @@
 #include "app/ui/view_tabs.h"
 #include "app/ui/view_window.h"
 #include "forms/ui/form_eng_view.h"
+#include "forms/ui/form_mak_view.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/table_view.h"
@@ -13,6 +14,7 @@
 #include <QApplication>
 #include <QFileInfo>
 #include <QLabel>
+#include <QPointer>
 #include <QUrl>
 
 #include <algorithm>
@@ -28,6 +30,7 @@ const QString kTablePlace = u"table"_s;
 const QString kFormPlace = u"form"_s;
 const QString kWidthsSection = u"Columns"_s;
 const QString kViewsSection = u"Views"_s;
+constexpr char kMaker[] = "maker"; // of a running form: the form maker that runs it
 constexpr QSize kTableFirstSize(960, 620);
 
 const QString& PlaceOf(const HostedView& view)
@@ -43,6 +46,8 @@ HostedView* CMainFrame::MakeView(const ViewKey& key)
 {
     if (key.kind == EntryKind::Form) {
         const std::optional<FormCall> call = commands_.CallOfForm(key.name);
+        if (key.design)
+            return call ? MakeMaker(call->form, FormMaker::Start::Stored) : nullptr;
         CFormEngView* form = call ? MakeForm(*call) : nullptr;
         if (form)
             (void)form->Open();
@@ -130,6 +135,7 @@ CFormEngView* CMainFrame::MakeForm(const FormCall& call)
                                   this);
     form->hide();
     connect(form, &CFormEngView::formCalled, this, &CMainFrame::OpenForm);
+    connect(form, &CFormEngView::editRequested, this, [this, form] { EditRunning(*form); });
     connect(form, &CFormEngView::dataChanged, this, [this] {
         commands_.Refill();
         ShowState();
@@ -140,6 +146,106 @@ CFormEngView* CMainFrame::MakeForm(const FormCall& call)
     });
     ConnectView(*form);
     return form;
+}
+
+// --- designing forms ----------------------------------------------------------------------------------------
+
+CFormMakView* CMainFrame::MakeMaker(const FormDef& form, FormMaker::Start start)
+{
+    const FormViewSettings options = ReadFormViewSettings(settings_);
+    auto* maker = new CFormMakView(form, start,
+                                   {.maker = {.connection = session_.Connection(),
+                                              .database = session_.Location(),
+                                              .store = session_.Store(),
+                                              .prompt = session_.Prompt()},
+                                    .dialogs = MakerDialogsOf(),
+                                    .words = options.words,
+                                    .holdTimeMs = options.holdTimeMs},
+                                   this);
+    maker->hide();
+    connect(maker, &CFormMakView::runRequested, this,
+            [this, maker](const FormCall& call) { RunFromMaker(*maker, call); });
+    connect(maker, &CFormMakView::formSaved, this, [this, maker] { FollowMaker(*maker); });
+    ConnectView(*maker);
+    return maker;
+}
+
+CFormMakView* CMainFrame::DesignNewForm(const FormDef& form)
+{
+    CFormMakView* maker = MakeMaker(form, FormMaker::Start::New);
+    tabs_->Add(maker, {EntryKind::Form, {}, true});
+    return maker;
+}
+
+CFormMakView* CMainFrame::DesignForm(const QString& name)
+{
+    const ViewKey key{EntryKind::Form, name, true};
+    for (CViewWindow* window : Windows()) {
+        if (window->Key() != key)
+            continue;
+        window->raise();
+        window->activateWindow();
+        return qobject_cast<CFormMakView*>(window->View());
+    }
+    if (tabs_->BringForward(key))
+        return qobject_cast<CFormMakView*>(tabs_->Front());
+    const std::optional<FormCall> call = commands_.CallOfForm(name);
+    if (!call) {
+        session_.Prompt().Show({Str::MakerFormGone, {name}});
+        return nullptr;
+    }
+    CFormMakView* maker = MakeMaker(call->form, FormMaker::Start::Stored);
+    tabs_->Add(maker, key);
+    return maker;
+}
+
+// A form that runs from its maker is one view, begun again with each Run; Edit Form leads back.
+void CMainFrame::RunFromMaker(CFormMakView& maker, const FormCall& call)
+{
+    const QPointer<CFormMakView> from(&maker);
+    for (CFormEngView* running : ViewsOf<CFormEngView>()) {
+        if (running->property(kMaker).value<QObject*>() == &maker && !running->close())
+            return;
+    }
+    if (!from)
+        return;
+    CFormEngView* running = OpenForm(call);
+    running->setProperty(kMaker, QVariant::fromValue<QObject*>(from));
+}
+
+void CMainFrame::EditRunning(CFormEngView& form)
+{
+    const auto* maker = qobject_cast<CFormMakView*>(form.property(kMaker).value<QObject*>());
+    const QList<CFormMakView*> open = ViewsOf<CFormMakView>();
+    const auto found = std::ranges::find(open, maker);
+    if (!maker || found == open.end()) {
+        DesignForm(form.Form().Title());
+        return;
+    }
+    for (int tab = 0; tab < tabs_->Count(); ++tab) {
+        if (tabs_->ViewAt(tab) == maker)
+            tabs_->BringForward(tab);
+    }
+    if (QWidget* window = (*found)->window(); window != this)
+        window->activateWindow();
+}
+
+// A form that was saved, under whatever name, is that form from now on.
+void CMainFrame::FollowMaker(CFormMakView& maker)
+{
+    const QString& name = maker.Maker().StoredName();
+    for (int tab = 0; tab < tabs_->Count(); ++tab) {
+        if (tabs_->ViewAt(tab) == &maker)
+            tabs_->SetNameAt(tab, name);
+    }
+    for (CViewWindow* window : Windows()) {
+        if (window->View() == &maker)
+            window->SetName(name);
+    }
+    commands_.Refill();
+    if (state_.Tab() == MainTab::Form)
+        state_.Select({EntryKind::Form, name, {}, false});
+    ShowState();
 }
 
 void CMainFrame::ConnectView(HostedView& view)

@@ -228,6 +228,20 @@ UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, con
     return pressed == QMessageBox::Yes ? Answer::Yes : Answer::No;
 }
 
+UserPrompt::Answer MessageBoxPrompt::AskYesNoCancel(const UserMessage& question)
+{
+    const WorkHidden hidden;
+    WideBox box(QMessageBox::Question, question.Text(), {},
+                QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
+    box.setDefaultButton(QMessageBox::Yes);
+    box.setEscapeButton(QMessageBox::Cancel);
+    const UsualCursor answering;
+    const int pressed = box.exec();
+    if (pressed == QMessageBox::Yes)
+        return Answer::Yes;
+    return pressed == QMessageBox::No ? Answer::No : Answer::Third;
+}
+
 void MessageBoxPrompt::Show(const UserMessage& message)
 {
     Ask(message.Text(), {}, QMessageBox::Information, QMessageBox::Ok, QMessageBox::Ok);

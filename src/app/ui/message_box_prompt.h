@@ -14,6 +14,7 @@ public:
     bool AskYesNo(const UserMessage& question) override;
     bool AskYesNoWith(const UserMessage& question, const Details& details) override;
     Answer AskYesNoOr(const UserMessage& question, const UserMessage& third) override;
+    Answer AskYesNoCancel(const UserMessage& question) override;
     void Show(const UserMessage& message) override;
     void ShowError(const QString& text) override;
     void ShowErrorWithReason(const QString& text, const QString& reason) override;

@@ -5,7 +5,44 @@
 #include "forms/ui/record_list.h"
 #include "forms/ui/simple_controls.h"
 
+#include <algorithm>
+#include <array>
+
 namespace mirel {
+namespace {
+
+using ListSource = ControlWidget::ListSource;
+
+template <typename Widget>
+std::unique_ptr<ControlWidget> MakeWidget(const ControlRun& control, const ListSource&, QWidget& surface)
+{
+    return std::make_unique<Widget>(control, surface);
+}
+
+std::unique_ptr<ControlWidget> MakeEdit(const ControlRun& control, const ListSource&, QWidget& surface)
+{
+    return MakeEditBox(control, surface);
+}
+
+std::unique_ptr<ControlWidget> MakeList(const ControlRun& control, const ListSource& list, QWidget& surface)
+{
+    return std::make_unique<ListWidget>(control, list, surface);
+}
+
+struct WidgetOfType {
+    ControlType type;
+    std::unique_ptr<ControlWidget> (*make)(const ControlRun&, const ListSource&, QWidget&);
+};
+constexpr std::array kWidgets = {
+    WidgetOfType{ControlType::Label, &MakeWidget<LabelWidget>},
+    WidgetOfType{ControlType::EditBox, &MakeEdit},
+    WidgetOfType{ControlType::CheckBox, &MakeWidget<CheckBoxWidget>},
+    WidgetOfType{ControlType::DropDownBox, &MakeWidget<DropDownWidget>},
+    WidgetOfType{ControlType::List, &MakeList},
+    WidgetOfType{ControlType::Button, &MakeWidget<ButtonWidget>},
+};
+
+} // namespace
 
 ControlWidget::ControlWidget(const ControlRun& control, QWidget& main)
     : definition_(*control.definition)
@@ -41,22 +78,9 @@ void ControlWidget::SetColors(QPalette::ColorRole background, QPalette::ColorRol
 std::unique_ptr<ControlWidget> ControlWidget::Make(const ControlRun& control, const ListSource& list,
                                                    QWidget& surface)
 {
-    switch (control.type) {
-    case ControlType::EditBox:
-        return MakeEditBox(control, surface);
-    case ControlType::List:
-        return std::make_unique<ListWidget>(control, list, surface);
-    case ControlType::DropDownBox:
-        return std::make_unique<DropDownWidget>(control, surface);
-    case ControlType::Button:
-        return std::make_unique<ButtonWidget>(control, surface);
-    case ControlType::CheckBox:
-        return std::make_unique<CheckBoxWidget>(control, surface);
-    case ControlType::Label:
-    case ControlType::None:
-        break;
-    }
-    return std::make_unique<LabelWidget>(control, surface); // of a number without a meaning: what it is called
+    const auto row = std::ranges::find(kWidgets, control.type, &WidgetOfType::type);
+    const auto make = row == kWidgets.end() ? &MakeWidget<LabelWidget> : row->make; // unknown: what it is called
+    return make(control, list, surface);
 }
 
 } // namespace mirel

@@ -60,6 +60,7 @@ public:
     void RunAgain();
 
 Q_SIGNALS:
+    void editRequested();                                          // the form itself is to be changed
     void formCalled(const mirel::FormCall& call);                  // CALL FORM: to run in a view of its own
     void dataChanged();                                            // data of the database are not what they were
     void settingsChanged(const mirel::FormViewSettings& settings); // by the user; in force here already

@@ -1,5 +1,6 @@
 #include "forms/ui/form_surface.h"
 
+#include "forms/control_types.h"
 #include "forms/ui/control_look.h"
 #include "platform/ui/look_roles.h"
 
@@ -37,7 +38,7 @@ QSize SizeOf(const FormDef& form)
 // The text that Escape gives back; of a check box, whether it was ticked.
 QString TextOf(const ControlRun& control)
 {
-    return control.type == ControlType::CheckBox ? QString(control.ticked ? u'1' : u'0') : control.text;
+    return Has(control.type, IsTicked) ? QString(control.ticked ? u'1' : u'0') : control.text;
 }
 
 } // namespace
@@ -193,8 +194,7 @@ int FormSurface::FocusedControl() const
 
 bool FormSurface::IsInput(int control) const
 {
-    const ControlType type = form_.Controls()[size_t(control)].type;
-    return type == ControlType::EditBox || type == ControlType::DropDownBox || type == ControlType::CheckBox;
+    return Has(form_.Controls()[size_t(control)].type, HoldsValue);
 }
 
 // A box that shows an expression is for reading, but where a button reads it: then what is typed counts.
@@ -245,7 +245,7 @@ bool FormSurface::Revert(int control)
     if (TextOf(run) == before)
         return false;
     Act([&] {
-        if (run.type == ControlType::CheckBox)
+        if (Has(run.type, IsTicked))
             form_.SetTicked(control, before == u"1");
         else
             form_.SetText(control, before);

@@ -1,3 +1,4 @@
+#include "forms/control_types.h"
 #include "forms/ui/form_eng_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/form_surface.h"
@@ -92,7 +93,7 @@ struct CFormEngView::Commands {
         Q_EMIT view.settingsChanged(settings);
     }
     static void Zoom(CFormEngView& view) { view.surface_->OpenMoreOf(view.CommandControl()); }
-    static void Nothing(CFormEngView&) {} // not built yet
+    static void EditForm(CFormEngView& view) { Q_EMIT view.editRequested(); }
 
     static State HasRecords(const CFormEngView& view) { return {.enabled = view.form_.RecordCount() > 0}; }
     static State HasPrevious(const CFormEngView& view) { return {.enabled = view.form_.CurrentRecord() > 0}; }
@@ -124,7 +125,7 @@ struct CFormEngView::Commands {
     {
         const int control = view.CommandControl();
         const ControlType type = control >= 0 ? view.form_.Controls()[size_t(control)].type : ControlType::None;
-        return {.enabled = type == ControlType::EditBox || type == ControlType::DropDownBox};
+        return {.enabled = Has(type, ShowsText)};
     }
     static State CanScrollUp(const CFormEngView& view)
     {
@@ -152,7 +153,6 @@ std::span<const CommandRow<CFormEngView>> CFormEngView::Commands::Table()
     using F = RunningForm;
     using V = CFormEngView;
     constexpr bool kCheckable = true;
-    constexpr bool kLater = false;
     // The tips of the tool bar are the commands' names. An editor keeps the keys that move within its text.
     static constexpr std::array kRows = {
         Row{{.id = Id(Command::Save),
@@ -185,9 +185,8 @@ std::span<const CommandRow<CFormEngView>> CFormEngView::Commands::Table()
              .tip = Str::FormEditTip,
              .icon = u"document-edit",
              .menus = FileMenu,
-             .group = 1,
-             .built = kLater},
-            Nothing},
+             .group = 1},
+            EditForm},
         Row{{.id = Id(Command::First),
              .text = Str::FormFirst,
              .tip = Str::FormFirstTip,
