@@ -28,6 +28,7 @@ class CViewWindow;
 class EmptyPage;
 class EntryPanel;
 class HostedView;
+class ImportSource;
 class ShellActions;
 class SideBar;
 class ViewTabs;
@@ -103,6 +104,8 @@ private:
     void ChooseAndCreateDatabase();
     void ChooseAndDeleteDatabase();
     void OpenPath(const QString& path);
+    void ImportFrom(const ImportSource& source); // none: the user chooses
+    void ImportFromClipboard();
 
     // Views.
     CTableView* MakeTable(const TableRequest& request);
