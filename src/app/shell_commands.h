@@ -22,6 +22,7 @@ enum class ShellCommand {
     ButtonTextColor,
     ResetLayout,
     ImportCsv,
+    PasteTable,
     ExportCsv,
     Exit,
     OpenDatabase,

@@ -13,8 +13,10 @@ constexpr std::array kFormatOptions = {Opt::Format};
 constexpr std::array kQueryOptions = {Opt::Format, Opt::Yes};
 constexpr std::array kSqlOptions = {Opt::Format, Opt::Offset, Opt::Limit};
 constexpr std::array kImportOptions = {
-    Opt::Table,         Opt::Create,    Opt::Columns,       Opt::Header,        Opt::Separator, Opt::Quote,
-    Opt::DoubledQuotes, Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator, Opt::Encoding,  Opt::WholeTexts,
+    Opt::Table,    Opt::Create,        Opt::Columns,   Opt::Header,        Opt::Separator,
+    Opt::Quote,    Opt::DoubledQuotes, Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator,
+    Opt::Encoding, Opt::WholeTexts,    Opt::Detect,    Opt::NoHeader,      Opt::QuotedLines,
+    Opt::Decimal,  Opt::SkipTo,        Opt::Key,       Opt::Yes,
 };
 constexpr std::array kEvalOptions = {Opt::Database, Opt::Source, Opt::Record, Opt::All,    Opt::Condition,
                                      Opt::Control,  Opt::Format, Opt::Tree,   Opt::Explain};
@@ -22,8 +24,8 @@ constexpr std::array kShowOptions = {Opt::Query, Opt::Record, Opt::Set, Opt::Pre
 constexpr std::array kNameOptions = {Opt::Name};
 constexpr std::array kImportNeeds = {Opt::Table};
 constexpr std::array kExportOptions = {
-    Opt::Query,     Opt::Yes,           Opt::Header,        Opt::Separator,     Opt::Quote,
-    Opt::DateOrder, Opt::DateSeparator, Opt::TimeSeparator, Opt::DoubledQuotes, Opt::Encoding,
+    Opt::Query,         Opt::Yes,           Opt::Header,        Opt::Separator, Opt::Quote, Opt::DateOrder,
+    Opt::DateSeparator, Opt::TimeSeparator, Opt::DoubledQuotes, Opt::Encoding,  Opt::Bom,   Opt::Format,
 };
 constexpr std::array kSaveOptions = {Opt::Table, Opt::Replace, Opt::Yes};
 
@@ -51,10 +53,11 @@ constexpr std::array kCommands = {
     CommandDef{"import", "DB FILE", "import a CSV file into a table", kImportOptions, kImportNeeds, RunImport},
     CommandDef{"export",
                "DB [SOURCE] FILE",
-               "export a table, a saved query or a SELECT as a CSV file (-: standard output)",
+               "export a table, a saved query or a SELECT as a file: CSV, JSON or a web page (-: standard output)",
                kExportOptions,
                {},
-               RunExport},
+               RunExport,
+               "csv|json|html"},
     CommandDef{"design",
                "DB TABLE FILE",
                "make or change a table by a list of its fields in JSON: name, type, size, index, was",

@@ -24,6 +24,9 @@ CsvExportOptions OptionsOf(const Arguments& arguments)
     options.dates.dateSeparator = arguments.Character(Opt::DateSeparator, options.dates.dateSeparator);
     options.dates.timeSeparator = arguments.Character(Opt::TimeSeparator, options.dates.timeSeparator);
     options.encoding = arguments.Text(Opt::Encoding, QString::fromLatin1(options.encoding)).toUtf8();
+    options.byteOrderMark = arguments.Has(Opt::Bom);
+    const QString format = arguments.Text(Opt::Format);
+    options.kind = format == u"json" ? ExportKind::Json : format == u"html" ? ExportKind::Html : ExportKind::Csv;
     return options;
 }
 
@@ -81,7 +84,9 @@ ExitStatus RunExport(Run& run)
 {
     if (const QString fault = FaultOf(run); !fault.isEmpty())
         return run.Refuse(fault);
-    const CsvExportOptions options = OptionsOf(run.Args());
+    CsvExportOptions options = OptionsOf(run.Args());
+    options.words = run.Words();
+    options.title = run.Args().Has(Opt::Query) ? run.Args().Text(Opt::Query) : run.Argument(1);
     if (!CsvWriter::KnowsEncoding(options.encoding)) {
         run.Prompt().Show({Str::ImportUnknownEncoding, {QString::fromUtf8(options.encoding)}});
         return ExitStatus::Failed;

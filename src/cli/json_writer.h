@@ -1,18 +1,19 @@
 #pragma once
 
 #include "cli/record_writer.h"
+#include "tableview/json_records.h"
 
 #include <QByteArray>
 
-#include <vector>
+#include <optional>
+#include <string>
 
 namespace mirel::cli {
 
-// Records as JSON objects: numbers as numbers, Yes/No as true and false, a date as "YYYY-MM-DDTHH:MM:SS", binary
-// as base64, NULL as null. A second column of one name has the key "Table.Field".
+// Records as JSON on the standard output.
 class JsonWriter : public RecordWriter {
 public:
-    enum class Shape { Array, Lines }; // one array of objects, or one object per line
+    using Shape = JsonRecords::Shape;
 
     JsonWriter(Output& output, Shape shape)
         : output_(output)
@@ -25,13 +26,12 @@ public:
     void End() override;
 
 private:
-    void WriteCell(const Cell& cell, FieldType type);
+    void Write();
 
     Output& output_;
     Shape shape_;
-    std::span<const ResultField> fields_;
-    std::vector<QByteArray> keys_; // in quotes, with the colon
-    bool first_ = true;
+    std::optional<JsonRecords> records_;
+    std::string pending_;
 };
 
 // A text in quotes, as JSON writes it. Bytes that are not UTF-8 become the replacement character.

@@ -37,6 +37,18 @@ constexpr std::array kOptions = {
     OptionDef{Opt::Encoding, "--encoding", ValueKind::Text, "NAME", "character encoding of the file (UTF-8)"},
     OptionDef{Opt::WholeTexts, "--whole-texts", ValueKind::Flag, "",
               "do not cut texts of more than 8192 characters"},
+    OptionDef{Opt::Detect, "--detect", ValueKind::Flag, "",
+              "find out from the file what is not given: separator, marks, header, encoding, names, types, dates"},
+    OptionDef{Opt::NoHeader, "--no-header", ValueKind::Flag, "",
+              "the first line is a record, whatever it looks like"},
+    OptionDef{Opt::QuotedLines, "--quoted-lines", ValueKind::Flag, "",
+              "quoted texts may span lines; quotation marks inside them are doubled"},
+    OptionDef{Opt::Decimal, "--decimal", ValueKind::Decimal, "point|comma", "the sign before decimals (point)"},
+    OptionDef{Opt::SkipTo, "--skip-to", ValueKind::Text, "FILE",
+              "write lines that fail to FILE and go on (an existing one with --yes)"},
+    OptionDef{Opt::Key, "--key", ValueKind::Text, "FIELD[,FIELD]",
+              "change records that have the same values in these fields, add the others"},
+    OptionDef{Opt::Bom, "--bom", ValueKind::Flag, "", "begin the file with a byte-order mark"},
     OptionDef{Opt::Database, "--db", ValueKind::Text, "DB", "the database of --source"},
     OptionDef{Opt::Source, "--source", ValueKind::Text, "SOURCE",
               "the records for the expression: a table, a saved query or a SELECT"},
@@ -77,6 +89,10 @@ constexpr std::array kSeparators = {
     NamedCharacter{QLatin1StringView("tab"), u'\t'},
     NamedCharacter{QLatin1StringView("space"), u' '},
 };
+constexpr std::array kDecimals = {
+    NamedCharacter{QLatin1StringView("point"), u'.'},
+    NamedCharacter{QLatin1StringView("comma"), u','},
+};
 constexpr std::array kQuotes = {NamedCharacter{QLatin1StringView("none"), 0}};
 
 std::span<const NamedCharacter> NamedCharacters(ValueKind kind)
@@ -85,6 +101,8 @@ std::span<const NamedCharacter> NamedCharacters(ValueKind kind)
         return kSeparators;
     if (kind == ValueKind::Quote)
         return kQuotes;
+    if (kind == ValueKind::Decimal)
+        return kDecimals;
     return {};
 }
 
@@ -113,6 +131,8 @@ std::optional<char16_t> CharacterOf(ValueKind kind, QStringView text)
         if (text == each.name)
             return each.character;
     }
+    if (kind == ValueKind::Decimal)
+        return {};
     // A line end would cut every record apart, and half a character is none.
     if (text.size() != 1 || text[0].isSurrogate() || text[0].isNull() || text[0] == u'\n' || text[0] == u'\r')
         return {};
@@ -132,6 +152,7 @@ bool IsValidValue(ValueKind kind, const QString& text)
     case ValueKind::Separator:
     case ValueKind::Quote:
     case ValueKind::Character:
+    case ValueKind::Decimal:
         return CharacterOf(kind, text).has_value();
     case ValueKind::DateOrder:
         return text.size() == 1 && text[0] >= u'0' && text[0] <= u'6';

@@ -29,6 +29,13 @@ enum class Opt {
     DoubledQuotes,
     Encoding,
     WholeTexts,
+    Detect,
+    NoHeader,
+    QuotedLines,
+    Decimal,
+    SkipTo,
+    Key,
+    Bom,
     Database,
     Source,
     Record,
@@ -45,7 +52,7 @@ enum class Opt {
 };
 
 // What an option's value must be; any other value is refused before the command runs.
-enum class ValueKind { Flag, Text, Count, Format, Separator, Quote, Character, DateOrder };
+enum class ValueKind { Flag, Text, Count, Format, Separator, Quote, Character, DateOrder, Decimal };
 
 struct OptionDef {
     Opt id;

@@ -61,6 +61,11 @@ QString Run::PathArgument(int index) const
     return FullPath(Argument(index));
 }
 
+QString Run::FilePath(const QString& given) const
+{
+    return given.isEmpty() ? QString() : FullPath(given);
+}
+
 bool Run::OpenDatabase(const QString& file)
 {
     const bool open = session_.Open(FullPath(file));

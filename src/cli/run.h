@@ -35,6 +35,7 @@ public:
     QString Argument(int index) const { return arguments_.positional.value(index); }
     // A file named on the command line, by its full path.
     QString PathArgument(int index) const;
+    QString FilePath(const QString& given) const; // the same of an option's
 
     // Opens the database that the first argument names, or `file`, as the window does. On false the reason has
     // been reported.

@@ -49,6 +49,49 @@ std::string_view FirstUnits(std::string_view utf8, int units)
 
 } // namespace
 
+bool ReadCommaNumber(std::string_view text, std::array<char, kMaxCommaNumber>& digits, size_t& length,
+                     size_t& numberEnd)
+{
+    constexpr size_t kGroup = 3;
+    length = 0;
+    size_t at = size_t(NumberStart(text) - text.data());
+    const auto put = [&](char byte) {
+        if (length == digits.size())
+            return false;
+        digits[length++] = byte;
+        return true;
+    };
+    const auto putDigits = [&](size_t most) {
+        const size_t from = at;
+        while (at < text.size() && at - from < most && IsDigit(text[at]) && put(text[at]))
+            ++at;
+        return at - from;
+    };
+    if (at < text.size() && text[at] == '-' && put(text[at]))
+        ++at;
+    const size_t first = putDigits(digits.size());
+    // A point is a group's only where three digits follow it, and no fourth.
+    const auto isGroup = [&] {
+        const std::string_view rest = text.substr(std::min(at, text.size()));
+        return rest.size() > kGroup && rest[0] == '.' &&
+               std::all_of(rest.begin() + 1, rest.begin() + 1 + kGroup, IsDigit) &&
+               (rest.size() == kGroup + 1 || !IsDigit(rest[kGroup + 1]));
+    };
+    while (first > 0 && first <= kGroup && isGroup()) {
+        ++at;
+        putDigits(kGroup);
+    }
+    if (at < text.size() && text[at] == ',' && put('.')) {
+        ++at;
+        if (putDigits(digits.size()) == 0 && first == 0)
+            return false;
+    } else if (first == 0) {
+        return false;
+    }
+    numberEnd = at;
+    return at == text.size() || !IsDigit(text[at]);
+}
+
 qsizetype Utf16Length(std::string_view utf8)
 {
     qsizetype units = 0;
@@ -143,9 +186,20 @@ Hr CellReader::ReadDouble(std::string_view text, Cell& cell)
     const char* const start = NumberStart(text);
     const char* const digits = start != end && *start == '-' ? start + 1 : start;
     // std::from_chars reads the words "inf" and "nan" as numbers, but no file means them.
-    if (digits == end || !(IsDigit(*digits) || *digits == '.'))
+    if (digits == end || !(IsDigit(*digits) || char16_t(*digits) == decimal_))
         return Hr::BadLiteral;
     double number = 0;
+    if (decimal_ == u',') {
+        std::array<char, kMaxCommaNumber> plain{};
+        size_t length = 0;
+        size_t numberEnd = 0;
+        if (!ReadCommaNumber(text, plain, length, numberEnd) ||
+            std::from_chars(plain.data(), plain.data() + length, number).ec != std::errc())
+            return Hr::BadLiteral;
+        CountRest(text.data() + numberEnd, text);
+        cell = Cell::Of(number);
+        return Hr::Ok;
+    }
     const auto read = std::from_chars(start, end, number);
     if (read.ec != std::errc())
         return read.ec == std::errc::result_out_of_range ? Hr::Overflow : Hr::BadLiteral;

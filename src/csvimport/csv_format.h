@@ -16,6 +16,8 @@ struct CsvFormat {
     // marks inside are kept.
     bool doubledQuotes = false;
     bool namesInFirstLine = false;
+    bool dropNuls = false;   // NUL characters are left out; without it they fail their line
+    char16_t decimal = u'.'; // of Doubles; with "," numbers may be grouped by "."
     DateFormat dates;
     QString encoding = QStringLiteral("UTF-8"); // a byte-order mark of UTF-16 or UTF-32 overrules UTF-8
 

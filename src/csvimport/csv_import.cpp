@@ -1,7 +1,12 @@
 #include "csvimport/csv_import.h"
 
+#include "csvimport/csv_reader.h"
+#include "csvimport/import_check.h"
+#include "csvimport/import_lines.h"
+#include "csvimport/import_target.h"
+#include "csvimport/reader_fault.h"
+#include "csvimport/skipped_lines.h"
 #include "csvimport/type_guess.h"
-#include "data/provider_error.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
@@ -11,142 +16,115 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+// Between two looks at the progress display, whichever comes first: lines may be long.
 constexpr qint64 kLinesPerProgress = 1024;
-
-UserMessage MessageOf(const CsvReader& reader, const QIODevice& file)
-{
-    switch (reader.LastFault()) {
-    case CsvReader::Fault::None:
-    case CsvReader::Fault::CannotRead:
-        break;
-    case CsvReader::Fault::NotText:
-        return {Str::ImportNotText, {reader.Encoding()}};
-    case CsvReader::Fault::RecordTooLong:
-        return {Str::ImportRecordTooLong, {}};
-    case CsvReader::Fault::QuoteNeverClosed:
-        return {Str::ImportQuoteNeverClosed, {}};
-    }
-    return {Str::ImportCannotRead, {file.errorString()}};
-}
+constexpr qint64 kBytesPerProgress = 4 << 20;
 
 // A failure of the reader outside of a run, with its line.
 bool TellFault(const CsvReader& reader, const QIODevice& file, UserPrompt& prompt)
 {
     prompt.Show({Str::ImportFailedOnLine,
-                 {MessageOf(reader, file).Text(), QString::number(reader.Line()), QString::number(0)}});
+                 {MessageOfFault(reader, file).Text(), QString::number(reader.Line()), QString::number(0)}});
     return false;
 }
 
-QString FromUtf8(std::string_view utf8)
-{
-    return QString::fromUtf8(utf8.data(), qsizetype(utf8.size()));
-}
-
-QStringList TextsOf(const CsvReader& reader)
-{
-    QStringList texts;
-    for (const std::string_view text : reader.Texts())
-        texts += FromUtf8(text);
-    return texts;
-}
-
-// One import under way: takes lines, hands records to the provider, knows how to name the place of a failure.
+// One import under way: hands the file's lines to the table, and names the place of a failure.
 class ImportRun {
 public:
-    ImportRun(RecordAppender& appender, QIODevice& file, const ImportPlan& plan, UserPrompt& prompt,
+    ImportRun(ImportTarget& target, QIODevice& file, const ImportPlan& plan, UserPrompt& prompt,
               ImportReport& report)
-        : appender_(appender)
-        , file_(file)
+        : target_(target)
+        , size_(file.size())
         , plan_(plan)
         , prompt_(prompt)
         , report_(report)
-        , reader_(file, plan.format)
-        , cells_(appender.Fields().size())
+        , lines_(file, plan, target.Fields())
     {
-        for (size_t i = 0; i < plan.columns.size(); ++i) {
-            if (plan.columns[i].ignored)
-                continue;
-            const ImportColumn& column = plan.columns[i];
-            const FieldType type = appender.Fields()[targets_.size()].type;
-            targets_.push_back({i, CellReader(type, column.dates.value_or(plan.format.dates), plan.longTexts)});
-        }
     }
 
-    // False when a line failed, which was told.
-    bool AppendAll()
+    // False when a line ended the run, which was told.
+    bool PutAll()
     {
-        const std::unique_ptr<Progress> progress = prompt_.StartProgress({Str::ImportProgress, {}}, file_.size());
-        const int columns = int(plan_.columns.size());
-        CsvReader::Result result = CsvReader::Result::Record;
-        if (plan_.format.namesInFirstLine)
-            result = reader_.Next(columns);
-        for (qint64 lines = 1; result == CsvReader::Result::Record; ++lines) {
-            if (lines % kLinesPerProgress == 0 && !progress->Advance(reader_.BytesConsumed())) {
-                report_.stopped = true;
-                return true;
+        const std::unique_ptr<Progress> progress = prompt_.StartProgress({Str::ImportProgress, {}}, size_);
+        qint64 shownBytes = 0;
+        for (qint64 lines = 1;; ++lines) {
+            const qint64 bytes = lines_.BytesConsumed();
+            if (lines % kLinesPerProgress == 0 || bytes - shownBytes >= kBytesPerProgress) {
+                shownBytes = bytes;
+                if (!progress->Advance(bytes)) {
+                    report_.stopped = true;
+                    return true;
+                }
             }
-            result = reader_.Next(columns);
-            if (result == CsvReader::Result::Record && !AppendLine())
-                return false;
+            switch (lines_.Next()) {
+            case ImportLines::Result::End:
+                return true;
+            case ImportLines::Result::Failed:
+                if (!Skip())
+                    return false;
+                break;
+            case ImportLines::Result::Record:
+                if (!Put())
+                    return false;
+                break;
+            }
         }
-        return result == CsvReader::Result::End || FailAt(MessageOf(reader_, file_).Text(), reader_.FaultText());
     }
 
-    void CountWhatWasCut()
+    // The file of skipped lines is whole before the records are: none is in neither.
+    bool Finish()
     {
-        for (const Target& target : targets_) {
-            report_.cutTexts += target.reader.CutTexts();
-            report_.cutNumbers += target.reader.CutNumbers();
+        lines_.CountWhatWasCut(report_);
+        if (!skipped_ || skipped_->Commit()) {
+            report_.skipped = skipped_ ? skipped_->Count() : 0;
+            return true;
         }
+        prompt_.Show({Str::FileWriteFail, {plan_.skipTo, skipped_->ErrorText()}});
+        return false;
     }
 
 private:
-    struct Target {
-        size_t column; // of the file
-        CellReader reader;
-    };
-
-    bool AppendLine()
+    bool Put()
     {
-        const std::span<const std::string_view> texts = reader_.Texts();
-        // An empty line is a record only where a record may be an empty line.
-        if (texts.empty() && plan_.columns.size() > 1)
-            return true;
-        for (size_t i = 0; i < targets_.size(); ++i) {
-            Target& target = targets_[i];
-            cells_[i] = Cell();
-            if (target.column >= texts.size())
-                continue;
-            const Hr read = target.reader.Read(texts[target.column], cells_[i]);
-            if (Failed(read))
-                return FailAt(ReadingError(target.reader.Type(), read), int(target.column));
-        }
-        const Hr appended = appender_.Append(cells_);
-        if (!Failed(appended)) {
+        switch (target_.Put(lines_.Cells(), lines_.Line())) {
+        case ImportTarget::Taken::Added:
             ++report_.records;
             return true;
+        case ImportTarget::Taken::Updated:
+            ++report_.updated;
+            return true;
+        case ImportTarget::Taken::Superseded:
+            return true;
+        case ImportTarget::Taken::Refused:
+            break;
         }
-        const int refused = appender_.RefusedField();
-        const bool isKnown = refused >= 0 && size_t(refused) < targets_.size();
-        return FailAt(ProviderErrorText(nullptr, appended, appender_.ErrorContext()),
-                      isKnown ? int(targets_[size_t(refused)].column) : -1);
+        lines_.Refuse(target_.ErrorText(), target_.RefusedField());
+        return Skip();
     }
 
-    static QString ReadingError(FieldType type, Hr read)
+    bool Skip()
     {
-        return type == FieldType::Date ? StringText(Str::InvalidDateTime) : ProviderErrorText(nullptr, read, {});
+        const LineFailure failure = lines_.Failure();
+        if (plan_.skipTo.isEmpty() || !lines_.StepOver())
+            return Tell(failure);
+        if (!skipped_)
+            skipped_.emplace(plan_.skipTo, lines_.ByteOrderMark());
+        if (skipped_->Add(lines_.RawLine()))
+            return true;
+        prompt_.Show({Str::FileWriteFail, {plan_.skipTo, skipped_->ErrorText()}});
+        return Tell(failure);
     }
 
-    // Tells why and where; column -1: the line as a whole.
-    bool FailAt(const QString& why, int column)
+    bool Tell(const LineFailure& failure)
     {
-        const QString line = QString::number(reader_.Line());
-        const QString records = QString::number(report_.records);
-        if (column < 0 || size_t(column) >= plan_.columns.size())
-            prompt_.ShowError(StringText(Str::ImportFailedOnLine, {why, line, records}));
+        const QString line = QString::number(failure.line);
+        const QString records = QString::number(report_.records + report_.updated);
+        if (failure.column < 0 || size_t(failure.column) >= plan_.columns.size())
+            prompt_.ShowError(StringText(Str::ImportFailedOnLine, {failure.why, line, records}));
         else
-            prompt_.ShowError(StringText(Str::ImportFailedAt, {why, line, QString::number(column + 1),
-                                                               NameOfColumn(size_t(column)), records}));
+            prompt_.ShowError(
+                StringText(Str::ImportFailedAt, {failure.why, line, QString::number(failure.column + 1),
+                                                 NameOfColumn(size_t(failure.column)), records}));
         return false;
     }
 
@@ -155,27 +133,60 @@ private:
         return plan_.columns[column].ignored ? u"-"_s : plan_.columns[column].field;
     }
 
-    RecordAppender& appender_;
-    QIODevice& file_;
+    ImportTarget& target_;
+    qint64 size_;
     const ImportPlan& plan_;
     UserPrompt& prompt_;
     ImportReport& report_;
-    CsvReader reader_;
-    std::vector<Target> targets_; // in the order of the appender's fields
-    std::vector<Cell> cells_;
+    ImportLines lines_;
+    std::optional<SkippedLines> skipped_;
 };
 
-QStringList FieldsToFill(const ImportColumns& columns)
+// Takes the file's lines into the target's keys. False when nothing is to be written, which was told or is in the
+// report.
+bool CountKeys(KeyedTarget& target, QIODevice& file, const ImportPlan& plan, UserPrompt& prompt,
+               ImportReport& report, const std::optional<KeyCounts>& confirmed)
 {
-    QStringList fields;
-    for (const ImportColumn& column : columns) {
-        if (!column.ignored)
-            fields += column.field;
+    using OnFailure = ImportCheck::OnFailure;
+    ImportCheck check(file, plan, target.Fields(), &target.Keys(),
+                      plan.skipTo.isEmpty() ? OnFailure::Stop : OnFailure::GoOn);
+    {
+        const std::unique_ptr<Progress> progress =
+            prompt.StartProgress({Str::ImportScanProgress, {}}, file.size());
+        while (check.Step(kLinesPerProgress)) {
+            if (!progress->Advance(check.BytesConsumed())) {
+                report.stopped = true;
+                return false;
+            }
+        }
     }
-    return fields;
+    if (check.LineOfSeveral() > 0) {
+        prompt.Show({Str::ImportKeyOfSeveral, {QString::number(check.LineOfSeveral())}});
+        return false;
+    }
+    report.otherCounts = confirmed && *confirmed != target.Keys().Counts();
+    if (report.otherCounts)
+        return false;
+    if (file.seek(0))
+        return true;
+    prompt.Show({Str::ImportCannotRead, {file.errorString()}});
+    return false;
 }
 
 } // namespace
+
+UserMessage ImportReport::Count() const
+{
+    const QString added = QString::number(records);
+    const QString changed = QString::number(updated);
+    if (keyed && skips)
+        return {Str::RecordsImportedUpdatedSkipped, {added, changed, QString::number(skipped)}};
+    if (keyed)
+        return {Str::RecordsImportedUpdated, {added, changed}};
+    if (skips)
+        return {Str::RecordsImportedSkipped, {added, QString::number(skipped)}};
+    return {Str::RecordsImported, {added}};
+}
 
 std::vector<UserMessage> ImportReport::Warnings() const
 {
@@ -194,7 +205,7 @@ bool ReadFirstLine(QIODevice& file, const CsvFormat& format, QStringList& texts,
     const CsvReader::Result result = reader.Next();
     if (result == CsvReader::Result::Fault)
         return TellFault(reader, file, prompt);
-    texts = TextsOf(reader);
+    texts = TextsOf(reader.Texts());
     return true;
 }
 
@@ -203,8 +214,8 @@ bool GuessColumns(QIODevice& file, const CsvFormat& format, ImportColumns& colum
     const std::unique_ptr<Progress> progress = prompt.StartProgress({Str::ImportScanProgress, {}}, file.size());
     CsvReader reader(file, format);
     CsvReader::Result result = reader.Next();
-    const QStringList first = result == CsvReader::Result::Record ? TextsOf(reader) : QStringList();
-    std::vector<TypeGuess> guesses(size_t(first.size()), TypeGuess(format.dates));
+    const QStringList first = result == CsvReader::Result::Record ? TextsOf(reader.Texts()) : QStringList();
+    std::vector<TypeGuess> guesses(size_t(first.size()), TypeGuess(format.dates, format.decimal));
     if (result == CsvReader::Result::Record && format.namesInFirstLine)
         result = reader.Next(int(std::max<size_t>(guesses.size(), 1)));
     for (qint64 lines = 1; result == CsvReader::Result::Record; ++lines) {
@@ -228,26 +239,32 @@ bool GuessColumns(QIODevice& file, const CsvFormat& format, ImportColumns& colum
 }
 
 bool ImportCsv(DbConnection& connection, const DatabaseLocation& database, QIODevice& file, const ImportPlan& plan,
-               UserPrompt& prompt, ImportReport& report)
+               UserPrompt& prompt, ImportReport& report, const std::optional<KeyCounts>& confirmed)
 {
-    report = {};
-    Hr result = Hr::Unexpected;
-    QString context;
-    const std::unique_ptr<RecordAppender> appender =
-        connection.Provider() ? connection.Provider()->CreateAppender(database, plan.table,
-                                                                      FieldsToFill(plan.columns), result, context)
-                              : nullptr;
-    if (!appender) {
-        prompt.ShowError(ProviderErrorText(nullptr, result, context));
+    report = {.keyed = !plan.key.isEmpty(), .skips = !plan.skipTo.isEmpty()};
+    QString fault;
+    std::unique_ptr<ImportTarget> target;
+    if (report.keyed) {
+        std::unique_ptr<KeyedTarget> keyed = KeyedTarget::Open(connection, database, plan, fault);
+        if (keyed && !CountKeys(*keyed, file, plan, prompt, report, confirmed))
+            return false;
+        target = std::move(keyed);
+    } else {
+        target = AppendTarget::Open(connection, database, plan, fault);
+    }
+    if (!target) {
+        prompt.ShowError(fault);
         return false;
     }
-    ImportRun run(*appender, file, plan, prompt, report);
-    const bool complete = run.AppendAll();
-    run.CountWhatWasCut();
-    const Hr committed = appender->Commit();
-    if (!Failed(committed))
+    ImportRun run(*target, file, plan, prompt, report);
+    const bool complete = run.PutAll();
+    if (!run.Finish()) {
+        report.records = report.updated = 0;
+        return false;
+    }
+    if (!Failed(target->Commit()))
         return complete;
-    prompt.ShowError(ProviderErrorText(nullptr, committed, appender->ErrorContext()));
+    prompt.ShowError(target->ErrorText());
     report = {};
     return false;
 }

@@ -11,10 +11,36 @@ namespace {
 constexpr size_t kFirstBufferBytes = 256 * 1024;
 constexpr size_t kNone = std::string_view::npos;
 
-bool IsPlainText(std::string_view bytes)
+bool HasNul(std::string_view bytes)
 {
-    return std::memchr(bytes.data(), 0, bytes.size()) == nullptr &&
-           QByteArrayView(bytes.data(), qsizetype(bytes.size())).isValidUtf8();
+    return !bytes.empty() && std::memchr(bytes.data(), 0, bytes.size()) != nullptr;
+}
+
+bool IsUtf8(std::string_view bytes)
+{
+    return QByteArrayView(bytes.data(), qsizetype(bytes.size())).isValidUtf8();
+}
+
+// Each writes what is left of a text to `room`, which it moves behind it.
+std::string_view UndoPairs(std::string_view text, const Utf8Mark& mark, char*& room)
+{
+    char* const begin = room;
+    for (size_t at = 0; at < text.size();) {
+        const size_t pair = mark.Find(text, at);
+        const size_t next = pair == kNone ? text.size() : pair + mark.Length();
+        room = std::copy(text.begin() + ptrdiff_t(at), text.begin() + ptrdiff_t(next), room);
+        at = next;
+        if (mark.Begins(text.substr(at)))
+            at += mark.Length();
+    }
+    return {begin, size_t(room - begin)};
+}
+
+std::string_view WithoutNuls(std::string_view text, char*& room)
+{
+    char* const begin = room;
+    room = std::remove_copy(text.begin(), text.end(), room, '\0');
+    return {begin, size_t(room - begin)};
 }
 
 } // namespace
@@ -44,6 +70,8 @@ CsvReader::CsvReader(QIODevice& device, const CsvFormat& format)
     , separator_(format.separator)
     , quote_(format.quote)
     , doubledQuotes_(format.doubledQuotes && format.quote != 0)
+    , spansLines_(doubledQuotes_)
+    , dropNuls_(format.dropNuls)
     , buffer_(kFirstBufferBytes)
 {
     if (format.quote != 0)
@@ -58,9 +86,43 @@ CsvReader::Result CsvReader::Next(int maxTexts)
 {
     Q_ASSERT(maxTexts > 0 && maxTexts <= kMaxTexts);
     const bool cut = fault_ == Fault::None && ReadLine() && CutRecord(size_t(maxTexts));
-    if (cut)
+    if (cut && (isText_ || NameNotText()))
         return Result::Record;
     return fault_ == Fault::None ? Result::End : Result::Fault;
+}
+
+bool CsvReader::StepOverFault()
+{
+    if (fault_ == Fault::None || fault_ == Fault::CannotRead || source_.IsMalformed())
+        return false;
+    if (fault_ != Fault::NotText) {
+        // What was taken for one long text: its first line is at fault, the others are read by themselves. There
+        // is no closing mark behind it, so looking for one again from each line would be of no use.
+        const std::string_view record = Record();
+        const size_t lineEnd = std::min(record.find_first_of("\r\n"), record.size());
+        if (fault_ == Fault::RecordTooLong && lineEnd == record.size())
+            return false;
+        recordEnd_ = recordAt_ + lineEnd;
+        lfAt_ = recordEnd_;
+        linesRead_ = line_;
+        spansLines_ = false;
+    }
+    fault_ = Fault::None;
+    return true;
+}
+
+std::string_view CsvReader::RawRecord()
+{
+    texts_.clear();
+    size_t end = recordEnd_;
+    if (end < filled_) {
+        const size_t length = end - recordAt_; // looking ahead may move the record
+        const bool isCr = buffer_[end] == '\r';
+        const bool hasMore = end + 1 < filled_ || (isCr && Fill());
+        end = recordAt_ + length + 1;
+        end += size_t(isCr && hasMore && buffer_[end] == '\n');
+    }
+    return {buffer_.data() + recordAt_, end - recordAt_};
 }
 
 bool CsvReader::Stop(Fault fault)
@@ -76,9 +138,12 @@ bool CsvReader::ReadLine()
     recordAt_ = recordEnd_;
     line_ = ++linesRead_;
     faultText_ = 0;
+    isText_ = true;
+    hasNuls_ = false;
     if (!FindLineEnd())
         return false;
-    return (recordEnd_ > recordAt_ || recordEnd_ < filled_) && CheckText(0);
+    CheckText(0);
+    return recordEnd_ > recordAt_ || recordEnd_ < filled_;
 }
 
 bool CsvReader::AppendLine()
@@ -88,17 +153,23 @@ bool CsvReader::AppendLine()
     ++linesRead_;
     if (!FindLineEnd())
         return false;
-    return (recordEnd_ - recordAt_ > from || recordEnd_ < filled_) && CheckText(from);
+    CheckText(from);
+    return recordEnd_ - recordAt_ > from || recordEnd_ < filled_;
 }
 
-bool CsvReader::CheckText(size_t from)
+// Told once the record is cut: only then is it known how far it goes.
+void CsvReader::CheckText(size_t from)
 {
-    if (IsPlainText(Record().substr(from)))
-        return true;
-    Stop(Fault::NotText);
-    if (from == 0 && CutRecord(kMaxTexts))
-        faultText_ = int(std::ranges::find_if_not(texts_, IsPlainText) - texts_.begin());
-    return false;
+    const std::string_view bytes = Record().substr(from);
+    hasNuls_ = hasNuls_ || HasNul(bytes);
+    isText_ = isText_ && (dropNuls_ || !hasNuls_) && IsUtf8(bytes);
+}
+
+bool CsvReader::NameNotText()
+{
+    const auto isText = [this](std::string_view text) { return IsUtf8(text) && (dropNuls_ || !HasNul(text)); };
+    faultText_ = int(std::ranges::find_if_not(texts_, isText) - texts_.begin());
+    return Stop(Fault::NotText);
 }
 
 void CsvReader::StepOverLineEnd()
@@ -175,11 +246,13 @@ bool CsvReader::CutRecord(size_t maxTexts)
             for (std::string_view& text : texts_)
                 text = {text.data() + moved, text.size()};
         }
-        texts_.push_back(WithoutMarks(from, end));
+        texts_.push_back(Record().substr(from, end - from));
         if (end == Record().size())
-            return true;
+            break;
         from = end + separator_.Length();
     }
+    CleanTexts();
+    return true;
 }
 
 size_t CsvReader::FindTextEnd(size_t from, bool last)
@@ -223,34 +296,41 @@ size_t CsvReader::FindDoubledClosing(size_t from)
         if (closing != kNone)
             return closing;
         from = Record().size(); // every mark up to here is one of a pair, or inside
-        if (!AppendLine()) {
+        if (!spansLines_ || !AppendLine()) {
             Stop(Fault::QuoteNeverClosed);
             return kNone;
         }
     }
 }
 
-std::string_view CsvReader::WithoutMarks(size_t from, size_t end)
+std::string_view CsvReader::WithoutMarks(std::string_view text) const
 {
-    std::string_view text = Record().substr(from, end - from);
     if (text.size() < 2 * quote_.Length() || !quote_.Begins(text) || !quote_.Ends(text))
         return text;
-    text = text.substr(quote_.Length(), text.size() - 2 * quote_.Length());
-    if (!doubledQuotes_)
-        return text;
-    // The bytes are the reader's own: the pairs shrink where they stand.
-    char* const first = buffer_.data() + recordAt_ + from + quote_.Length();
-    size_t kept = 0;
-    for (size_t at = 0; at < text.size();) {
-        const size_t pair = quote_.Find(text, at);
-        const size_t next = pair == kNone ? text.size() : pair + quote_.Length();
-        std::memmove(first + kept, text.data() + at, next - at);
-        kept += next - at;
-        at = next;
-        if (quote_.Begins(text.substr(at)))
-            at += quote_.Length();
+    return text.substr(quote_.Length(), text.size() - 2 * quote_.Length());
+}
+
+// Takes the marks off. A text that then differs from the bytes of the record is written beside them: the record
+// itself stays as it is in the file.
+void CsvReader::CleanTexts()
+{
+    char* room = nullptr;
+    for (std::string_view& text : texts_) {
+        const std::string_view bare = WithoutMarks(text);
+        const bool hasPairs = doubledQuotes_ && bare.size() < text.size() && quote_.Find(bare, 0) != kNone;
+        text = bare;
+        if (!hasPairs && !hasNuls_)
+            continue;
+        if (!room) {
+            const size_t passes = hasNuls_ ? 2 : 1;
+            cleaned_.resize(std::max(cleaned_.size(), passes * Record().size()));
+            room = cleaned_.data();
+        }
+        if (hasPairs)
+            text = UndoPairs(text, quote_, room);
+        if (hasNuls_ && dropNuls_ && HasNul(text))
+            text = WithoutNuls(text, room);
     }
-    return {first, kept};
 }
 
 } // namespace mirel

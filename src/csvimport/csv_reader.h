@@ -45,21 +45,28 @@ private:
 // stands inside a text, is an ordinary character (O'Brien, 5"). With doubled quotation marks only the format's
 // mark encloses, and one that is never closed is a fault.
 //
-// Memory does not grow with the file: a record may have kMaxRecordBytes. The device is open for reading and
-// outlives the reader.
+// Memory does not grow with the file, only with its longest record, which may have kMaxRecordBytes. The device is
+// open for reading and outlives the reader.
 class CsvReader {
 public:
     enum class Result { Record, End, Fault };
     enum class Fault { None, CannotRead, NotText, RecordTooLong, QuoteNeverClosed };
 
-    static constexpr size_t kMaxRecordBytes = 16 * 1024 * 1024;
+    static constexpr size_t kMaxRecordBytes = 64 * 1024 * 1024;
     static constexpr int kMaxTexts = 4096;
 
     CsvReader(QIODevice& device, const CsvFormat& format);
 
     // Reads the next record and cuts it into at most `maxTexts`, of which the last takes the rest of the record.
-    // Nothing more is to be read after End or Fault.
+    // Nothing more is to be read after End, nor after Fault unless StepOverFault succeeds.
     [[nodiscard]] Result Next(int maxTexts = kMaxTexts);
+
+    // Gives the failing record up, so that Next reads the one behind it. Of a text that is never closed that is
+    // the next line, and from there on no text goes on over line ends. False where nothing more can be read.
+    [[nodiscard]] bool StepOverFault();
+
+    // The record as it is in the file (in UTF-8), with its line end. Ends the texts' life.
+    std::string_view RawRecord();
 
     // The texts of the record, without the format's quotation marks around them; good until the next call.
     // An empty line has none.
@@ -69,6 +76,7 @@ public:
     int FaultText() const { return faultText_; } // which text of the record was at fault, from 0
     qint64 BytesConsumed() const { return source_.BytesConsumed(); }
     const QString& Encoding() const { return source_.Encoding(); }
+    bool HasByteOrderMark() const { return source_.HasByteOrderMark(); }
 
 private:
     // Each is false at the end and at a fault; fault_ tells which.
@@ -77,7 +85,8 @@ private:
     [[nodiscard]] bool FindLineEnd();
     [[nodiscard]] bool Fill();
     void StepOverLineEnd();
-    bool CheckText(size_t from); // the bytes from there to the record's end
+    void CheckText(size_t from); // the bytes from there to the record's end
+    bool NameNotText();          // the fault of a record whose bytes are no text
     bool Stop(Fault fault);
 
     [[nodiscard]] bool CutRecord(size_t maxTexts);
@@ -85,7 +94,8 @@ private:
     [[nodiscard]] size_t FindTextEnd(size_t from, bool last);
     [[nodiscard]] size_t FindDoubledClosing(size_t from);
     size_t FindClosing(const Utf8Mark& mark, size_t from) const;
-    std::string_view WithoutMarks(size_t from, size_t end);
+    std::string_view WithoutMarks(std::string_view text) const;
+    void CleanTexts();
     std::string_view Record() const { return {buffer_.data() + recordAt_, recordEnd_ - recordAt_}; }
 
     struct EnclosingMark {
@@ -98,6 +108,8 @@ private:
     Utf8Mark quote_;
     std::vector<EnclosingMark> enclosing_;
     bool doubledQuotes_;
+    bool spansLines_;
+    bool dropNuls_;
 
     std::vector<char> buffer_;
     size_t recordAt_ = 0;  // the record's first byte
@@ -106,6 +118,9 @@ private:
     size_t lfAt_ = 0;      // no LF stands between the record's end and here
     bool sourceEnded_ = false;
     std::vector<std::string_view> texts_;
+    std::vector<char> cleaned_; // the texts that are not in the buffer as they are meant
+    bool isText_ = true;        // of the record's bytes
+    bool hasNuls_ = false;
     qint64 line_ = 0;
     qint64 linesRead_ = 0;
     Fault fault_ = Fault::None;

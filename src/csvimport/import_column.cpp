@@ -3,6 +3,7 @@
 #include "data/field_names.h"
 #include "data/table_statements.h"
 #include "resources/string_table.h"
+#include "tableeditor/table_design.h"
 
 #include <algorithm>
 #include <array>
@@ -114,11 +115,14 @@ QString NumberedName(int number)
     return u"Field%1"_s.arg(number);
 }
 
+constexpr qsizetype kRoomForNumber = 5; // " 1234", of a name that occurs again
+
 // Brackets enclose names in statements, and control characters are of no use in one.
 QString FitName(const QString& name, int number)
 {
     QString fit = name.simplified();
     fit.replace(u'[', u'(').replace(u']', u')').remove(QChar(0));
+    fit = fit.left(kMaxNewFieldName - kRoomForNumber).trimmed();
     return fit.isEmpty() || fit == u"-" ? NumberedName(number) : fit;
 }
 

@@ -35,7 +35,7 @@ using ImportColumns = std::vector<ImportColumn>;
 // contain "," and ":". A column without a type is a Text of 255.
 [[nodiscard]] bool ParseColumnList(const QString& list, ImportColumns& columns, UserMessage& fault);
 
-// Columns of a new table, named by the file's first line; unusable names are adapted.
+// Columns of a new table, named by the file's first line; unusable names (empty, twice, too long) are adapted.
 ImportColumns ColumnsNamed(const QStringList& names);
 // "Field1", "Field2", … of Text 255.
 ImportColumns NumberedColumns(int count);

@@ -94,8 +94,14 @@ void TypeGuess::Add(std::string_view text)
     empty_ = false;
     if (text.size() > size_t(longest_))
         longest_ = std::max(longest_, Utf16Length(text));
-    if (mayBeDouble_)
-        NarrowNumber(Trimmed(text));
+    mayBeYesNo_ = mayBeYesNo_ && (text == "0" || text == "1");
+    if (mayBeDouble_ || mayBeComma_) {
+        const std::string_view trimmed = Trimmed(text);
+        if (mayBeComma_)
+            NarrowComma(trimmed);
+        if (mayBeDouble_)
+            NarrowNumber(trimmed);
+    }
     if (mayBeDate_ || mayBeIsoDate_)
         NarrowDate(text);
 }
@@ -105,6 +111,24 @@ void TypeGuess::NarrowNumber(std::string_view text)
     const NumberShape shape = ShapeOf(text);
     mayBeDouble_ = shape != NumberShape::None;
     mayBeInteger_ = mayBeInteger_ && shape == NumberShape::Integer && FitsInteger(text);
+}
+
+void TypeGuess::NarrowComma(std::string_view text)
+{
+    constexpr size_t kGroup = 3;
+    std::array<char, kMaxCommaNumber> plain{};
+    size_t length = 0;
+    size_t end = 0;
+    mayBeComma_ = !text.starts_with('+') && ReadCommaNumber(text, plain, length, end) && end == text.size() &&
+                  ShapeOf({plain.data(), length}) != NumberShape::None;
+    if (!mayBeComma_)
+        return;
+    const size_t comma = text.find(',');
+    if (comma == std::string_view::npos)
+        return;
+    const size_t whole = comma - size_t(text.starts_with('-'));
+    isSurelyComma_ = isSurelyComma_ || text.size() - comma - 1 != kGroup || whole > kGroup ||
+                     (whole == 1 && text[comma - 1] == '0') || text.find('.') < comma;
 }
 
 void TypeGuess::NarrowDate(std::string_view text)
@@ -120,8 +144,10 @@ ImportColumn TypeGuess::Column() const
     ImportColumn column;
     if (empty_)
         return column;
-    column.type = mayBeInteger_                 ? FieldType::Integer
-                  : mayBeDouble_                ? FieldType::Double
+    const bool isDouble = decimal_ == u',' ? mayBeComma_ : mayBeDouble_;
+    column.type = mayBeYesNo_                   ? FieldType::YesNo
+                  : mayBeInteger_               ? FieldType::Integer
+                  : isDouble                    ? FieldType::Double
                   : mayBeDate_ || mayBeIsoDate_ ? FieldType::Date
                   : longest_ > kMaxTextSize     ? FieldType::Memo
                                                 : FieldType::Text;

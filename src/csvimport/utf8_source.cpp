@@ -47,6 +47,13 @@ bool Utf8Source::IsKnownEncoding(const QString& encoding)
     return IsUtf8(encoding) || QStringDecoder(encoding.toLatin1().constData()).isValid();
 }
 
+QString Utf8Source::EncodingOfMark(QByteArrayView start)
+{
+    const auto mark = std::ranges::find_if(
+        kByteOrderMarks, [start](const ByteOrderMark& each) { return start.startsWith(each.bytes); });
+    return mark == kByteOrderMarks.end() ? QString() : QString(mark->encoding);
+}
+
 qint64 Utf8Source::Read(char* to, qint64 room)
 {
     if (!started_)
@@ -96,6 +103,7 @@ void Utf8Source::DetectByteOrderMark()
         pending_ = start;
         return;
     }
+    hasMark_ = true;
     start.remove(0, mark->bytes.size());
     pending_ = start;
     if (IsUtf8(mark->encoding))

@@ -18,6 +18,8 @@ public:
     Utf8Source(QIODevice& device, const QString& encoding);
 
     static bool IsKnownEncoding(const QString& encoding);
+    // The encoding whose byte-order mark a file begins with; empty: none.
+    static QString EncodingOfMark(QByteArrayView start);
 
     // Puts up to `room` bytes at `to`: how many, 0 at the end, -1 when the device failed or its bytes are no
     // text in the encoding. `room` is not 0.
@@ -25,6 +27,7 @@ public:
     bool IsMalformed() const { return malformed_; }       // tells the second failure from the first
     qint64 BytesConsumed() const { return consumed_; }    // of the device, for a progress display
     const QString& Encoding() const { return encoding_; } // the one in use
+    bool HasByteOrderMark() const { return hasMark_; }    // once something was read
 
 private:
     [[nodiscard]] qint64 ReadRaw(char* to, qint64 room);
@@ -40,6 +43,7 @@ private:
     qint64 consumed_ = 0;
     bool started_ = false;
     bool malformed_ = false;
+    bool hasMark_ = false;
 };
 
 } // namespace mirel

@@ -3,8 +3,11 @@
 #include "data/provider_error.h"
 #include "platform/shared_file.h"
 #include "resources/string_table.h"
+#include "tableview/html_records.h"
+#include "tableview/json_records.h"
 
 #include <QBuffer>
+#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
 #include <QSaveFile>
@@ -45,19 +48,58 @@ private:
     qint64 waiting_ = 0; // behind them
 };
 
-} // namespace
+// The file that an export writes, under its name once it is whole. One that replaces another is on disk before it
+// does; for a new one nobody has to wait for the disk.
+class ExportFile {
+public:
+    explicit ExportFile(const QString& path)
+        : path_(path)
+        , replaces_(QFileInfo::exists(path))
+        , replacement_(path)
+        , fresh_(path + u".%1.part"_s.arg(QCoreApplication::applicationPid()))
+    {
+    }
+    ~ExportFile()
+    {
+        if (unfinished_)
+            fresh_.remove();
+    }
+    Q_DISABLE_COPY_MOVE(ExportFile)
 
-CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
-                          Progress* progress)
+    bool Open()
+    {
+        if (replaces_)
+            return replacement_.open(QIODevice::WriteOnly);
+        unfinished_ = fresh_.open(QIODevice::WriteOnly | QIODevice::NewOnly | QIODevice::Unbuffered);
+        return unfinished_;
+    }
+    QIODevice& Device() { return replaces_ ? static_cast<QIODevice&>(replacement_) : fresh_; }
+
+    bool Commit()
+    {
+        if (replaces_)
+            return replacement_.commit();
+        // Never over a file that came there meanwhile.
+        unfinished_ = fresh_.error() != QFileDevice::NoError || !fresh_.rename(path_);
+        return !unfinished_;
+    }
+
+private:
+    QString path_;
+    bool replaces_;
+    EagerFile replacement_;
+    QFile fresh_;
+    bool unfinished_ = false; // the new file is there, under a name for the time being
+};
+
+// Walks the records. `take` is false when the device takes no more; `finish` says whether all of it was written.
+template <typename Take, typename Finish>
+CsvExportResult Walk(DbRecordset& source, Progress* progress, Take take, Finish finish)
 {
     using Ending = CsvExportResult::Ending;
-    CsvWriter writer(device, options, source.Fields());
-    if (options.header)
-        writer.WriteHeader();
-
     CsvExportResult result;
     const bool read = source.Read({}, [&](std::span<const Cell> cells) {
-        if (!writer.WriteRecord(cells)) {
+        if (!take(cells)) {
             result.ending = Ending::WriteFailed;
             return false;
         }
@@ -70,9 +112,57 @@ CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, 
     });
     if (!read)
         result.ending = Ending::ReadFailed;
-    if (!writer.Finish())
+    if (!finish())
         result.ending = Ending::WriteFailed;
     return result;
+}
+
+// The records of a writer that appends to a text.
+template <typename Records>
+CsvExportResult WriteRecords(Records& records, DbRecordset& source, std::string start, QIODevice& device,
+                             Progress* progress)
+{
+    constexpr size_t kPieceBytes = size_t(1) << 20;
+    std::string pending = std::move(start);
+    const auto flush = [&] {
+        const bool written = device.write(pending.data(), qint64(pending.size())) == qint64(pending.size());
+        pending.clear();
+        return written;
+    };
+    return Walk(
+        source, progress,
+        [&](std::span<const Cell> cells) {
+            records.Record(cells, pending);
+            return pending.size() < kPieceBytes || flush();
+        },
+        [&] {
+            records.End(pending);
+            return flush();
+        });
+}
+
+} // namespace
+
+CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
+                          Progress* progress)
+{
+    std::string start;
+    if (options.kind == ExportKind::Json) {
+        JsonRecords records(JsonRecords::Shape::Array, source.Fields());
+        records.Begin(start);
+        return WriteRecords(records, source, std::move(start), device, progress);
+    }
+    if (options.kind == ExportKind::Html) {
+        HtmlRecords records(options.dates, options.words, source.Fields());
+        records.Begin(options.title, start);
+        return WriteRecords(records, source, std::move(start), device, progress);
+    }
+    CsvWriter writer(device, options, source.Fields());
+    if (options.header)
+        writer.WriteHeader();
+    return Walk(
+        source, progress, [&](std::span<const Cell> cells) { return writer.WriteRecord(cells); },
+        [&] { return writer.Finish(); });
 }
 
 std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions& options, const CsvTarget& target,
@@ -80,8 +170,8 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
 {
     using Ending = CsvExportResult::Ending;
     const QString path = QDir::toNativeSeparators(target.path);
-    EagerFile file(target.path);
-    if (IsSameFile(target.path, target.database) || !file.open(QIODevice::WriteOnly)) {
+    ExportFile file(target.path);
+    if (IsSameFile(target.path, target.database) || !file.Open()) {
         prompt.Show({Str::FileCreationFail, {path}});
         return {};
     }
@@ -90,7 +180,7 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
         constexpr int kAsk = -1;
         const qint64 total = source.CountStep(kAsk) ? source.RecordCount() : kUnknownTotal;
         const std::unique_ptr<Progress> progress = prompt.StartProgress({Str::ExportingRecords, {}}, total);
-        result = ExportCsv(source, options, file, progress.get());
+        result = target.write(source, options, file.Device(), progress.get());
     } // the display goes before a message comes
     if (result.ending == Ending::ReadFailed) {
         ReportProviderError(prompt, &source, source.LastResult());
@@ -98,18 +188,39 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
     }
     if (result.ending == Ending::Stopped && target.onStop == OnStop::Discard)
         return {};
-    if (result.ending == Ending::WriteFailed || !file.commit()) {
-        prompt.Show({Str::FileWriteFail, {path, file.errorString()}});
+    if (result.ending == Ending::WriteFailed || !file.Commit()) {
+        prompt.Show({Str::FileWriteFail, {path, file.Device().errorString()}});
         return {};
     }
     prompt.Show({Str::RecordsExported, {QString::number(result.records)}});
     return result.records;
 }
 
+// The first lines of a text that is no CSV; a document has none.
+static QStringList PreviewText(DbRecordset& source, const CsvExportOptions& options, int maxLines)
+{
+    std::string text;
+    JsonRecords json(JsonRecords::Shape::Array, source.Fields());
+    HtmlRecords html(options.dates, options.words, source.Fields());
+    if (options.kind == ExportKind::Pdf)
+        return {};
+    options.kind == ExportKind::Json ? json.Begin(text) : html.Begin(options.title, text);
+    const bool read = source.Read({.count = maxLines}, [&](std::span<const Cell> cells) {
+        options.kind == ExportKind::Json ? json.Record(cells, text) : html.Record(cells, text);
+        return true;
+    });
+    const QStringList lines = QString::fromStdString(text).split(u'\n');
+    return read ? lines.first(std::min(lines.size(), qsizetype(maxLines))) + QStringList{u"....."_s}
+                : QStringList();
+}
+
 QStringList PreviewCsv(DbRecordset& source, const CsvExportOptions& options, int maxLines)
 {
     CsvExportOptions shown = options;
     shown.encoding = "UTF-8";
+    shown.byteOrderMark = false;
+    if (options.kind != ExportKind::Csv)
+        return PreviewText(source, options, maxLines);
     QBuffer device;
     device.open(QIODevice::WriteOnly);
     CsvWriter writer(device, shown, source.Fields());

@@ -24,10 +24,14 @@ struct CsvExportResult {
     qint64 records = 0; // written, the header line not counted
 };
 
-// Writes all records of an open result, in its order, to an open device. The current record stays where it is.
-// `progress` may be null; it counts records.
+// Writes all records of an open result, in its order, to an open device, as the options' kind says (a document as
+// CSV). The current record stays where it is. `progress` may be null; it counts records.
 CsvExportResult ExportCsv(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
                           Progress* progress);
+
+// What writes the records of a result: ExportCsv, or what the window has for documents.
+using ExportFunction = CsvExportResult (*)(DbRecordset& source, const CsvExportOptions& options, QIODevice& device,
+                                           Progress* progress);
 
 enum class OnStop { KeepWritten, Discard };
 
@@ -35,6 +39,7 @@ struct CsvTarget {
     QString path;
     QString database; // whose records these are: the one file that an export never replaces
     OnStop onStop = OnStop::KeepWritten;
+    ExportFunction write = ExportCsv;
 };
 
 // The same into a file, with progress and the messages of its end. An existing file is replaced in one step once

@@ -41,6 +41,18 @@ CsvWriter::CsvWriter(QIODevice& device, const CsvExportOptions& options, std::sp
     , encoder_(options.encoding.constData())
 {
     pending_.resize(kFlushSizeBytes + (1 << 16));
+    if (options.byteOrderMark)
+        WriteByteOrderMark();
+}
+
+void CsvWriter::WriteByteOrderMark()
+{
+    const QStringView mark = u"\uFEFF";
+    const QByteArray name = options_.encoding.toUpper();
+    if (plainUtf8_)
+        ok_ = device_.write(mark.toUtf8()) > 0;
+    else if (name.startsWith("UTF-16") || name.startsWith("UTF-32"))
+        ok_ = device_.write(QByteArray(encoder_.encode(mark))) > 0;
 }
 
 bool CsvWriter::KnowsEncoding(const QByteArray& name)

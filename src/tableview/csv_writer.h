@@ -2,6 +2,7 @@
 
 #include "expr/date_format.h"
 #include "platform/cell.h"
+#include "platform/yes_no_words.h"
 #include "provider/provider.h"
 #include "tableview/date_texts.h"
 
@@ -17,8 +18,12 @@ class QIODevice;
 
 namespace mirel {
 
+// What an export writes. A document is made where there are fonts: in the window.
+enum class ExportKind { Csv, Json, Html, Pdf };
+
 // How an exported file is written. The defaults are those of the export dialog.
 struct CsvExportOptions {
+    ExportKind kind = ExportKind::Csv; // the others have no separators, marks and encodings to choose
     QChar separator = u',';
     bool header = false; // the field names in the first line
     QChar quote = u'"';  // around every text; null: none
@@ -26,6 +31,9 @@ struct CsvExportOptions {
     bool doubledQuotes = false;    // a quotation mark inside a text is doubled; else it is written as it is, and
                                    // a reader of the file must cope with it
     QByteArray encoding = "UTF-8"; // what it lacks is written as "?"
+    bool byteOrderMark = false;    // at the beginning; only Unicode's encodings have one
+    YesNoWords words{};            // of a web page and a document
+    QString title{};               // the same
 
     // Another order than the user's own brings "-" and ":" along where no separators were chosen yet.
     void SetDateOrder(DateOrder order);
@@ -66,6 +74,7 @@ private:
     void AppendCell(const Cell& cell, FieldType type);
     void EndLine();
     bool Flush();
+    void WriteByteOrderMark();
 
     QIODevice& device_;
     CsvExportOptions options_;

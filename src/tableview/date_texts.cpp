@@ -10,8 +10,31 @@ namespace {
 constexpr std::string_view kBaseDate = "1899-12-30"; // on which a time of day stands alone
 constexpr size_t kTimeAt = 11;
 constexpr size_t kWholeSeconds = 19; // "2001-07-04 09:05:00"
-constexpr size_t kMostDays = 1 << 14;
-constexpr size_t kMostTimes = 1 << 17; // a day has 86,400 seconds
+// Each has its own place, so that none takes another's: a hash let the times of a day push one another out.
+constexpr size_t kDaysOfMonth = 32;
+constexpr size_t kDaysOfYear = 13 * kDaysOfMonth;
+constexpr size_t kMostDays = 40 * kDaysOfYear; // days of more years share their places
+constexpr size_t kMostTimes = size_t(24) * 60 * 60;
+
+size_t Number(std::string_view digits)
+{
+    size_t number = 0;
+    for (const char digit : digits)
+        number = number * 10 + size_t(digit - '0');
+    return number;
+}
+
+size_t PlaceOfDay(std::string_view stored) // "2001-07-04"
+{
+    return (Number(stored.substr(0, 4)) * kDaysOfYear + Number(stored.substr(5, 2)) * kDaysOfMonth +
+            Number(stored.substr(8, 2))) %
+           kMostDays;
+}
+
+size_t PlaceOfTime(std::string_view stored) // "09:05:00"
+{
+    return (Number(stored.substr(0, 2)) * 60 + Number(stored.substr(3, 2))) * 60 + Number(stored.substr(6, 2));
+}
 
 } // namespace
 
@@ -44,12 +67,12 @@ std::string_view DateTexts::Of(std::string_view stored)
 
 void DateTexts::Append(std::string_view stored, Memory& memory)
 {
-    Remembered& slot = memory[std::hash<std::string_view>()(stored) % memory.size()];
+    const bool isTime = &memory == &times_;
+    Remembered& slot = memory[isTime ? PlaceOfTime(stored) : PlaceOfDay(stored)];
     if (stored == std::string_view(slot.stored.data(), slot.size)) {
         text_.append(slot.text.data(), slot.textSize);
         return;
     }
-    const bool isTime = &memory == &times_;
     const std::string text =
         Format(isTime ? std::string(kBaseDate) + ' ' + std::string(stored) : std::string(stored));
     text_ += text;

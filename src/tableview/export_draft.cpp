@@ -44,18 +44,44 @@ bool ExportDraft::ChoosePath(const QString& path)
 {
     if (path.isEmpty())
         return false;
-    const QString file = QFileInfo(path).suffix().isEmpty() ? path + u".csv"_s : path;
+    const QString file = QFileInfo(path).suffix().isEmpty() ? path + EndingOf(options_.kind) : path;
     if (QFileInfo::exists(file) && !prompt_.AskYesNo({Str::ReplaceFileQuestion, {QDir::toNativeSeparators(file)}}))
         return false;
     path_ = file;
     return true;
 }
 
-bool ExportDraft::Run()
+QString ExportDraft::EndingOf(ExportKind kind)
 {
-    return CanRun() &&
-           ExportCsvFile(records_, options_, {.path = path_, .database = database_.FilePath()}, prompt_)
-               .has_value();
+    switch (kind) {
+    case ExportKind::Csv:
+        break;
+    case ExportKind::Json:
+        return u".json"_s;
+    case ExportKind::Html:
+        return u".html"_s;
+    case ExportKind::Pdf:
+        return u".pdf"_s;
+    }
+    return u".csv"_s;
+}
+
+bool ExportDraft::SetKind(ExportKind kind)
+{
+    const QString before = path_;
+    const QString ending = EndingOf(options_.kind);
+    options_.kind = kind;
+    if (before.isEmpty() || !before.endsWith(ending, Qt::CaseInsensitive))
+        return true;
+    path_.clear();
+    return ChoosePath(before.chopped(ending.size()) + EndingOf(kind));
+}
+
+bool ExportDraft::Run(ExportFunction write)
+{
+    return CanRun() && ExportCsvFile(records_, options_,
+                                     {.path = path_, .database = database_.FilePath(), .write = write}, prompt_)
+                           .has_value();
 }
 
 } // namespace mirel

@@ -29,7 +29,7 @@ public:
     qint64 RecordCount() { return records_.IsOpen() ? records_.RecordCount() : 0; }
     std::vector<Field> Fields() const;
 
-    // A name without an ending gets ".csv". Asks when the file exists; false: the path before stays.
+    // A name without an ending gets its kind's. Asks when the file exists; false: the path before stays.
     bool ChoosePath(const QString& path);
     const QString& Path() const { return path_; }
 
@@ -37,10 +37,14 @@ public:
     const CsvExportOptions& Options() const { return options_; }
     QStringList Preview() { return records_.IsOpen() ? PreviewCsv(records_, options_) : QStringList(); }
 
+    // What is written, and with it the ending of a path that was chosen for another kind.
+    bool SetKind(ExportKind kind); // false: a file of that name is to stay, and the path is forgotten
+    static QString EndingOf(ExportKind kind);
+
     // There is something to write, and a file for it.
     bool CanRun() { return RecordCount() > 0 && !path_.isEmpty(); }
     // Writes the file and tells how many records it holds. False: it was not written, and why was told.
-    bool Run();
+    bool Run(ExportFunction write = ExportCsv);
 
 private:
     DbRecordset records_;

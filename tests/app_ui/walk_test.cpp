@@ -6,6 +6,8 @@
 #include "app/ui/fonts_dialog.h"
 #include "app/ui/look.h"
 #include "app/ui/message_box_prompt.h"
+#include "csvimport/ui/import_options_dialog.h"
+#include "csvimport/ui/import_wizard.h"
 #include "data/filter_condition.h"
 #include "forms/default_form.h"
 #include "forms/form_store.h"
@@ -113,6 +115,21 @@ TEST_F(Walk, GoesThroughTheDialogs)
     });
     ExpectDialogFits(u"fonts"_s, [](QWidget& window) { return new CFontsDialog({}, &window); });
     ExpectDialogFits(u"csv-options"_s, [](QWidget& window) { return new CCsvOptionsDialog({}, &window); });
+    ExpectDialogFits(u"import-options"_s, [](QWidget& window) { return new CImportOptionsDialog({}, &window); });
+    ImportDraft import(connection, path, prompt);
+    ASSERT_TRUE(import.Choose(ImportSource::OfText(u"Name\tAge\nAnn Something\t5\n"_s)));
+    for (int step = 0; step < 4; ++step) {
+        ExpectDialogFits(u"import-%1"_s.arg(step + 1), [&](QWidget& window) {
+            auto* wizard = new CImportWizard(import, prompt, path, &window);
+            for (int i = 0; i < step; ++i) {
+                for (QPushButton* button : wizard->findChildren<QPushButton*>()) {
+                    if (button->text() == StringText(Str::WizardNext))
+                        button->click();
+                }
+            }
+            return wizard;
+        });
+    }
     ExpectDialogFits(u"export"_s,
                      [&](QWidget& window) { return new CExportWizard(draft, u"People"_s, path, &window); });
     for (const QString& field : {u"Name"_s, u"Born"_s, u"Member"_s}) {

@@ -77,6 +77,23 @@ TEST(CellReader, ReadsTheNumberAtATextsBeginning)
                  {kDouble, "1e999", "overflow"}});
 }
 
+TEST(CellReader, ReadsDecimalCommasOnRequest)
+{
+    const std::vector<Row> rows = {
+        {FieldType::Double, "1,5", "real 1.500000"},
+        {FieldType::Double, "-1.234.567,25", "real -1234567.250000"},
+        {FieldType::Double, "1.234", "real 1234.000000"},
+        {FieldType::Double, "1.2345", "real 1.000000"}, // no group: what follows is left out
+        {FieldType::Double, ",5", "real 0.500000"},
+        {FieldType::Double, ".5", "bad literal"},
+        {FieldType::Double, ",", "bad literal"},
+        {FieldType::Double, "7 kg", "real 7.000000"}};
+    for (const Row& row : rows) {
+        CellReader reader(row.type, {}, LongTexts::Cut, u',');
+        EXPECT_EQ(Read(reader, row.text), row.expected) << row.text;
+    }
+}
+
 TEST(CellReader, TakesAYesForANonZeroIntegerAlone)
 {
     constexpr auto kYesNo = FieldType::YesNo;

@@ -142,6 +142,41 @@ TEST(CsvReader, ReadsAcrossItsBuffer)
     }
 }
 
+// Texts of good records, and the bytes of the failing ones in braces.
+QStringList ReadOn(QByteArray bytes, const CsvFormat& format)
+{
+    QBuffer device(&bytes);
+    EXPECT_TRUE(device.open(QIODevice::ReadOnly));
+    CsvReader reader(device, format);
+    QStringList records;
+    for (CsvReader::Result result = reader.Next(); result != CsvReader::Result::End; result = reader.Next()) {
+        if (result == CsvReader::Result::Record) {
+            records += QString::fromUtf8(reader.Texts().empty() ? ""
+                                                                : QByteArray(reader.Texts()[0].data(),
+                                                                             qsizetype(reader.Texts()[0].size())));
+            continue;
+        }
+        if (!reader.StepOverFault())
+            break;
+        const std::string_view raw = reader.RawRecord();
+        records += u'{' + QString::fromLatin1(raw.data(), qsizetype(raw.size())) + u'}';
+    }
+    return records;
+}
+
+TEST(CsvReader, GoesOnBehindAFault)
+{
+    EXPECT_EQ(ReadOn("a\r\nb\xE4\r\nc\n\xFF", {}),
+              (QStringList{u"a"_s, u"{b\u00E4\r\n}"_s, u"c"_s, u"{\u00FF}"_s}));
+    EXPECT_EQ(ReadOn("a\n\"b\nc\n\"d\n\"e\"\n\"f", Doubled()),
+              (QStringList{u"a"_s, u"b\nc\n\"d\n\"e"_s, u"{\"f}"_s}));
+    EXPECT_EQ(ReadOn("\"b\r\nc\r\n\"d\r\n", Doubled()), (QStringList{u"{\"b\r\n}"_s, u"c"_s, u"{\"d\r\n}"_s}));
+    EXPECT_EQ(ReadOn("\"x\"\"y\nz\xE4\"\nb\n", Doubled()), (QStringList{u"{\"x\"\"y\nz\u00E4\"\n}"_s, u"b"_s}));
+    CsvFormat drop;
+    drop.dropNuls = true;
+    EXPECT_EQ(ReadOn(QByteArray("a\0b\n\0\n", 6), drop), (QStringList{u"ab"_s, u""_s}));
+}
+
 TEST(CsvReader, RefusesARecordWithoutEnd)
 {
     EXPECT_EQ(Read("a\n" + QByteArray(CsvReader::kMaxRecordBytes + 1, 'x')),

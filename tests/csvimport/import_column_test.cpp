@@ -41,6 +41,8 @@ TEST(TypeGuess, LosesNothingOfAnyText)
         {"an exponent behind an integer may be a code", {"12E4"}, ":202:50"},
         {"ZIP codes", {"00501", "10001"}, ":202:50"},
         {"a zero", {"0", "0.0"}, ":5"},
+        {"0 and 1", {"0", "", "1"}, ":11"},
+        {"0 and a blank 1", {"0", " 1"}, ":3"},
         {"a plus sign", {"+49"}, ":202:50"},
         {"a unit", {"5", "7 kg"}, ":202:50"},
         {"a point alone", {"1.", "."}, ":202:50"},

@@ -148,6 +148,29 @@ TEST_F(Export, LeavesTheOldFileWhenTheDiskIsFull)
     EXPECT_EQ(QDir(folder.path()).entryList({u"old*"_s}, QDir::Files), QStringList(u"old.csv"_s)) << "no remains";
 }
 
+TEST_F(Export, LeavesNothingOfANewFileWhenTheDiskIsFull)
+{
+    OpenLongSource();
+    EXPECT_TRUE(draft.ChoosePath(File(u"new.csv"_s)));
+    {
+        const FileSizeLimit full(100000);
+        EXPECT_FALSE(draft.Run());
+    }
+    EXPECT_EQ(QDir(folder.path()).entryList({u"new*"_s}, QDir::Files), QStringList());
+}
+
+TEST_F(Export, TakesTheEndingOfWhatIsWritten)
+{
+    OpenLongSource();
+    EXPECT_TRUE(draft.ChoosePath(File(u"a"_s)));
+    EXPECT_TRUE(draft.SetKind(ExportKind::Html));
+    EXPECT_EQ(draft.Path(), File(u"a.html"_s));
+    EXPECT_TRUE(draft.Preview().first().startsWith(u"<!DOCTYPE html>"_s));
+    Write(u"a.json"_s, "theirs");
+    EXPECT_FALSE(draft.SetKind(ExportKind::Json)) << "the file that is there stays";
+    EXPECT_TRUE(draft.Path().isEmpty());
+}
+
 TEST_F(Export, KeepsWhatWasWrittenWhenTheUserStops)
 {
     OpenLongSource();

@@ -18,16 +18,14 @@
 #include "tableview/ui/table_view.h"
 
 #include <QApplication>
+#include <QCloseEvent>
 #include <QDir>
-#include <QDragEnterEvent>
 #include <QFileInfo>
 #include <QFrame>
 #include <QLabel>
 #include <QMenuBar>
-#include <QMimeData>
 #include <QSplitter>
 #include <QToolButton>
-#include <QUrl>
 #include <QVBoxLayout>
 
 #include <algorithm>
@@ -49,16 +47,6 @@ constexpr int kSideBarFirstWidth = 212;
 constexpr int kSideBarLeastWidth = 140;
 constexpr int kLookAtFileMs = 1000;
 constexpr int kCornerShare = 3; // of the window's width, the most that the name in the corner takes
-
-// The one database file that is dragged; empty when it is anything else.
-QString DraggedDatabase(const QMimeData* data)
-{
-    const QList<QUrl> urls = data->urls();
-    if (urls.size() != 1 || !urls.first().isLocalFile())
-        return {};
-    const QString path = urls.first().toLocalFile();
-    return path.endsWith(u".cdb"_s, Qt::CaseInsensitive) ? path : QString();
-}
 
 // Between parts of the window.
 QFrame* Line(QFrame::Shape shape, QWidget* parent)
@@ -481,7 +469,7 @@ void CMainFrame::OpenPath(const QString& path)
     ShowState();
 }
 
-// --- closing and dropping -----------------------------------------------------------------------------------
+// --- closing ------------------------------------------------------------------------------------------------
 
 void CMainFrame::closeEvent(QCloseEvent* event)
 {
@@ -494,23 +482,6 @@ void CMainFrame::closeEvent(QCloseEvent* event)
         profile_.WriteInt(kWindowSection, kSideBarKey, sidePane_->width());
     KeepPlace(*this, profile_, kFramePlace);
     QMainWindow::closeEvent(event);
-}
-
-void CMainFrame::dragEnterEvent(QDragEnterEvent* event)
-{
-    if (!DraggedDatabase(event->mimeData()).isEmpty())
-        event->acceptProposedAction();
-}
-
-void CMainFrame::dropEvent(QDropEvent* event)
-{
-    const QString path = DraggedDatabase(event->mimeData());
-    if (path.isEmpty())
-        return;
-    // A move would have the file manager delete what was only opened.
-    event->setDropAction(Qt::CopyAction);
-    event->accept();
-    OpenPath(path);
 }
 
 } // namespace mirel

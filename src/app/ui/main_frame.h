@@ -30,6 +30,7 @@ class CViewWindow;
 class EmptyPage;
 class EntryPanel;
 class HostedView;
+class ImportSource;
 class ShellActions;
 class SideBar;
 class ViewTabs;
@@ -110,6 +111,8 @@ private:
     void ChooseAndCreateDatabase();
     void ChooseAndDeleteDatabase();
     void OpenPath(const QString& path);
+    void ImportFrom(const ImportSource& source); // none: the user chooses
+    void ImportFromClipboard();
 
     // Views.
     CTableView* MakeTable(const TableRequest& request);

@@ -3,6 +3,7 @@
 #include "app/ui/main_frame.h"
 #include "app/ui/shell_actions.h"
 #include "app/ui/view_tabs.h"
+#include "csvimport/import_source.h"
 #include "resources/string_table.h"
 #include "tableview/ui/export_wizard.h"
 
@@ -60,9 +61,11 @@ struct CMainFrame::Commands {
     {
         if (const std::optional<TableRequest> request = frame.commands_.RequestOfSelected()) {
             RunExport(frame.session_.Connection(), frame.session_.Location(), frame.session_.Prompt(),
-                      {.name = request->title, .statement = request->statement}, frame);
+                      {.name = request->title, .statement = request->statement, .words = frame.settings_.Words()},
+                      frame);
         }
     }
+    static void Import(CMainFrame& frame) { frame.ImportFrom({}); }
     static void Nothing(CMainFrame&) {} // opens a menu, or is not built yet
 
     static State Always(const CMainFrame&) { return {}; }
@@ -128,9 +131,16 @@ std::span<const CommandRow<CMainFrame>> CMainFrame::CommandTable()
              .tip = Str::TipImportCsv,
              .icon = u"document-import",
              .menus = ShellFileMenu | ShellSideBarMenu,
-             .group = 2,
-             .built = kLater},
-            C::Nothing},
+             .group = 2},
+            C::Import},
+        Row{{.id = Id(Command::PasteTable),
+             .text = Str::CommandPasteTable,
+             .tip = Str::TipPasteTable,
+             .icon = u"edit-paste",
+             .keys = {{{Qt::CTRL | Qt::SHIFT | Qt::Key_V}}},
+             .menus = ShellFileMenu | ShellSideBarMenu,
+             .group = 2},
+            C::Frame<&F::ImportFromClipboard>},
         Row{{.id = Id(Command::ExportCsv),
              .text = Str::CommandExportCsv,
              .tip = Str::TipExportCsv,

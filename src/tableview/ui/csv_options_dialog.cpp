@@ -54,6 +54,7 @@ CCsvOptionsDialog::CCsvOptionsDialog(const CsvExportOptions& options, QWidget* p
     , dateSeparator_(CharacterBox(u"-/. ", this))
     , timeSeparator_(CharacterBox(u":.-", this))
     , encoding_(new QComboBox(this))
+    , byteOrderMark_(new QCheckBox(StringText(Str::CsvByteOrderMark), this))
 {
     setWindowTitle(StringText(Str::CsvAdvancedTitle));
     for (const Str order : kDateOrders)
@@ -63,6 +64,7 @@ CCsvOptionsDialog::CCsvOptionsDialog(const CsvExportOptions& options, QWidget* p
         box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         box->setMinimumContentsLength(8);
     }
+    byteOrderMark_->setToolTip(StringText(Str::CsvByteOrderMarkTip));
     LayOut();
     ShowOptions();
     Connect();
@@ -81,6 +83,7 @@ void CCsvOptionsDialog::LayOut()
     form->addRow(doubledQuotes_);
     form->addRow(dates);
     form->addRow(StringText(Str::CsvEncoding), encoding_);
+    form->addRow(byteOrderMark_);
     for (QFormLayout* each : {form, dateForm}) {
         each->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
         each->setRowWrapPolicy(QFormLayout::WrapLongRows);
@@ -105,6 +108,8 @@ void CCsvOptionsDialog::ShowOptions()
     dateSeparator_->setEnabled(options_.dates.order != DateOrder::Locale);
     timeSeparator_->setEnabled(options_.dates.order != DateOrder::Locale);
     encoding_->setCurrentText(QString::fromLatin1(options_.encoding));
+    byteOrderMark_->setChecked(options_.byteOrderMark);
+    byteOrderMark_->setEnabled(options_.encoding.startsWith("UTF"));
 }
 
 void CCsvOptionsDialog::Connect()
@@ -122,8 +127,11 @@ void CCsvOptionsDialog::Connect()
             [this] { options_.dates.dateSeparator = CharacterOf(dateSeparator_).unicode(); });
     connect(timeSeparator_, &QComboBox::activated, this,
             [this] { options_.dates.timeSeparator = CharacterOf(timeSeparator_).unicode(); });
-    connect(encoding_, &QComboBox::textActivated, this,
-            [this](const QString& name) { options_.encoding = name.toLatin1(); });
+    connect(encoding_, &QComboBox::textActivated, this, [this](const QString& name) {
+        options_.encoding = name.toLatin1();
+        ShowOptions();
+    });
+    connect(byteOrderMark_, &QCheckBox::toggled, this, [this](bool on) { options_.byteOrderMark = on; });
 }
 
 } // namespace mirel

@@ -30,6 +30,7 @@ private:
     QComboBox* dateSeparator_;
     QComboBox* timeSeparator_;
     QComboBox* encoding_;
+    QCheckBox* byteOrderMark_;
 };
 
 } // namespace mirel

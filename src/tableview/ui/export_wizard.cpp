@@ -7,8 +7,10 @@
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "tableview/ui/csv_options_dialog.h"
+#include "tableview/ui/pdf_export.h"
 
 #include <QCheckBox>
+#include <QComboBox>
 #include <QDialogButtonBox>
 #include <QDir>
 #include <QGridLayout>
@@ -22,6 +24,7 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
+#include <algorithm>
 #include <array>
 
 namespace mirel {
@@ -64,10 +67,34 @@ QTreeWidget* FieldList(const std::vector<ExportDraft::Field>& fields, QWidget* p
     return list;
 }
 
-// A table may be called what no file can be.
-QString FileNameOf(QString name)
+struct Kind {
+    ExportKind kind;
+    Str text;
+    Str filter;
+};
+// As they stand in the box.
+constexpr std::array kKinds = {
+    Kind{ExportKind::Csv, Str::ExportKindCsv, Str::CsvFilter},
+    Kind{ExportKind::Json, Str::ExportKindJson, Str::ExportFilterJson},
+    Kind{ExportKind::Html, Str::ExportKindHtml, Str::ExportFilterHtml},
+    Kind{ExportKind::Pdf, Str::ExportKindPdf, Str::ExportFilterPdf},
+};
+
+const Kind& KindOf(const ExportDraft& draft)
 {
-    return name.replace(u'/', u'_') + u".csv"_s;
+    return *std::ranges::find(kKinds, draft.Options().kind, &Kind::kind);
+}
+
+QStringList EndingsOf(ExportKind kind)
+{
+    const QString ending = ExportDraft::EndingOf(kind);
+    return kind == ExportKind::Csv ? QStringList{ending, u".txt"_s} : QStringList{ending};
+}
+
+// A table may be called what no file can be.
+QString FileNameOf(QString name, ExportKind kind)
+{
+    return name.replace(u'/', u'_') + ExportDraft::EndingOf(kind);
 }
 
 } // namespace
@@ -141,19 +168,41 @@ QWidget* CExportWizard::SourcePage()
     grid->addWidget(query, 1, 1);
     grid->addWidget(FieldList(draft_.Fields(), page), 2, 0, 1, 2);
     grid->addWidget(count, 3, 0, 1, 2);
-    grid->addWidget(new QLabel(StringText(Str::ExportDestination), page), 4, 0, 1, 2);
-    grid->addWidget(path_, 5, 0);
-    grid->addWidget(saveAs_, 5, 1);
+    grid->addWidget(Kinds(page), 4, 0, 1, 2);
+    grid->addWidget(new QLabel(StringText(Str::ExportDestination), page), 5, 0, 1, 2);
+    grid->addWidget(path_, 6, 0);
+    grid->addWidget(saveAs_, 6, 1);
     grid->setColumnStretch(0, 1);
     grid->setRowStretch(2, 1);
     return page;
 }
 
+QWidget* CExportWizard::Kinds(QWidget* page)
+{
+    auto* row = new QWidget(page);
+    auto* box = new QComboBox(row);
+    for (const Kind& each : kKinds)
+        box->addItem(StringText(each.text));
+    box->setCurrentIndex(int(&KindOf(draft_) - kKinds.data()));
+    auto* label = new QLabel(StringText(Str::ExportKind), row);
+    label->setBuddy(box);
+    connect(box, &QComboBox::activated, this, [this](int index) {
+        draft_.SetKind(kKinds[size_t(index)].kind);
+        ShowState();
+    });
+    auto* line = new QHBoxLayout(row);
+    line->setContentsMargins({});
+    line->addWidget(label);
+    line->addWidget(box, 1);
+    return row;
+}
+
 QWidget* CExportWizard::SeparatorPage()
 {
     auto* page = new QWidget(this);
-    auto* header = new QCheckBox(StringText(Str::CsvHeader), page);
-    auto* advanced = new QPushButton(StringText(Str::CsvAdvanced), page);
+    csvOptions_ = new QWidget(page);
+    auto* header = new QCheckBox(StringText(Str::CsvHeader), csvOptions_);
+    auto* advanced = new QPushButton(StringText(Str::CsvAdvanced), csvOptions_);
     advanced->setAutoDefault(false);
     auto* title = new QLabel(StringText(Str::CsvPreview), page);
     title->setBuddy(preview_);
@@ -169,12 +218,15 @@ QWidget* CExportWizard::SeparatorPage()
 
     auto* column = new QVBoxLayout(page);
     column->setContentsMargins({});
-    column->addWidget(Separators(page));
-    column->addWidget(header);
+    auto* options = new QVBoxLayout(csvOptions_);
+    options->setContentsMargins({});
+    options->addWidget(Separators(csvOptions_));
     auto* row = new QHBoxLayout;
-    row->addWidget(title, 1);
+    row->addWidget(header, 1);
     row->addWidget(advanced);
-    column->addLayout(row);
+    options->addLayout(row);
+    column->addWidget(csvOptions_);
+    column->addWidget(title);
     column->addWidget(preview_, 1);
     return page;
 }
@@ -219,6 +271,7 @@ void CExportWizard::ShowState()
     path_->SetText(path.isEmpty() ? QString() : StringText(Str::ExportPath, {path}));
     path_->setToolTip(path);
     next_->setEnabled(draft_.CanRun());
+    csvOptions_->setVisible(draft_.Options().kind == ExportKind::Csv);
 }
 
 void CExportWizard::ShowPreview()
@@ -230,12 +283,13 @@ void CExportWizard::ShowPreview()
 void CExportWizard::ChoosePath()
 {
     const QString path = draft_.Path().isEmpty() ? near_ : draft_.Path();
-    draft_.ChoosePath(ChooseFile(*this, {.title = Str::ExportSaveAs,
-                                         .accept = Str::ExportSaveAs,
-                                         .use = FileUse::Create,
-                                         .kind = {Str::CsvFilter, {u".csv"_s, u".txt"_s}, u"document-export"},
-                                         .near = path,
-                                         .name = FileNameOf(name_)}));
+    draft_.ChoosePath(
+        ChooseFile(*this, {.title = Str::ExportSaveAs,
+                           .accept = Str::ExportSaveAs,
+                           .use = FileUse::Create,
+                           .kind = {KindOf(draft_).filter, EndingsOf(draft_.Options().kind), u"document-export"},
+                           .near = path,
+                           .name = FileNameOf(name_, draft_.Options().kind)}));
     ShowState();
     if (next_->isEnabled())
         next_->setFocus();
@@ -255,7 +309,7 @@ void CExportWizard::GoOn()
 {
     if (pages_->currentIndex() == 0)
         ShowStep(1);
-    else if (draft_.Run())
+    else if (draft_.Run(draft_.Options().kind == ExportKind::Pdf ? ExportPdf : ExportCsv))
         accept();
 }
 
@@ -263,6 +317,8 @@ void RunExport(DbConnection& connection, const DatabaseLocation& database, UserP
                const ExportRequest& request, QWidget& window)
 {
     ExportDraft draft(connection, database, prompt);
+    draft.Options().title = request.name;
+    draft.Options().words = request.words;
     {
         const WaitCursor waiting;
         if (!draft.SetSource(request.statement))

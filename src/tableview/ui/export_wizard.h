@@ -17,7 +17,7 @@ namespace mirel {
 
 class ElidedLabel;
 
-// "Export": the two steps of writing a result as a CSV file, over the draft, which must outlive it.
+// "Export": the two steps of writing a result as a file, over the draft, which must outlive it.
 class CExportWizard : public QDialog {
     Q_OBJECT
 
@@ -30,6 +30,7 @@ private:
     QWidget* SourcePage();
     QWidget* SeparatorPage();
     QWidget* Separators(QWidget* page);
+    QWidget* Kinds(QWidget* page);
     void LayOut();
     void ShowStep(int step); // from 0
     void ShowState();
@@ -46,6 +47,7 @@ private:
     ElidedLabel* path_;
     QListWidget* preview_;
     QPushButton* saveAs_;
+    QWidget* csvOptions_ = nullptr; // what is chosen for CSV alone
     QPushButton* back_;
     QPushButton* next_;
 };
@@ -54,6 +56,7 @@ private:
 struct ExportRequest {
     QString name; // of the table or the query
     QString statement;
+    YesNoWords words{}; // for a web page and a document
 };
 void RunExport(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
                const ExportRequest& request, QWidget& window);

@@ -142,8 +142,8 @@ bool ResultCommands::Export()
 {
     if (!browser_.WriteEdit())
         return false;
-    RunExport(connection_, browser_.Database(), prompt_, {.name = title_, .statement = browser_.Statement()},
-              view_);
+    RunExport(connection_, browser_.Database(), prompt_,
+              {.name = title_, .statement = browser_.Statement(), .words = browser_.Settings().words}, view_);
     return true;
 }
 
