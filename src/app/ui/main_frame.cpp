@@ -382,16 +382,22 @@ void CMainFrame::OpenSelected()
 
 void CMainFrame::MakeNew()
 {
-    if (OutcomeOfNew(state_).make == EntryKind::Table)
+    const std::optional<EntryKind> make = OutcomeOfNew(state_).make;
+    if (make == EntryKind::Table)
         return DesignTable({});
+    if (make == EntryKind::Query)
+        return WriteSavedQuery({});
     commands_.New();
     ShowState();
 }
 
 void CMainFrame::EditSelected()
 {
-    if (const std::optional<MainEntry> entry = state_.Selected(); entry && entry->kind == EntryKind::Table)
+    const std::optional<MainEntry> entry = state_.Selected();
+    if (entry && entry->kind == EntryKind::Table)
         DesignTable(entry->name);
+    else if (entry && entry->kind == EntryKind::Query)
+        WriteSavedQuery(entry->name);
 }
 
 void CMainFrame::DesignTable(const QString& table)

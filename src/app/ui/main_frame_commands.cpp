@@ -60,7 +60,8 @@ struct CMainFrame::Commands {
     {
         if (const std::optional<TableRequest> request = frame.commands_.RequestOfSelected()) {
             RunExport(frame.session_.Connection(), frame.session_.Location(), frame.session_.Prompt(),
-                      {.name = request->title, .statement = request->statement}, frame);
+                      {.name = request->title, .statement = request->statement, .writeQuery = frame.QueryWriter()},
+                      frame);
         }
     }
     static void Nothing(CMainFrame&) {} // opens a menu, or is not built yet

@@ -214,7 +214,6 @@ std::span<const CommandRow<CTableView>> CTableView::Commands::Table()
     using B = RecordBrowser;
     using R = ResultCommands;
     using V = CTableView;
-    constexpr bool kLater = false;
     // An editor keeps the keys that move within its text.
     static constexpr std::array kRows = {
         Row{{.id = Id(Command::InsertDateTime),
@@ -229,9 +228,9 @@ std::span<const CommandRow<CTableView>> CTableView::Commands::Table()
              .text = Str::ActionNewQuery,
              .tip = Str::ActionNewQueryTip,
              .menus = FileMenu,
-             .group = 1,
-             .built = kLater},
-            OpenMenu},
+             .group = 1},
+            Result<&R::NewQuery>,
+            IfResult<&R::CanWriteQuery>},
         Row{{.id = Id(Command::OpenQuery),
              .text = Str::ActionOpenQuery,
              .tip = Str::ActionOpenQueryTip,
