@@ -34,9 +34,9 @@ Availability AvailabilityOfNew(const MainViewState& state)
     const NewOutcome outcome = OutcomeOfNew(state);
     if (outcome.message)
         return {true, Str::TipNew};
-    if (outcome.make == EntryKind::Form || outcome.make == EntryKind::Table)
+    if (outcome.make)
         return {true, ToolsOf(*outcome.make).newTip};
-    return {false, outcome.make ? ToolsOf(*outcome.make).newTip : Str::TipNewFavorite};
+    return {false, Str::TipNewFavorite};
 }
 
 // Of a command that acts on the selected entry.
@@ -55,7 +55,7 @@ Availability AvailabilityOnEntry(ShellCommand id, const MainEntry& entry, const 
     case ExportCsv:
         return {entry.kind != EntryKind::Form && !entry.missing, Str::TipExportCsv};
     case Edit:
-        return {entry.kind != EntryKind::Query && !entry.missing, ToolsOf(entry.kind).editTip};
+        return {!entry.missing, ToolsOf(entry.kind).editTip};
     case Rename:
         return {!entry.missing, Str::TipRename};
     default:

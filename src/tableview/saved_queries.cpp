@@ -10,6 +10,19 @@ namespace mirel {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+QueryDef MakeQuery(const QString& name, const QString& table, const QString& statement)
+{
+    QueryDef query;
+    query.SetName(name);
+    query.SetTableName(table);
+    query.SetText(statement);
+    return query;
+}
+
+} // namespace
+
 QStringList SavedQueries::Names() const
 {
     QStringList names;
@@ -49,25 +62,35 @@ bool SavedQueries::AskIfItChanges(const QString& name, const QString& statement)
 
 bool SavedQueries::Save(const QString& name, const QString& table, const QString& statement, OnExisting existing)
 {
-    QueryDef query;
-    query.SetName(name);
-    query.SetTableName(table);
-    query.SetText(statement);
+    return Save(MakeQuery(name, table, statement),
+                [existing](const QueryDef&) { return existing == OnExisting::Replace; });
+}
+
+bool SavedQueries::Save(const QString& name, const QString& table, const QString& statement,
+                        const std::optional<QueryDef>& edited)
+{
+    return Save(MakeQuery(name, table, statement), [&edited](const QueryDef& stored) {
+        return edited && edited->name.Text() == stored.name.Text() && edited->text.Text() == stored.text.Text();
+    });
+}
+
+bool SavedQueries::Save(const QueryDef& query, const std::function<bool(const QueryDef& stored)>& mayReplace)
+{
     const QString kept = query.name.Text();
     if (kept.trimmed().isEmpty())
         return false;
     // Whether the name is taken is known for certain only under the store's lock, and nobody is asked there.
-    bool replace = existing == OnExisting::Replace;
+    bool agreed = false;
     for (;;) {
         bool taken = false;
         const bool saved = store_.Apply([&](FormStore& store) {
             QueryDef* before = store.FindQuery(kept);
-            taken = before && !replace;
+            taken = before && !agreed && !mayReplace(*before);
             if (taken)
                 return false;
             if (before) {
-                before->SetTableName(table);
-                before->SetText(statement);
+                before->tableName = query.tableName;
+                before->text = query.text;
             } else {
                 store.AddQuery(query);
             }
@@ -81,7 +104,7 @@ bool SavedQueries::Save(const QString& name, const QString& table, const QString
         }
         if (!prompt_.AskYesNo({Str::QueryExists, {kept}}))
             return false;
-        replace = true;
+        agreed = true;
     }
 }
 

@@ -6,6 +6,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <optional>
 
 namespace mirel {
@@ -38,9 +39,14 @@ public:
     // Names have up to 40 characters, those of tables up to 31; what is longer is cut. An empty name is none.
     bool Save(const QString& name, const QString& table, const QString& statement,
               OnExisting existing = OnExisting::Ask);
+    // The same by somebody who edits the query `edited`: under its name nothing is asked while it is stored as it
+    // was when the edit began.
+    bool Save(const QString& name, const QString& table, const QString& statement,
+              const std::optional<QueryDef>& edited);
     bool Remove(const QString& name);
 
 private:
+    bool Save(const QueryDef& query, const std::function<bool(const QueryDef& stored)>& mayReplace);
     void ReportFailure();
 
     FormStore& store_;

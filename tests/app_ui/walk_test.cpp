@@ -19,6 +19,7 @@
 #include "forms/ui/property_sheet.h"
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
+#include "querybuilder/ui/query_dialog.h"
 #include "resources/string_table.h"
 #include "support/ui/screen_checks.h"
 #include "tableview/export_draft.h"
@@ -27,8 +28,8 @@
 #include "tableview/ui/export_wizard.h"
 #include "tableview/ui/filter_dialog.h"
 #include "tableview/ui/go_to_dialog.h"
+#include "tableview/ui/open_query_dialog.h"
 #include "tableview/ui/options_dialog.h"
-#include "tableview/ui/query_dialog.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/sort_dialog.h"
 #include "tableview/ui/statement_dialog.h"
@@ -105,10 +106,22 @@ TEST_F(Walk, GoesThroughTheDialogs)
     ExpectDialogFits(u"sort"_s,
                      [&](QWidget& window) { return new CSortDialog(lists, u"People"_s, u"Name"_s, &window); });
     ExpectDialogFits(u"query"_s, [](QWidget& window) {
-        return new CQueryDialog({QString(200, u'q'), u"Second"_s}, &window);
+        return new COpenQueryDialog({QString(200, u'q'), u"Second"_s}, &window);
     });
+    for (const int tab : {0, 1, 2}) {
+        std::unique_ptr<QueryDraft> query;
+        ExpectDialogFits(u"query-builder-%1"_s.arg(tab), [&](QWidget& window) {
+            query = std::make_unique<QueryDraft>(
+                QueryRequest{.name = u"Q"_s, .statement = u"SELECT People.Name FROM People WHERE Age > 5"_s},
+                prompt);
+            auto* dialog = new CQueryDialog(*query, {connection, path, store, prompt}, {}, &window);
+            auto* tabs = dialog->findChild<QTabWidget*>();
+            tabs->setCurrentIndex(tabs->isTabVisible(tab) ? tab : 0);
+            return dialog;
+        });
+    }
     ExpectDialogFits(u"statement"_s, [](QWidget& window) {
-        return new CStatementDialog(u"SELECT "_s + QString(5000, u'x'), &window);
+        return new CStatementDialog(u"SELECT "_s + QString(5000, u'x'), CStatementDialog::Edit::Offered, &window);
     });
     ExpectDialogFits(u"colors"_s, [](QWidget& window) {
         return new CColorsDialog({}, CColorsDialog::Unset::Offered, &window);
@@ -131,7 +144,7 @@ TEST_F(Walk, GoesThroughTheDialogs)
         });
     }
     ExpectDialogFits(u"export"_s,
-                     [&](QWidget& window) { return new CExportWizard(draft, u"People"_s, path, &window); });
+                     [&](QWidget& window) { return new CExportWizard(draft, u"People"_s, path, {}, &window); });
     for (const QString& field : {u"Name"_s, u"Born"_s, u"Member"_s}) {
         ExpectDialogFits(u"filter-"_s + field, [&](QWidget& window) {
             auto* dialog = new CFilterDialog(lists, u"People"_s, field, u"7/4/2001"_s, apply, &window);

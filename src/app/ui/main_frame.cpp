@@ -370,8 +370,11 @@ void CMainFrame::OpenSelected()
 
 void CMainFrame::MakeNew()
 {
-    if (OutcomeOfNew(state_).make == EntryKind::Table)
+    const std::optional<EntryKind> make = OutcomeOfNew(state_).make;
+    if (make == EntryKind::Table)
         return DesignTable({});
+    if (make == EntryKind::Query)
+        return WriteSavedQuery({});
     if (const std::optional<FormDef> form = commands_.New())
         DesignNewForm(*form);
     ShowState();
@@ -384,6 +387,8 @@ void CMainFrame::EditSelected()
         DesignTable(entry->name);
     else if (entry && entry->kind == EntryKind::Form)
         DesignForm(entry->name);
+    else if (entry && entry->kind == EntryKind::Query)
+        WriteSavedQuery(entry->name);
 }
 
 void CMainFrame::DesignTable(const QString& table)

@@ -8,6 +8,7 @@
 #include "platform/ui/hosted_view.h"
 #include "platform/ui/view_command.h"
 #include "platform/ui/view_look.h"
+#include "tableview/ui/query_writer.h"
 
 #include <QMainWindow>
 #include <QTimer>
@@ -33,6 +34,8 @@ class HostedView;
 class ImportSource;
 class ShellActions;
 class SideBar;
+class StatementHistory;
+struct QueryServices;
 class ViewTabs;
 
 // The program's window. It hosts all views: on a wide window the lists are a side bar and the views tabs beside
@@ -93,7 +96,11 @@ private:
     void FillRecentMenu();
     void FillWindowMenu();
     void FollowTabs();
-    void DesignTable(const QString& table); // empty: a new one
+    void DesignTable(const QString& table);    // empty: a new one
+    void WriteSavedQuery(const QString& name); // empty: a new one
+    void ShowSavedQuery(const QString& name);
+    WriteQuery QueryWriter();
+    QueryServices ServicesForQueries(StatementHistory& history);
     void ShowLook();
     void ShowTitle();
 

@@ -61,7 +61,10 @@ struct CMainFrame::Commands {
     {
         if (const std::optional<TableRequest> request = frame.commands_.RequestOfSelected()) {
             RunExport(frame.session_.Connection(), frame.session_.Location(), frame.session_.Prompt(),
-                      {.name = request->title, .statement = request->statement, .words = frame.settings_.Words()},
+                      {.name = request->title,
+                       .statement = request->statement,
+                       .words = frame.settings_.Words(),
+                       .writeQuery = frame.QueryWriter()},
                       frame);
         }
     }

@@ -103,6 +103,7 @@ CTableView* CMainFrame::MakeTable(const TableRequest& request)
         return nullptr;
     }
     table->SetStore(session_.Store());
+    table->SetQueryWriter(QueryWriter());
     table->SetWidthsByHand(ReadColumnWidths(profile_.ReadText(kWidthsSection, WidthsKey(request.statement), {})));
     table->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Table)));
     connect(table, &CTableView::queriesChanged, this, [this] {

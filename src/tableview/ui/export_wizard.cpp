@@ -52,17 +52,13 @@ constexpr std::array kSeparators = {
     Separator{u' ', Str::CsvSeparatorSpace},
 };
 
-QTreeWidget* FieldList(const std::vector<ExportDraft::Field>& fields, QWidget* parent)
+QTreeWidget* FieldList(QWidget* parent)
 {
     auto* list = new QTreeWidget(parent);
     list->setRootIsDecorated(false);
     list->setUniformRowHeights(true);
     list->setHeaderLabels(
         {StringText(Str::ExportFieldName), StringText(Str::ExportFieldType), StringText(Str::ExportFieldData)});
-    for (const ExportDraft::Field& field : fields)
-        list->addTopLevelItem(new QTreeWidgetItem({field.name, field.type, field.firstData}));
-    for (int column = 0; column < 2; ++column)
-        list->resizeColumnToContents(column);
     list->setAccessibleName(StringText(Str::ExportSource));
     return list;
 }
@@ -99,11 +95,13 @@ QString FileNameOf(QString name, ExportKind kind)
 
 } // namespace
 
-CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, QWidget* parent)
+CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, WriteQuery writeQuery,
+                             QWidget* parent)
     : QDialog(parent)
     , draft_(draft)
     , name_(std::move(name))
     , near_(std::move(near))
+    , writeQuery_(std::move(writeQuery))
     , heading_(new QLabel(this))
     , pages_(new QStackedWidget(this))
     , path_(new ElidedLabel(this))
@@ -151,29 +149,31 @@ void CExportWizard::LayOut()
 QWidget* CExportWizard::SourcePage()
 {
     auto* page = new QWidget(this);
-    auto* source = new ElidedLabel(page);
-    source->SetText(draft_.Source());
-    source->setToolTip(draft_.Source());
+    source_ = new ElidedLabel(page);
+    fields_ = FieldList(page);
+    count_ = new QLabel(page);
     auto* query = new QPushButton(StringText(Str::ExportQuery), page);
-    query->setEnabled(false);
+    query->setEnabled(bool(writeQuery_));
+    query->setAutoDefault(false);
+    connect(query, &QPushButton::clicked, this, &CExportWizard::ChooseSource);
     query->setToolTip(StringText(Str::ExportQueryTip));
     saveAs_->setToolTip(StringText(Str::ExportSaveAsTip));
-    auto* count = new QLabel(StringText(Str::RecordsSelected, {QString::number(draft_.RecordCount())}), page);
     connect(saveAs_, &QPushButton::clicked, this, &CExportWizard::ChoosePath);
 
     auto* grid = new QGridLayout(page);
     grid->setContentsMargins({});
     grid->addWidget(new QLabel(StringText(Str::ExportSource), page), 0, 0, 1, 2);
-    grid->addWidget(source, 1, 0);
+    grid->addWidget(source_, 1, 0);
     grid->addWidget(query, 1, 1);
-    grid->addWidget(FieldList(draft_.Fields(), page), 2, 0, 1, 2);
-    grid->addWidget(count, 3, 0, 1, 2);
+    grid->addWidget(fields_, 2, 0, 1, 2);
+    grid->addWidget(count_, 3, 0, 1, 2);
     grid->addWidget(Kinds(page), 4, 0, 1, 2);
     grid->addWidget(new QLabel(StringText(Str::ExportDestination), page), 5, 0, 1, 2);
     grid->addWidget(path_, 6, 0);
     grid->addWidget(saveAs_, 6, 1);
     grid->setColumnStretch(0, 1);
     grid->setRowStretch(2, 1);
+    ShowSource();
     return page;
 }
 
@@ -195,6 +195,34 @@ QWidget* CExportWizard::Kinds(QWidget* page)
     line->addWidget(label);
     line->addWidget(box, 1);
     return row;
+}
+
+void CExportWizard::ShowSource()
+{
+    source_->SetText(draft_.Source().simplified());
+    source_->setToolTip(draft_.Source().toHtmlEscaped());
+    fields_->clear();
+    for (const ExportDraft::Field& field : draft_.Fields())
+        fields_->addTopLevelItem(new QTreeWidgetItem({field.name, field.type, field.firstData}));
+    for (int column = 0; column < 2; ++column)
+        fields_->resizeColumnToContents(column);
+    count_->setText(StringText(Str::RecordsSelected, {QString::number(draft_.RecordCount())}));
+}
+
+void CExportWizard::ChooseSource()
+{
+    const QString before = draft_.Source();
+    const auto take = [this, before](const QString&, const QString& statement) {
+        const WaitCursor waiting;
+        const bool opens = draft_.SetSource(statement);
+        if (!opens)
+            (void)draft_.SetSource(before);
+        draft_.RecordCount();
+        return opens;
+    };
+    writeQuery_({.statement = before, .table = {}}, take, *this);
+    ShowSource();
+    ShowState();
 }
 
 QWidget* CExportWizard::SeparatorPage()
@@ -325,7 +353,7 @@ void RunExport(DbConnection& connection, const DatabaseLocation& database, UserP
             return;
         draft.RecordCount();
     }
-    CExportWizard wizard(draft, request.name, database.FilePath(), &window);
+    CExportWizard wizard(draft, request.name, database.FilePath(), request.writeQuery, &window);
     FillSmallWindow(wizard, window);
     wizard.exec();
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "tableview/export_draft.h"
+#include "tableview/ui/query_writer.h"
 
 #include <QDialog>
 
@@ -12,6 +13,7 @@ class QPushButton;
 class QRadioButton;
 class QCheckBox;
 class QStackedWidget;
+class QTreeWidget;
 
 namespace mirel {
 
@@ -24,7 +26,8 @@ class CExportWizard : public QDialog {
 public:
     // `name` is what the result is called: the file's name begins with it. `near` is a path in the folder where
     // the user begins to look for a place.
-    CExportWizard(ExportDraft& draft, QString name, QString near, QWidget* parent);
+    // `writeQuery` lets the user choose other records; empty: nobody does.
+    CExportWizard(ExportDraft& draft, QString name, QString near, WriteQuery writeQuery, QWidget* parent);
 
 private:
     QWidget* SourcePage();
@@ -33,6 +36,8 @@ private:
     QWidget* Kinds(QWidget* page);
     void LayOut();
     void ShowStep(int step); // from 0
+    void ShowSource();
+    void ChooseSource();
     void ShowState();
     void ShowPreview();
     void ChoosePath();
@@ -42,8 +47,12 @@ private:
     ExportDraft& draft_;
     QString name_;
     QString near_;
+    WriteQuery writeQuery_;
     QLabel* heading_;
     QStackedWidget* pages_;
+    ElidedLabel* source_ = nullptr;
+    QTreeWidget* fields_ = nullptr;
+    QLabel* count_ = nullptr;
     ElidedLabel* path_;
     QListWidget* preview_;
     QPushButton* saveAs_;
@@ -57,6 +66,7 @@ struct ExportRequest {
     QString name; // of the table or the query
     QString statement;
     YesNoWords words{}; // for a web page and a document
+    WriteQuery writeQuery{};
 };
 void RunExport(DbConnection& connection, const DatabaseLocation& database, UserPrompt& prompt,
                const ExportRequest& request, QWidget& window);

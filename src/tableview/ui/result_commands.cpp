@@ -7,7 +7,7 @@
 #include "tableview/saved_queries.h"
 #include "tableview/ui/export_wizard.h"
 #include "tableview/ui/filter_dialog.h"
-#include "tableview/ui/query_dialog.h"
+#include "tableview/ui/open_query_dialog.h"
 #include "tableview/ui/sort_dialog.h"
 
 namespace mirel {
@@ -101,6 +101,36 @@ bool ResultCommands::SortByExpression()
     return browser_.SortByTerms(dialog.Terms());
 }
 
+bool ResultCommands::NewQuery()
+{
+    return Write({});
+}
+
+bool ResultCommands::EditStatement()
+{
+    return Write(browser_.Statement());
+}
+
+bool ResultCommands::Write(const QString& statement)
+{
+    if (!CanWriteQuery())
+        return true;
+    if (!browser_.WriteEdit())
+        return false;
+    const QueryWanted wanted{statement, browser_.TableOf(browser_.SelectedField()), store_ != nullptr};
+    const auto take = [this](const QString& name, const QString& written) {
+        const WaitCursor waiting;
+        if (!browser_.OpenInstead(written))
+            return false;
+        if (!name.isEmpty())
+            Q_EMIT queryOpened(name);
+        return true;
+    };
+    writeQuery_(wanted, take, view_);
+    Q_EMIT queriesChanged();
+    return true;
+}
+
 bool ResultCommands::OpenQuery()
 {
     if (!CanOpenQuery())
@@ -108,7 +138,7 @@ bool ResultCommands::OpenQuery()
     if (!browser_.WriteEdit())
         return false;
     SavedQueries queries(*store_, prompt_);
-    CQueryDialog dialog(queries.Names(), &view_);
+    COpenQueryDialog dialog(queries.Names(), &view_);
     FillSmallWindow(dialog, view_);
     if (dialog.exec() != QDialog::Accepted)
         return true;
@@ -143,7 +173,11 @@ bool ResultCommands::Export()
     if (!browser_.WriteEdit())
         return false;
     RunExport(connection_, browser_.Database(), prompt_,
-              {.name = title_, .statement = browser_.Statement(), .words = browser_.Settings().words}, view_);
+              {.name = title_,
+               .statement = browser_.Statement(),
+               .words = browser_.Settings().words,
+               .writeQuery = writeQuery_},
+              view_);
     return true;
 }
 

@@ -4,6 +4,7 @@
 #include "platform/user_prompt.h"
 #include "tableview/aggregate.h"
 #include "tableview/record_browser.h"
+#include "tableview/ui/query_writer.h"
 
 #include <QObject>
 
@@ -25,6 +26,8 @@ public:
     void SetTitle(const QString& title) { title_ = title; }
     // Where the database keeps its saved queries; null: nowhere.
     void SetStore(FormStore* store) { store_ = store; }
+    // Empty: statements cannot be written here.
+    void SetQueryWriter(WriteQuery write) { writeQuery_ = std::move(write); }
 
     // Each returns whether it was carried out; the user's Cancel counts as carried out.
     bool FilterByExpression();
@@ -33,6 +36,9 @@ public:
     bool DeleteAll();
     bool UpdateAll();
     bool Compute(Aggregate function);
+    bool CanWriteQuery() const { return bool(writeQuery_); }
+    bool NewQuery();
+    bool EditStatement(); // that is shown now
     bool CanOpenQuery() const;
     bool OpenQuery();
     bool CanSaveQuery() const;
@@ -44,6 +50,7 @@ Q_SIGNALS:
     void queriesChanged();
 
 private:
+    bool Write(const QString& statement);
     QString SelectedColumn() const; // in its table; empty for an expression
 
     RecordBrowser& browser_;
@@ -51,6 +58,7 @@ private:
     UserPrompt& prompt_;
     QWidget& view_;
     FormStore* store_ = nullptr;
+    WriteQuery writeQuery_;
     QString title_;
 };
 

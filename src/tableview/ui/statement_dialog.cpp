@@ -13,7 +13,7 @@
 
 namespace mirel {
 
-CStatementDialog::CStatementDialog(const QString& statement, QWidget* parent)
+CStatementDialog::CStatementDialog(const QString& statement, Edit edit, QWidget* parent)
     : QDialog(parent)
 {
     setWindowTitle(StringText(Str::StatementTitle));
@@ -26,6 +26,11 @@ CStatementDialog::CStatementDialog(const QString& statement, QWidget* parent)
     QPushButton* copy = buttons->addButton(StringText(Str::StatementCopy), QDialogButtonBox::ActionRole);
     copy->setIcon(ThemeIcon(u"edit-copy"));
     connect(copy, &QPushButton::clicked, this, [statement] { QGuiApplication::clipboard()->setText(statement); });
+    if (edit == Edit::Offered) {
+        QPushButton* change = buttons->addButton(StringText(Str::StatementEdit), QDialogButtonBox::ActionRole);
+        change->setToolTip(StringText(Str::StatementEditTip));
+        connect(change, &QPushButton::clicked, this, &QDialog::accept);
+    }
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     auto* column = new QVBoxLayout(this);
     column->addWidget(text, 1);

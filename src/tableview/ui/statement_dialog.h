@@ -9,7 +9,9 @@ class CStatementDialog : public QDialog {
     Q_OBJECT
 
 public:
-    CStatementDialog(const QString& statement, QWidget* parent);
+    // Accepted: the user wants to change it.
+    enum class Edit { Offered, NotOffered };
+    CStatementDialog(const QString& statement, Edit edit, QWidget* parent);
 };
 
 } // namespace mirel

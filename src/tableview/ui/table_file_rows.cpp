@@ -12,7 +12,6 @@ std::span<const TableRow> CTableView::Commands::FileRows()
     using B = RecordBrowser;
     using R = ResultCommands;
     using V = CTableView;
-    constexpr bool kLater = false;
     static constexpr std::array kRows = {
         TableRow{{.id = Id(TableCommand::InsertDateTime),
                   .text = Str::ActionInsertDateTime,
@@ -26,9 +25,9 @@ std::span<const TableRow> CTableView::Commands::FileRows()
                   .text = Str::ActionNewQuery,
                   .tip = Str::ActionNewQueryTip,
                   .menus = TableFileMenu,
-                  .group = 1,
-                  .built = kLater},
-                 OpenMenu},
+                  .group = 1},
+                 Result<&R::NewQuery>,
+                 IfResult<&R::CanWriteQuery>},
         TableRow{{.id = Id(TableCommand::OpenQuery),
                   .text = Str::ActionOpenQuery,
                   .tip = Str::ActionOpenQueryTip,

@@ -177,6 +177,12 @@ void CTableView::SetStore(FormStore& store)
     ShowState();
 }
 
+void CTableView::SetQueryWriter(WriteQuery write)
+{
+    resultCommands_->SetQueryWriter(std::move(write));
+    ShowState();
+}
+
 void CTableView::SetTitle(const QString& title)
 {
     title_ = title;

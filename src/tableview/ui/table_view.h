@@ -5,6 +5,7 @@
 #include "tableview/block_commands.h"
 #include "tableview/column_widths.h"
 #include "tableview/record_browser.h"
+#include "tableview/ui/query_writer.h"
 #include "tableview/ui/table_command.h"
 
 #include <QTimer>
@@ -47,6 +48,8 @@ public:
 
     // Where the database keeps its saved queries, for "Open Query" and "Save As Query"; must outlive the view.
     void SetStore(FormStore& store);
+    // For "New Query", a change of the statement, and the source of an export; empty: they are not offered.
+    void SetQueryWriter(WriteQuery write);
 
     const RecordBrowser& Browser() const { return browser_; }
 

@@ -6,6 +6,7 @@
 #include "tableview/ui/navigation_row.h"
 #include "tableview/ui/options_dialog.h"
 #include "tableview/ui/record_grid.h"
+#include "tableview/ui/result_commands.h"
 #include "tableview/ui/statement_dialog.h"
 #include "tableview/ui/table_view.h"
 
@@ -152,7 +153,11 @@ void CTableView::ChooseOptions()
 
 void CTableView::ShowStatement()
 {
-    CStatementDialog(browser_.Statement(), this).exec();
+    const bool mayEdit = resultCommands_->CanWriteQuery();
+    CStatementDialog dialog(browser_.Statement(),
+                            mayEdit ? CStatementDialog::Edit::Offered : CStatementDialog::Edit::NotOffered, this);
+    if (dialog.exec() == QDialog::Accepted)
+        Settle(resultCommands_->EditStatement());
 }
 
 void CTableView::FocusNextPane()

@@ -1,4 +1,4 @@
-#include "tableview/ui/query_dialog.h"
+#include "tableview/ui/open_query_dialog.h"
 
 #include "resources/string_table.h"
 
@@ -9,7 +9,7 @@
 
 namespace mirel {
 
-CQueryDialog::CQueryDialog(const QStringList& names, QWidget* parent)
+COpenQueryDialog::COpenQueryDialog(const QStringList& names, QWidget* parent)
     : QDialog(parent)
     , list_(new QListWidget(this))
 {
@@ -35,7 +35,7 @@ CQueryDialog::CQueryDialog(const QStringList& names, QWidget* parent)
     list_->setFocus();
 }
 
-QString CQueryDialog::Chosen() const
+QString COpenQueryDialog::Chosen() const
 {
     return list_->currentItem() ? list_->currentItem()->text() : QString();
 }

@@ -8,11 +8,11 @@ class QListWidget;
 namespace mirel {
 
 // "Open": one of the saved queries by its name.
-class CQueryDialog : public QDialog {
+class COpenQueryDialog : public QDialog {
     Q_OBJECT
 
 public:
-    CQueryDialog(const QStringList& names, QWidget* parent);
+    COpenQueryDialog(const QStringList& names, QWidget* parent);
 
     QString Chosen() const;
 
