@@ -4,6 +4,7 @@
 #include "app/main_view_commands.h"
 #include "app/shell_commands.h"
 #include "forms/design/form_maker.h"
+#include "forms/ui/property_editors.h"
 #include "platform/ui/file_choice.h"
 #include "platform/ui/hosted_view.h"
 #include "platform/ui/view_command.h"
@@ -100,6 +101,8 @@ private:
     void WriteSavedQuery(const QString& name); // empty: a new one
     void ShowSavedQuery(const QString& name);
     WriteQuery QueryWriter();
+    bool BuildFormQuery(MakerDialogs::Query& query, QWidget& window); // false: it stays
+    MakerDialogs DialogsOfMaker();
     QueryServices ServicesForQueries(StatementHistory& history);
     void ShowLook();
     void ShowTitle();

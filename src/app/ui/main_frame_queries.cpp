@@ -1,4 +1,5 @@
 #include "app/table_view_options.h"
+#include "app/ui/display_look.h"
 #include "app/ui/entry_panel.h"
 #include "app/ui/main_frame.h"
 #include "app/ui/view_tabs.h"
@@ -10,6 +11,8 @@
 // The query builder in the main window: New and Edit of saved queries, and the statements that views ask for.
 
 namespace mirel {
+
+using namespace Qt::StringLiterals;
 
 QueryServices CMainFrame::ServicesForQueries(StatementHistory& history)
 {
@@ -81,6 +84,35 @@ WriteQuery CMainFrame::QueryWriter()
                          .table = wanted.table},
                         ServicesForQueries(history), window, take);
     };
+}
+
+// A form's query often has no FROM, which the form completes; that of a button stands behind its "SELECT *".
+bool CMainFrame::BuildFormQuery(MakerDialogs::Query& query, QWidget& window)
+{
+    const QString select = u"SELECT *"_s;
+    QueryRequest request{.nameUse = QueryRequest::Name::None, .statement = query.text, .table = query.table};
+    if (query.followsSelect) {
+        request.selectClause = select;
+        if (!query.text.trimmed().startsWith(u"SELECT", Qt::CaseInsensitive))
+            request.statement = select + u' ' + query.text;
+    }
+    StatementHistory history(profile_, ViewsKey());
+    const std::optional<EditedQuery> written = EditQuery(request, ServicesForQueries(history), window);
+    if (!written)
+        return false;
+    query.text = written->statement;
+    if (query.followsSelect && query.text.startsWith(select, Qt::CaseInsensitive))
+        query.text = query.text.mid(select.size()).trimmed();
+    return true;
+}
+
+MakerDialogs CMainFrame::DialogsOfMaker()
+{
+    MakerDialogs dialogs = MakerDialogsOf();
+    dialogs.buildQuery = [this](MakerDialogs::Query& query, QWidget& window) {
+        return BuildFormQuery(query, window);
+    };
+    return dialogs;
 }
 
 } // namespace mirel

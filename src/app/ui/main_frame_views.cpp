@@ -159,7 +159,7 @@ CFormMakView* CMainFrame::MakeMaker(const FormDef& form, FormMaker::Start start)
                                               .database = session_.Location(),
                                               .store = session_.Store(),
                                               .prompt = session_.Prompt()},
-                                    .dialogs = MakerDialogsOf(),
+                                    .dialogs = DialogsOfMaker(),
                                     .words = options.words,
                                     .holdTimeMs = options.holdTimeMs},
                                    this);
