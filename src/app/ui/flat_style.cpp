@@ -74,6 +74,22 @@ void DrawPushButton(QPainter& painter, const QStyleOption& option)
             isDefault ? Role(LookRole::Accent, option) : EdgeOf(option, nullptr));
 }
 
+// Of a tab: quiet, with a ground where the mouse is.
+void DrawCross(QPainter& painter, const QStyleOption& option)
+{
+    constexpr int kHalfPx = 4;
+    const bool over = option.state & (QStyle::State_MouseOver | QStyle::State_Sunken);
+    if (over)
+        DrawBox(painter, option.rect, ButtonGround(option), {});
+    const QPointF middle = QRectF(option.rect).center();
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(QPen(Role(over ? LookRole::Text : LookRole::Dim, option), 1.3));
+    for (const qreal side : {-1.0, 1.0})
+        painter.drawLine(middle + QPointF(-kHalfPx, -kHalfPx * side), middle + QPointF(kHalfPx, kHalfPx * side));
+    painter.restore();
+}
+
 void DrawToolButton(QPainter& painter, const QStyleOption& option)
 {
     if (!(option.state & QStyle::State_AutoRaise)) {
@@ -208,6 +224,8 @@ void FlatStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* opti
         return DrawTick(*painter, *option);
     case PE_IndicatorRadioButton:
         return DrawRadio(*painter, *option);
+    case PE_IndicatorTabClose:
+        return DrawCross(*painter, *option);
     default:
         TouchTargetStyle::drawPrimitive(element, option, painter, widget);
     }

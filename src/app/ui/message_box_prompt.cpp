@@ -95,19 +95,17 @@ public:
             grid->addItem(new QSpacerItem(room + picture, 0), grid->rowCount(), 0, 1, grid->columnCount());
     }
 
-protected:
     // Buttons that do not stand side by side stand one above the other.
-    void showEvent(QShowEvent* event) override
+    void FitButtons()
     {
-        QMessageBox::showEvent(event);
+        constexpr int kAroundPx = 2 * spacing::kSection;
         auto* buttons = findChild<QDialogButtonBox*>();
-        if (!buttons || !parentWidget() || buttons->orientation() == Qt::Vertical ||
-            minimumSizeHint().width() <= parentWidget()->window()->width())
+        if (!buttons || !parentWidget() ||
+            buttons->sizeHint().width() + kAroundPx <= parentWidget()->window()->width())
             return;
         buttons->setOrientation(Qt::Vertical);
         for (QAbstractButton* button : buttons->buttons())
             button->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-        adjustSize();
     }
 };
 
@@ -137,6 +135,7 @@ QMessageBox::StandardButton Ask(const QString& text, const QString& note, QMessa
     WideBox box(icon, text, note, buttons);
     box.setDefaultButton(preset);
     box.setEscapeButton(buttons & QMessageBox::No ? QMessageBox::No : preset);
+    box.FitButtons();
     const UsualCursor answering;
     return QMessageBox::StandardButton(box.exec());
 }
@@ -222,6 +221,7 @@ UserPrompt::Answer MessageBoxPrompt::AskYesNoOr(const UserMessage& question, con
     const QAbstractButton* other = box.addButton(third.Text(), QMessageBox::AcceptRole);
     box.setDefaultButton(QMessageBox::No);
     box.setEscapeButton(QMessageBox::No);
+    box.FitButtons();
     const int pressed = box.exec();
     if (box.clickedButton() == other)
         return Answer::Third;
