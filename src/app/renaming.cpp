@@ -44,7 +44,7 @@ bool MendAll(FormStore& store, const std::vector<NameChange>& changes)
 {
     if (changes.size() == 1)
         return !MendNames(store, changes.front()).empty();
-    const auto between = [](size_t i) { return u"mirel renaming %1"_s.arg(i); };
+    const auto between = [](size_t i) { return u"mirel_renaming_%1"_s.arg(i); };
     bool any = false;
     for (size_t i = 0; i < changes.size(); ++i)
         any = !MendNames(store, {changes[i].what, changes[i].table, changes[i].from, between(i)}).empty() || any;

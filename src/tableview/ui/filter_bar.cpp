@@ -53,7 +53,7 @@ FilterChip::FilterChip(const OpenResult::Filter& filter, QWidget* parent)
 
 int FilterChip::WholeWidth() const
 {
-    return words_->fontMetrics().horizontalAdvance(text_) + kTouchPx + 2 * spacing::kRoom;
+    return words_->fontMetrics().horizontalAdvance(text_) + 2 + kTouchPx + 2 * spacing::kRoom;
 }
 
 void FilterChip::FitTo(int widthPx)
