@@ -259,7 +259,7 @@ TEST_F(ResultCommandsTest, LeadsThroughTheStepsOfAnExport)
 {
     ExportDraft draft(connection, path, prompt);
     ASSERT_TRUE(draft.SetSource(u"SELECT Name,Age FROM People"_s));
-    CExportWizard wizard(draft, u"People"_s, path, &view);
+    CExportWizard wizard(draft, u"People"_s, path, {}, &view);
     wizard.show();
     const auto button = [&wizard](Str text) {
         const QList<QPushButton*> buttons = wizard.findChildren<QPushButton*>();
@@ -270,7 +270,7 @@ TEST_F(ResultCommandsTest, LeadsThroughTheStepsOfAnExport)
     EXPECT_FALSE(button(Str::ExportQuery)->isEnabled());
     EXPECT_TRUE(draft.ChoosePath(folder.filePath(u"missing/people.csv"_s)));
 
-    CExportWizard ready(draft, u"People"_s, path, &view);
+    CExportWizard ready(draft, u"People"_s, path, {}, &view);
     ready.show();
     const auto next = [&ready] {
         const QList<QPushButton*> buttons = ready.findChildren<QPushButton*>();
@@ -315,7 +315,7 @@ TEST_F(ResultCommandsTest, FillsAHandheldsWindowAndNoMore)
     view.resize(240, 320);
     ExportDraft draft(connection, path, prompt);
     ASSERT_TRUE(draft.SetSource(u"SELECT * FROM People"_s));
-    CExportWizard wizard(draft, u"People"_s, path, &view);
+    CExportWizard wizard(draft, u"People"_s, path, {}, &view);
     CFilterDialog filter(
         lists, u"People"_s, u"Note"_s, longNote, [](const QString&) { return true; }, &view);
     CSortDialog sort(lists, u"People"_s, u"Age"_s, &view);
