@@ -417,8 +417,8 @@ void FormMender::MendDropDown(ControlDef& control)
     const DropDownSource before = SplitDropDown(control.source.Text());
     DropDownSource after = before;
     after.query = mender_.Statement(before.query, {});
-    const qsizetype items = control.hasSource != 0 ? DropDownItems(before.data).size() : 0;
-    if (items == 1)
+    const qsizetype items = DropDownItems(before.data).size();
+    if (control.hasSource != 0 && items == 1)
         after.data = mender_.Expression(before.data, ExprMode::Condition, mayBeBare_);
     if (ShowsItsOwn(control) && after.data == before.data) {
         if (items == 0) {

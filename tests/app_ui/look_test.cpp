@@ -77,8 +77,9 @@ TEST(Look, FindsItsRolesInAnyPalette)
 // form stores is no such name.
 TEST(Look, IsTheOnlyPlaceThatNamesColors)
 {
-    const QStringList choosing = {u"look_roles"_s, u"colors_dialog"_s, u"fonts_dialog"_s, u"display_look"_s,
-                                  u"view_look"_s,  u"control_look"_s,  u"theme_icon"_s};
+    const QStringList choosing = {u"look_roles"_s,   u"colors_dialog"_s, u"fonts_dialog"_s,
+                                  u"display_look"_s, u"view_look"_s,     u"control_look"_s,
+                                  u"theme_icon"_s,   u"pdf_export"_s}; // paper is white, ink black
     static const QRegularExpression named(
         u"\\bQColor\\s*[({]\\s*[\"\\d]|\\bQt::(black|white|red|green|blue|cyan|magenta|yellow|gray|dark\\w+|light\\w+Gray)\\b|#[0-9a-fA-F]{6}"_s);
     QDirIterator files(QStringLiteral(MIREL_SOURCE_DIR "/src"), {u"*.cpp"_s, u"*.h"_s}, QDir::Files,

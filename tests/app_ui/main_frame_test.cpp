@@ -160,7 +160,7 @@ TEST_F(MainFrameTest, ADroppedDatabaseOpensAndClosesTheTablesOfTheOneBefore)
     ASSERT_TRUE(Commands().NewDatabase(PathOf(u"other.cdb"_s)));
     ASSERT_TRUE(Commands().OpenDatabase(PathOf(u"shop.cdb"_s)));
     ASSERT_TRUE(OpenBirds());
-    EXPECT_FALSE(Drop(PathOf(u"notes.txt"_s)));
+    EXPECT_FALSE(Drop(PathOf(u"picture.png"_s)));
     EXPECT_TRUE(Drop(PathOf(u"other.cdb"_s)));
     EXPECT_EQ(State().DatabaseName(), u"other.cdb"_s);
     EXPECT_TRUE(Frame().windowTitle().contains(u"other.cdb"_s));

@@ -31,6 +31,10 @@ CStatementDialog::CStatementDialog(const QString& statement, Edit edit, QWidget*
         change->setToolTip(StringText(Str::StatementEditTip));
         connect(change, &QPushButton::clicked, this, &QDialog::accept);
     }
+    for (QAbstractButton* button : buttons->buttons()) { // three of them stand side by side on a small screen
+        button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
+        button->setMinimumWidth(4 * fontMetrics().height());
+    }
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     auto* column = new QVBoxLayout(this);
     column->addWidget(text, 1);
