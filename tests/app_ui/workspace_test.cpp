@@ -6,6 +6,8 @@
 #include "app/ui/view_window.h"
 #include "app_ui/program_fixture.h"
 #include "forms/ui/form_eng_view.h"
+#include "querybuilder/ui/query_dialog.h"
+#include "querybuilder/ui/statement_edit.h"
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/sqlite_file.h"
@@ -23,6 +25,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenuBar>
+#include <QPushButton>
 #include <QTabBar>
 #include <QTemporaryDir>
 #include <QTest>
@@ -425,6 +428,65 @@ TEST_F(WorkspaceTest, EveryPartHasANameForThoseWhoDoNotSee)
             EXPECT_TRUE(named) << widget->metaObject()->className() << " " << widget->objectName().toStdString();
         }
     }
+}
+
+TEST_F(WorkspaceTest, AQueryIsWrittenOpenedAndChangedWithItsViewFollowing)
+{
+    const auto inBuilder = [&](ShellCommand command, const std::function<void(CQueryDialog&)>& work) {
+        QTimer::singleShot(0, &Frame(), [&] {
+            auto* dialog = qobject_cast<CQueryDialog*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(dialog);
+            work(*dialog);
+        });
+        Command(command)->trigger();
+    };
+    const auto sql = [](CQueryDialog& dialog) -> StatementEdit& {
+        return *dialog.findChild<StatementEdit*>(u"sql"_s);
+    };
+    const ViewKey few{EntryKind::Query, u"Few"_s};
+
+    for (const QSize size : {kWide, kNarrow}) {
+        Frame().resize(size);
+        State().SetTab(MainTab::Table); // a new query is about the chosen table
+        State().Select({EntryKind::Table, kBirds.name, {}, false});
+        State().SetTab(MainTab::Query);
+        const QString statement = size == kWide ? u"SELECT Name FROM Birds"_s : u"SELECT Wings FROM Birds"_s;
+        if (size == kWide) {
+            inBuilder(ShellCommand::New, [&](CQueryDialog& dialog) {
+                QTest::keyClicks(dialog.findChild<QLineEdit*>(u"queryName"_s), few.name);
+                sql(dialog).setPlainText(statement);
+                dialog.findChild<QPushButton*>(u"save"_s)->click();
+            });
+            ASSERT_TRUE(std::as_const(Session().Store()).FindQuery(few.name))
+                << prompt_.shown.join(u' ').toStdString();
+            ASSERT_TRUE(Open(few)) << prompt_.shown.join(u' ').toStdString();
+        } else {
+            State().Select({EntryKind::Query, few.name, {}, false});
+            inBuilder(ShellCommand::Edit, [&](CQueryDialog& dialog) {
+                EXPECT_EQ(sql(dialog).toPlainText(), u"SELECT Name FROM Birds"_s);
+                sql(dialog).setPlainText(statement);
+                dialog.findChild<QPushButton*>(u"save"_s)->click();
+            });
+        }
+        ASSERT_TRUE(std::as_const(Session().Store()).FindQuery(few.name));
+        EXPECT_EQ(std::as_const(Session().Store()).FindQuery(few.name)->text.Text(), statement);
+        EXPECT_EQ(Open(few)->Browser().Statement(), statement) << "the open view follows";
+    }
+
+    // One of a megabyte opens and comes back as it was.
+    QString longOne = u"SELECT Name FROM Birds WHERE Name IN ('Wren'"_s;
+    while (longOne.size() < 1'000'000)
+        longOne += u",\n'a name that no bird bears'"_s;
+    longOne += u')';
+    inBuilder(ShellCommand::Edit, [&](CQueryDialog& dialog) {
+        sql(dialog).setPlainText(longOne);
+        dialog.findChild<QPushButton*>(u"save"_s)->click();
+    });
+    inBuilder(ShellCommand::Edit, [&](CQueryDialog& dialog) {
+        EXPECT_EQ(sql(dialog).toPlainText().size(), longOne.size());
+        dialog.reject();
+    });
+    EXPECT_EQ(std::as_const(Session().Store()).FindQuery(few.name)->text.Text(), longOne);
 }
 
 } // namespace

@@ -8,7 +8,7 @@ class QWidget;
 
 namespace mirel {
 
-// How this room has a statement written by the query builder, which is a floor of its own. Whoever makes the views
+// How this room has a statement written by the query builder, which is a floor of its own. The maker of the views
 // gives them the function.
 struct QueryWanted {
     QString statement; // what it begins with
