@@ -11,9 +11,10 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+// As the dialect has it.
 bool IsBlank(QChar c)
 {
-    return c == u' ' || c == u'\t' || c == u'\n' || c == u'\r';
+    return c.isSpace();
 }
 
 // The character that ends a run beginning with `opening`; null when nothing begins there.

@@ -13,6 +13,8 @@
 #include "forms/ui/form_mak_view.h"
 #include "forms/ui/form_surface.h"
 #include "forms/ui/property_sheet.h"
+#include "querybuilder/ui/query_dialog.h"
+#include "querybuilder/ui/statement_edit.h"
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/scripted_prompt.h"
@@ -413,6 +415,32 @@ TEST_P(FormMakerWindow, ItsMenusFollowTheSelection)
     const int count = maker.Maker().Design().Count();
     QTest::keyClick(&maker.Surface(), Qt::Key_V, Qt::ControlModifier);
     EXPECT_EQ(maker.Maker().Design().Count(), count + 1);
+}
+
+TEST_P(FormMakerWindow, TheQueryOfAButtonIsWrittenInTheQueryBuilder)
+{
+    New();
+    Place(Str::MakerNewButton, {10, 206});
+    InSheet([this](QWidget& sheet) {
+        Pick(sheet, Str::PropFunction, u"SELECT"_s);
+        TypeInto(Named<QPlainTextEdit>(sheet, Str::PropSelectText), u"WHERE Wings=2"_s);
+        bool met = false;
+        QTimer::singleShot(100, &frame_, [&met] { // once the builder stands over the sheet
+            auto* dialog = qobject_cast<CQueryDialog*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(dialog);
+            met = true;
+            auto* sql = dialog->findChild<StatementEdit*>(u"sql"_s);
+            EXPECT_EQ(sql->toPlainText(), u"WHERE Wings=2"_s) << "the select clause is fixed";
+            sql->setPlainText(u"WHERE Wings>2"_s);
+            dialog->findChild<QPushButton*>(u"save"_s)->click();
+        });
+        Press(sheet, Str::PropBuilder);
+        EXPECT_TRUE(met);
+        EXPECT_EQ(Named<QPlainTextEdit>(sheet, Str::PropSelectText)->toPlainText(), u"WHERE Wings>2"_s);
+    });
+    const FormDesign& design = Maker()->Maker().Design();
+    EXPECT_TRUE(design.Control(design.Count() - 1).source.Text().endsWith(u"WHERE Wings>2"_s))
+        << design.Control(design.Count() - 1).source.Text().toStdString();
 }
 
 TEST_P(FormMakerWindow, ClosesOnlyAsTheUserSays)
