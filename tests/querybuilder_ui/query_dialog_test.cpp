@@ -76,6 +76,7 @@ protected:
         QApplication::processEvents();
         const QString folderName = qEnvironmentVariable("MIREL_PICTURES");
         if (!folderName.isEmpty()) {
+            QTest::qWait(300); // a page that was just shown is laid out in steps
             EXPECT_TRUE(shown.grab().save(
                 QDir(folderName).filePath(u"query-%1-%2.png"_s.arg(name, narrow ? u"240"_s : u"1100"_s))));
         }

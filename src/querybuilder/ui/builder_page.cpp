@@ -54,15 +54,16 @@ BuilderPage::BuilderPage(QueryDraft& draft, FieldLists& lists, std::function<Cho
         boxes_[i]->installEventFilter(this);
         connect(boxes_[i], &QPlainTextEdit::textChanged, this, &BuilderPage::TakeClauses);
         captions_[i] = Caption(i);
+        if (i == 0 && draft_.FixesSelect()) { // not to be changed, and not to take room
+            boxes_[i]->hide();
+            captions_[i]->hide();
+            continue;
+        }
         grid->addWidget(captions_[i], int(i), 0,
                         kBoxes[i].hasButton ? Qt::AlignTop : Qt::AlignTop | Qt::AlignRight);
         grid->addWidget(boxes_[i], int(i), 1);
     }
     grid->setColumnStretch(1, 1);
-    if (draft_.FixesSelect()) { // shown by the dialog, and not to be changed
-        boxes_[0]->hide();
-        captions_[0]->hide();
-    }
     SetNarrow(false);
 }
 
@@ -115,7 +116,8 @@ void BuilderPage::SetNarrow(bool narrow)
     for (size_t i = 0; i < kClauses; ++i) {
         const int lines = narrow ? 1 : kBoxes[i].wideLines;
         boxes_[i]->SetLines(lines, lines > 1 && kBoxes[i].kind != ClauseKind::Plain ? 0 : lines);
-        static_cast<QGridLayout*>(layout())->setRowStretch(int(i), narrow || lines == 1 ? 0 : lines);
+        const bool grows = !narrow && lines > 1 && !(i == 0 && draft_.FixesSelect());
+        static_cast<QGridLayout*>(layout())->setRowStretch(int(i), grows ? lines : 0);
     }
 }
 
