@@ -57,10 +57,10 @@ QMimeData* FieldList::mimeData(const QList<QListWidgetItem*>& items) const
 {
     if (items.isEmpty())
         return nullptr;
-    auto* data = new QMimeData;
-    data->setData(QLatin1StringView(DesignSurface::kFieldMime),
-                  items.first()->data(Qt::UserRole).toString().toUtf8());
-    return data;
+    auto* dragged = new QMimeData;
+    dragged->setData(QLatin1StringView(DesignSurface::kFieldMime),
+                     items.first()->data(Qt::UserRole).toString().toUtf8());
+    return dragged;
 }
 
 void FillFieldList(QListWidget& list, const std::vector<ResultField>& fields)

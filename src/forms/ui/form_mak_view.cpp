@@ -381,17 +381,17 @@ void CFormMakView::ChooseFont()
 
 void CFormMakView::Copy()
 {
-    auto* data = new QMimeData;
-    data->setData(kControlsMime, maker_.Design().CopySelected());
-    QGuiApplication::clipboard()->setMimeData(data);
+    auto* copied = new QMimeData;
+    copied->setData(kControlsMime, maker_.Design().CopySelected());
+    QGuiApplication::clipboard()->setMimeData(copied);
     ShowActions();
 }
 
 void CFormMakView::Paste()
 {
-    const QMimeData* data = QGuiApplication::clipboard()->mimeData();
-    if (data && data->hasFormat(kControlsMime))
-        (void)maker_.Design().Paste(data->data(kControlsMime));
+    const QMimeData* copied = QGuiApplication::clipboard()->mimeData();
+    if (copied && copied->hasFormat(kControlsMime))
+        (void)maker_.Design().Paste(copied->data(kControlsMime));
     ShowState();
 }
 

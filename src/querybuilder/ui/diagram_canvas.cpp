@@ -53,10 +53,10 @@ protected:
     Qt::DropActions supportedDropActions() const override { return Qt::LinkAction | Qt::CopyAction; }
     QMimeData* mimeData(const QList<QListWidgetItem*>& items) const override
     {
-        auto* data = new QMimeData;
+        auto* dragged = new QMimeData;
         if (!items.isEmpty())
-            data->setData(kFieldFormat, (source_ + kPartSeparator + items.first()->text()).toUtf8());
-        return data;
+            dragged->setData(kFieldFormat, (source_ + kPartSeparator + items.first()->text()).toUtf8());
+        return dragged;
     }
     void dropEvent(QDropEvent* event) override
     {
@@ -232,7 +232,7 @@ DiagramBox* DiagramCanvas::MakeBox(const DiagramTable& table)
         },
         Qt::QueuedConnection); // its box goes with it
     connect(box, &DiagramBox::joinMenuRequested, this,
-            [this, source](const QString& field, const QPoint& place) { OfferJoins(source, field, place); });
+            [this, source](const QString& field, const QPoint& at) { OfferJoins(source, field, at); });
     connect(box, &DiagramBox::moved, this, [this, box, source] {
         places_.insert(source, box->pos());
         FitToBoxes();
