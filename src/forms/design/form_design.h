@@ -50,6 +50,7 @@ public:
     HitZone ZoneAt(QPoint point, int handleSize) const;
     void BeginDrag(HitZone zone, QPoint at);
     bool IsDragging() const { return zone_ != HitZone::None; }
+    bool IsMoving() const { return zone_ == HitZone::Move; } // what is dragged keeps its size
     HitZone Zone() const { return zone_; }
     void DragTo(QPoint point);
     void EndDrag();    // all its steps are one for Undo

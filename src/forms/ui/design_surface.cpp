@@ -21,9 +21,10 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-constexpr int kHandlePx = 7;   // as drawn
-constexpr int kHoldPx = 10;    // as it is hit
-constexpr int kDotsApart = 10; // in the form's pixels
+constexpr qint64 kLargestPicturePx = 200'000; // of a control that is kept
+constexpr int kHandlePx = 7;                  // as drawn
+constexpr int kHoldPx = 10;                   // as it is hit
+constexpr int kDotsApart = 10;                // in the form's pixels
 constexpr int kFarthest = 8000;
 constexpr int kAroundPx = 8; // what handles and edges reach beyond a control
 
@@ -90,6 +91,7 @@ void DesignSurface::ShowState()
 void DesignSurface::SetZoom(qreal zoom)
 {
     zoom_ = zoom;
+    pictures_.clear();
     ShowState();
     update();
 }
@@ -147,6 +149,26 @@ void DesignSurface::PaintGrid(QPainter& painter, const QRect& area) const
     painter.drawPoints(points.constData(), int(points.size()));
 }
 
+// While controls are moved all of them look the same from one move to the next: they are drawn once and then
+// copied.
+void DesignSurface::PaintControl(QPainter& painter, int control, const QRect& place, const QPalette& colors)
+{
+    const ControlDef& def = design_.Control(control);
+    if (!design_.IsMoving() || qint64(place.width()) * place.height() > kLargestPicturePx)
+        return painter_.Paint(painter, def, place, zoom_, colors);
+    QPixmap& picture = pictures_[control];
+    if (picture.deviceIndependentSize().toSize() != place.size()) {
+        const qreal ratio = devicePixelRatioF();
+        picture = QPixmap(place.size() * ratio);
+        picture.setDevicePixelRatio(ratio);
+        picture.fill(Qt::transparent);
+        QPainter own(&picture);
+        own.setRenderHint(QPainter::Antialiasing);
+        painter_.Paint(own, def, QRect(QPoint(), place.size()), zoom_, colors);
+    }
+    painter.drawPixmap(place.topLeft(), picture);
+}
+
 void DesignSurface::PaintSelection(QPainter& painter) const
 {
     const QColor accent = ColorOfRole(LookRole::Accent, palette());
@@ -183,8 +205,10 @@ void DesignSurface::paintEvent(QPaintEvent* event)
     for (int control = 0; control < design_.Count(); ++control) {
         const QRect place = RectOf(control);
         if (place.isValid() && place.intersects(event->rect()))
-            painter_.Paint(painter, design_.Control(control), place, zoom_, colors);
+            PaintControl(painter, control, place, colors);
     }
+    if (!design_.IsMoving())
+        pictures_.clear();
     painter.setRenderHint(QPainter::Antialiasing, false);
     PaintSelection(painter);
     painter.setBrush(Qt::NoBrush);
@@ -207,6 +231,7 @@ void DesignSurface::changeEvent(QEvent* event)
     QWidget::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::PaletteChange) {
         painter_.Forget();
+        pictures_.clear();
         update();
     }
 }

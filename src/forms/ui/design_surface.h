@@ -4,6 +4,8 @@
 #include "forms/ui/control_painter.h"
 
 #include <QBasicTimer>
+#include <QHash>
+#include <QPixmap>
 #include <QWidget>
 
 #include <optional>
@@ -62,6 +64,7 @@ private:
     QRect OnWidget(const Edges& place) const;
     QRect SelectionRect() const;
     void PaintGrid(QPainter& painter, const QRect& area) const;
+    void PaintControl(QPainter& painter, int control, const QRect& place, const QPalette& colors);
     void PaintSelection(QPainter& painter) const;
     void ShowCursor(QPoint at);
     void SelectUnder(QPoint at);
@@ -70,6 +73,7 @@ private:
 
     FormDesign& design_;
     ControlPainter painter_;
+    QHash<int, QPixmap> pictures_; // of the controls, while some are moved
     qreal zoom_ = 1;
     std::optional<ControlType> placing_;
     quint64 shown_ = 0; // the design's revision
