@@ -6,8 +6,9 @@
 
 namespace mirel::sqlite {
 
-SortKeys::SortKeys()
+void SortKeys::Open()
 {
+    opened_ = true;
     UErrorCode status = U_ZERO_ERROR;
     const QByteArray language = UserLocale::Current().Locale().name().toLatin1();
     collator_.reset(ucol_open(language.constData(), &status));
@@ -17,6 +18,8 @@ SortKeys::SortKeys()
 
 std::span<const uint8_t> SortKeys::KeyOf(std::string_view utf8)
 {
+    if (!opened_)
+        Open();
     if (!collator_)
         return {reinterpret_cast<const uint8_t*>(utf8.data()), utf8.size()};
     if (units_.size() < utf8.size())

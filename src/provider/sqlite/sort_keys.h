@@ -13,16 +13,17 @@ namespace mirel::sqlite {
 // byte by byte.
 class SortKeys {
 public:
-    SortKeys();
-
     // Borrowed until the next call; without the closing zero.
     std::span<const uint8_t> KeyOf(std::string_view utf8);
 
 private:
+    void Open();
+
     struct Closer {
         void operator()(UCollator* collator) const { ucol_close(collator); }
     };
 
+    bool opened_ = false;                         // it takes as long as opening the file, and few need it
     std::unique_ptr<UCollator, Closer> collator_; // null when the library has no data at all
     std::vector<char16_t> units_;
     std::vector<uint8_t> key_;
