@@ -9,6 +9,7 @@
 #include <QPageSize>
 #include <QPainter>
 #include <QPdfWriter>
+#include <QTextOption>
 
 #include <algorithm>
 #include <vector>
@@ -133,14 +134,18 @@ private:
             widths_.push_back(std::max(lineHeight_ / 2, (width + padding) * scale * squeeze - 2 * padding_));
     }
 
-    double HeightOf(const QString& text, double width) const
+    double HeightOf(const QString& text, double width)
     {
-        if (!text.contains(u'\n') &&
-            QFontMetricsF(font_, const_cast<QPdfWriter*>(&writer_)).horizontalAdvance(text) <= width)
+        if (!text.contains(u'\n') && QFontMetricsF(painter_.font(), &writer_).horizontalAdvance(text) <= width)
             return lineHeight_;
-        return QFontMetricsF(font_, const_cast<QPdfWriter*>(&writer_))
-            .boundingRect(QRectF(0, 0, width, 1e6), Qt::TextWordWrap | Qt::TextWrapAnywhere, text)
-            .height();
+        return painter_.boundingRect(QRectF(0, 0, width, 1e6), text, Wrapped(Qt::AlignLeft)).height();
+    }
+    // Between words where that is possible.
+    static QTextOption Wrapped(Qt::Alignment alignment)
+    {
+        QTextOption option(alignment | Qt::AlignTop);
+        option.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+        return option;
     }
 
     void BeginPage()
@@ -154,7 +159,7 @@ private:
         double height = lineHeight_;
         for (size_t i = 0; i < fields_.size(); ++i) {
             names += fields_[i].name;
-            height = std::max(height, HeightOf(names.back(), widths_[i] / kBoldIsWider));
+            height = std::max(height, HeightOf(names.back(), widths_[i]));
         }
         DrawRow(names, std::min(height, writer_.height() / 4.0));
         painter_.setFont(font_);
@@ -178,10 +183,7 @@ private:
             const bool right = IsNumber(fields_[i].type);
             painter_.save();
             painter_.setClipRect(place);
-            painter_.drawText(place,
-                              (right ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignTop | Qt::TextWordWrap |
-                                  Qt::TextWrapAnywhere,
-                              texts.value(qsizetype(i)));
+            painter_.drawText(place, texts.value(qsizetype(i)), Wrapped(right ? Qt::AlignRight : Qt::AlignLeft));
             painter_.restore();
             x += widths_[i] + 2 * padding_;
         }
