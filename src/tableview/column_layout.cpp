@@ -62,7 +62,7 @@ void ColumnLayout::SetWidth(int column, int widthPx)
     leftPx_.clear();
 }
 
-void ColumnLayout::FitAnew(int column)
+void ColumnLayout::FitToPage(int column)
 {
     columns_[size_t(column)].byHand = false;
     columns_[size_t(column)].content = {};

@@ -34,7 +34,7 @@ public:
         int fractionPx = 0; // from the point on
     };
     // Forgets what the columns have held, and the widths set by hand.
-    void FitAnew(int column);
+    void FitToPage(int column);
     void Grow(int column, const Content& content);
     int FractionPx(int column) const { return columns_[size_t(column)].content.fractionPx; }
     // Gives the columns that are not set by hand the width of their content, `marginPx` on either side, but no

@@ -59,7 +59,7 @@ TEST_F(Columns, AreResizedByTheNearestEdgeWithinReach)
     layout_.SetByHand(0, -50);
     EXPECT_EQ(layout_.WidthPx(0), ColumnLayout::kNarrowestPx);
     EXPECT_TRUE(layout_.IsByHand(0));
-    layout_.FitAnew(0);
+    layout_.FitToPage(0);
     EXPECT_FALSE(layout_.IsByHand(0));
 }
 
@@ -84,7 +84,7 @@ TEST_F(Columns, GrowWithTheirContentAndNeverShrinkByThemselves)
         EXPECT_EQ(layout_.WidthPx(1), page.widthPx) << page.what;
     }
     EXPECT_EQ(layout_.WidthPx(2), 50) << "set by hand";
-    layout_.FitAnew(1);
+    layout_.FitToPage(1);
     layout_.Grow(1, {10, 5});
     layout_.TakeContentWidths(kMarginPx, kViewPx);
     EXPECT_EQ(layout_.WidthPx(1), 26) << "when it was asked to";

@@ -124,7 +124,7 @@ void RecordGrid::ShowState()
     if (shownPage_ != browser_.PageRevision() || otherColumns) {
         shownPage_ = browser_.PageRevision();
         if (browser_.Settings().autoSizing || otherColumns)
-            FitToContent(otherColumns ? Fit::Anew : Fit::Grow);
+            FitToContent(otherColumns ? Fit::Whole : Fit::Grow);
         if (otherColumns)
             TakeUpWidths();
     }
@@ -190,7 +190,7 @@ void RecordGrid::FitAllColumns()
         widthsByHand_.clear();
     else
         detailNamesPx_ = 0;
-    FitToContent(Fit::Anew);
+    FitToContent(Fit::Whole);
     UpdateScrollBars();
     header_->update();
     viewport()->update();
@@ -202,7 +202,7 @@ void RecordGrid::FitColumn(int column)
         return;
     if (browser_.CurrentPresentation() == Presentation::List)
         widthsByHand_.remove(browser_.Page().columns[size_t(column)].title);
-    layout_.FitAnew(column);
+    layout_.FitToPage(column);
     TakeUpContent(column);
     TakeContentWidths();
     UpdateScrollBars();
@@ -214,8 +214,8 @@ void RecordGrid::FitColumn(int column)
 void RecordGrid::FitToContent(Fit fit)
 {
     for (int column = 0; column < layout_.Count(); ++column) {
-        if (fit == Fit::Anew)
-            layout_.FitAnew(column);
+        if (fit == Fit::Whole)
+            layout_.FitToPage(column);
         TakeUpContent(column);
     }
     TakeContentWidths();
@@ -420,7 +420,7 @@ void RecordGrid::changeEvent(QEvent* event)
     QAbstractScrollArea::changeEvent(event);
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) {
         TakeUpFont();
-        FitToContent(Fit::Anew);
+        FitToContent(Fit::Whole);
         TakeUpWidths();
         resizeEvent(nullptr);
     }

@@ -70,8 +70,8 @@ protected:
 private:
     void TakeUpFont();
     void PlaceHeader();
-    // Grows the columns with the page; Anew: fits them to it alone.
-    enum class Fit { Grow, Anew };
+    // Grows the columns with the page; Whole: fits them to it alone.
+    enum class Fit { Grow, Whole };
     void FitToContent(Fit fit);
     void TakeUpContent(int column);
     void TakeContentWidths();
