@@ -154,6 +154,8 @@ void CMainFrame::MakeMenus()
     databaseMenu_->addMenu(recentMenu_);
     actions_->FillMenu(*helpMenu_, ShellHelpMenu);
     windowMenu_->setToolTipsVisible(true);
+    actions_->FillMenu(*windowMenu_,
+                       ShellWindowMenu); // before it is filled each time: it learns which keys to leave out
     corner_ = new QToolButton(menuBar());
     corner_->setAutoRaise(true);
     corner_->setPopupMode(QToolButton::InstantPopup);
@@ -225,8 +227,11 @@ void CMainFrame::ShowTitle()
     const QString name = front && !wide_ ? tabs_->TitleAt(tabs_->Current())
                          : wide_         ? database
                                          : StringText(Str::OpenViews);
-    corner_->setText(
-        corner_->fontMetrics().elidedText(name, Qt::ElideMiddle, width() / kCornerShare).replace(u'&', u"&&"_s));
+    const QString shown =
+        corner_->fontMetrics().elidedText(name, Qt::ElideMiddle, width() / kCornerShare).replace(u'&', u"&&"_s);
+    if (shown != corner_->text())
+        corner_->hide(); // the bar measures a corner only when it comes to show
+    corner_->setText(shown);
     corner_->setToolTip(wide_ ? QDir::toNativeSeparators(state_.DatabasePath()).toHtmlEscaped()
                               : name.toHtmlEscaped());
     corner_->setVisible(state_.HasDatabase() && (wide_ || tabs_->Count() > 0) && !alone_);

@@ -18,7 +18,7 @@ void ElidedLabel::SetText(const QString& text)
 
 QSize ElidedLabel::sizeHint() const
 {
-    return {fontMetrics().horizontalAdvance(text_), fontMetrics().height()};
+    return {fontMetrics().horizontalAdvance(text_) + 1, fontMetrics().height()}; // fractions are cut off
 }
 
 QSize ElidedLabel::minimumSizeHint() const

@@ -249,9 +249,10 @@ QWidget* CExportWizard::SeparatorPage()
     auto* options = new QVBoxLayout(csvOptions_);
     options->setContentsMargins({});
     options->addWidget(Separators(csvOptions_));
-    auto* row = new QHBoxLayout;
+    const bool narrow = parentWidget() && IsHandheldSize(parentWidget()->window()->size());
+    auto* row = new QBoxLayout(narrow ? QBoxLayout::TopToBottom : QBoxLayout::LeftToRight);
     row->addWidget(header, 1);
-    row->addWidget(advanced);
+    row->addWidget(advanced, 0, Qt::AlignRight);
     options->addLayout(row);
     column->addWidget(csvOptions_);
     column->addWidget(title);

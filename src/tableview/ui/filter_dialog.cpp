@@ -22,6 +22,7 @@
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QRegularExpression>
+#include <QScreen>
 #include <QTabWidget>
 #include <QTimer>
 #include <QVBoxLayout>
@@ -98,6 +99,7 @@ void FilterTerm::SetOperator(const QString& operatorText)
 void FilterTerm::SetValue(const QString& displayText)
 {
     value_->SetText(displayText);
+    value_->Line()->setCursorPosition(0); // its beginning shows
 }
 
 QString FilterTerm::Operator() const
@@ -172,7 +174,15 @@ CFilterDialog::CFilterDialog(FieldLists& lists, const QString& table, const QStr
     single_->SetOperator(lists_.TypeOf(field_->Table(), field_->Field()) == FieldType::YesNo
                              ? FilterDraft::PresetYesNo(displayText)
                              : single_->Operator());
-    resize(sizeHint().expandedTo({60 * fontMetrics().averageCharWidth(), 0}));
+    // All of it shows where the screen has the room.
+    ensurePolished();
+    QSize whole;
+    for (int tab = 0; tab < tabs_->count(); ++tab)
+        whole = whole.expandedTo(tabs_->widget(tab)->sizeHint());
+    resize(sizeHint()
+               .expandedTo(whole + QSize(0, sizeHint().height() - tabs_->currentWidget()->sizeHint().height()))
+               .expandedTo({60 * fontMetrics().averageCharWidth(), 0})
+               .boundedTo(screen()->availableSize()));
     QTimer::singleShot(kFocusDelayMs, single_, [this] {
         if (tabs_->currentIndex() == 0)
             single_->FocusValue();

@@ -2,6 +2,7 @@
 
 #include "platform/ui/elided_label.h"
 #include "platform/ui/look_roles.h"
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
@@ -43,8 +44,10 @@ FindLine::FindLine(RecordBrowser& browser, const Actions& actions, QWidget* pare
     setMinimumWidth(1); // what is in it gives way, never the window
     text_->setPlaceholderText(StringText(Str::FindPrompt));
     text_->setAccessibleName(StringText(Str::FindPrompt));
-    text_->setClearButtonEnabled(true);
-    text_->addAction(ThemeIcon(u"edit-find"), QLineEdit::LeadingPosition);
+    if (!IsHandheldSize(parent->window()->size())) { // there the letters need the room
+        text_->setClearButtonEnabled(true);
+        text_->addAction(ThemeIcon(u"edit-find"), QLineEdit::LeadingPosition);
+    }
     note_->setForegroundRole(QPalette::PlaceholderText);
     text_->setMinimumWidth(1);
     row->addWidget(text_, 2);

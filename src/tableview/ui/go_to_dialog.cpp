@@ -1,5 +1,6 @@
 #include "tableview/ui/go_to_dialog.h"
 
+#include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
 #include <QDialogButtonBox>
@@ -40,6 +41,7 @@ CGoToDialog::CGoToDialog(qint64 record, QWidget* parent)
     choices_.front()->setChecked(true);
     number_->setFocus();
     number_->selectAll();
+    FillSmallWindow(*this, *parent->window());
 }
 
 QRadioButton* CGoToDialog::AddChoice(const QString& text)

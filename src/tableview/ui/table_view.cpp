@@ -60,7 +60,7 @@ CTableView::CTableView(DbConnection& connection, const DatabaseLocation& databas
     LayOut();
     ConnectParts();
     ShowState();
-    grid_->setFocus();
+    setFocusProxy(grid_);
 }
 
 CTableView::~CTableView() = default;
