@@ -164,7 +164,7 @@ TEST_F(Walk, GoesThroughTheDialogs)
 TEST_F(Walk, GoesThroughTheTableView)
 {
     MakeLongNames();
-    for (const QSize size : {QSize(200, 200), kUpright, kFlat, kDesktop}) {
+    for (const QSize size : {QSize(200, 200), kUpright, kFlat, kDesktop, QSize(4000, 3000)}) {
         CTableView view(connection, path, prompt, {});
         view.resize(size);
         ASSERT_TRUE(view.OpenTable(u"Long names"_s));

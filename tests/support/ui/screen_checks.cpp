@@ -33,7 +33,7 @@ bool IsPartOfAnother(const QWidget& widget)
     return widget.objectName().startsWith(u"qt_") || qobject_cast<const QComboBox*>(parent) ||
            qobject_cast<const QAbstractSpinBox*>(parent) || qobject_cast<const QAbstractItemView*>(parent) ||
            (parent && parent->inherits("QTabBar")) || (parent && parent->inherits("QLineEdit")) ||
-           widget.inherits("QTabBar") || widget.inherits("QScrollBar");
+           widget.inherits("QTabBar") || widget.inherits("QScrollBar") || widget.inherits("QHeaderView");
 }
 
 void ExpectWithin(QWidget& part, QWidget& whole, const std::string& where)
@@ -65,8 +65,12 @@ void ExpectReachable(QWidget& part, const std::string& where)
     if (!operated || !part.isEnabled() || (line && line->isReadOnly()))
         return;
     EXPECT_FALSE(NameOf(part).isEmpty()) << where << " has no name";
-    // The button of a date has its keys in the date's line.
-    const bool hasKeyElsewhere = button && part.parentWidget()->inherits("mirel::DateField");
+    // The button of a date or of a long text has its keys in the box; tool bars and the corner of a menu bar offer
+    // what menus do, too.
+    const QWidget* parent = part.parentWidget();
+    const bool hasKeyElsewhere =
+        button && (parent->inherits("mirel::DateField") || part.objectName().endsWith(u".strip"_s) ||
+                   parent->inherits("QToolBar") || parent->inherits("QMenuBar"));
     EXPECT_TRUE((part.focusPolicy() & Qt::TabFocus) || hasKeyElsewhere) << where << " is out of Tab's way";
 }
 
