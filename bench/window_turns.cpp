@@ -5,6 +5,10 @@
 // mirel-bench-window page DATABASE        turning pages of the table Birds, against a QTableView in turns; prints
 //                                         a line as mirel-bench-engine does
 // mirel-bench-window drag                 dragging controls in the form maker
+// mirel-bench-window import DATABASE CSV  the import wizard from its file to the last step, into a new table; says
+//                                         what the last step took and how often the window was repainted meanwhile
+#include "app/ui/message_box_prompt.h"
+#include "csvimport/ui/import_wizard.h"
 #include "forms/ui/design_surface.h"
 #include "forms/ui/form_mak_view.h"
 #include "tableview/record_browser.h"
@@ -12,14 +16,19 @@
 
 #include <QAbstractTableModel>
 #include <QApplication>
+#include <QElapsedTimer>
 #include <QHeaderView>
 #include <QImage>
 #include <QLabel>
 #include <QMainWindow>
 #include <QMenuBar>
+#include <QMessageBox>
 #include <QMouseEvent>
+#include <QPushButton>
 #include <QScrollBar>
+#include <QStackedWidget>
 #include <QTableView>
+#include <QTimer>
 
 #include <algorithm>
 #include <cmath>
@@ -212,6 +221,76 @@ int DragControls()
     return 0;
 }
 
+// Counts how often any window is repainted, and the longest time without that.
+class Repaints : public QObject {
+public:
+    void Begin()
+    {
+        count_ = 0;
+        longestMs_ = 0;
+        since_.start();
+    }
+    int Count() const { return count_; }
+    qint64 LongestMs() const { return std::max(longestMs_, since_.elapsed()); }
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override
+    {
+        if (event->type() == QEvent::UpdateRequest && watched->isWidgetType()) {
+            ++count_;
+            longestMs_ = std::max(longestMs_, since_.restart());
+        }
+        return QObject::eventFilter(watched, event);
+    }
+
+private:
+    int count_ = 0;
+    qint64 longestMs_ = 0;
+    QElapsedTimer since_;
+};
+
+int ImportByWizard(const QString& database, const QString& csv)
+{
+    DbConnection connection;
+    MessageBoxPrompt prompt;
+    ImportDraft draft(connection, database, prompt);
+    QWidget window;
+    window.resize(kWindowSize);
+    window.show();
+    CImportWizard wizard(draft, prompt, csv, &window);
+    wizard.show();
+    wizard.Begin(ImportSource::OfFile(csv));
+    QTimer answers; // "imported."
+    QObject::connect(&answers, &QTimer::timeout, &answers, [] {
+        if (auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget()))
+            box->accept();
+    });
+    answers.start(1);
+    const auto goOn = [&wizard] {
+        for (auto* button : wizard.findChildren<QPushButton*>()) {
+            if (button->isDefault())
+                button->click();
+        }
+    };
+    const auto* pages = wizard.findChild<QStackedWidget*>();
+    while (pages->currentIndex() + 1 < pages->count())
+        goOn();
+    Repaints repaints;
+    qApp->installEventFilter(&repaints);
+    QElapsedTimer clock;
+    clock.start();
+    repaints.Begin();
+    const double begin = ProcessorMs();
+    while (wizard.isVisible())
+        goOn();
+    const double seconds = double(clock.elapsed()) / 1e3;
+    std::fprintf(stderr,
+                 "last step: %.0f ms of processor time, %.2f s by the clock, %.1f repaints a second, %lld ms at "
+                 "the most between two\n",
+                 ProcessorMs() - begin, seconds, repaints.Count() / seconds, (long long)repaints.LongestMs());
+    return 0;
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -230,7 +309,9 @@ int main(int argc, char** argv)
     }
     if (what == u"page")
         return TurnPages(words.value(2));
+    if (what == u"import")
+        return ImportByWizard(words.value(2), words.value(3));
     if (what == u"drag")
         return DragControls();
-    Fail(u"mirel-bench-window bare|grid|page|drag …"_s);
+    Fail(u"mirel-bench-window bare|grid|page|drag|import …"_s);
 }

@@ -46,8 +46,9 @@ void Act(FormDesign& design, Bytes& bytes, QByteArray& copied)
     const auto control = [&] { return count == 0 ? -1 : bytes.Next() % count; };
     switch (bytes.Next() % 16) {
     case 0:
-        return design.AddControl(ControlTypes()[bytes.Next() % ControlTypes().size()].type,
-                                 {bytes.Signed(), bytes.Signed()});
+        return count >= 60 ? design.SelectNone()
+                           : design.AddControl(ControlTypes()[bytes.Next() % ControlTypes().size()].type,
+                                               {bytes.Signed(), bytes.Signed()});
     case 1:
         return count > 0 ? design.SelectOnly(control()) : design.SelectNone();
     case 2:

@@ -41,10 +41,13 @@ bool HasName(const FormDef& form, const QString& name)
 
 QString FreeNameIn(const FormDef& form, const QString& stem, int from)
 {
+    QSet<QString> taken;
+    for (const ControlDef& control : form.controls)
+        taken.insert(control.name.Text().toCaseFolded());
     for (int number = from;; ++number) {
         const QString digits = QString::number(number);
         const QString name = stem.left(kMaxNameLength - digits.size()) + digits;
-        if (!HasName(form, name))
+        if (!taken.contains(name.toCaseFolded()))
             return name;
     }
 }
