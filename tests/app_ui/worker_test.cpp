@@ -15,6 +15,7 @@
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/table_view.h"
 
+#include <QClipboard>
 #include <QComboBox>
 #include <QFile>
 #include <QFileInfo>
@@ -447,6 +448,25 @@ TEST_P(OfficeWorker, WorksThroughADayByMouse)
     person.Choose({u"Tools"_s, u"Sort Descending"_s});
     person.Choose({u"Tools"_s, u"Aggregate"_s, u"AVG"_s});
     person.See(u"average"_s);
+
+    // Cells that were copied become a table.
+    QGuiApplication::clipboard()->setText(u"City\tVisits\nOslo\t3\nCork\t12\n"_s);
+    person.MeetDialog(
+        [&] {
+            person.Choose({u"File"_s, u"Paste as New Table"_s});
+        },
+        [&] {
+            person.See(u"pasted"_s);
+            for (int step = 0; step < 2; ++step)
+                person.Tap(u"Next"_s);
+            person.See(u"pasted-fields"_s);
+            person.MeetDialog([&] { person.Tap(u"Import"_s); },
+                              [&] {
+                                  person.See(u"imported"_s);
+                                  person.Tap(u"OK"_s);
+                              });
+        });
+    EXPECT_EQ(Stored(u"SELECT SUM(Visits) FROM Imported"_s), u"15"_s);
 
     // A window of its own, and back.
     person.Choose({u"Window"_s, u"Open in New Window"_s});

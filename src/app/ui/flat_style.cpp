@@ -248,11 +248,9 @@ void FlatStyle::drawControl(ControlElement element, const QStyleOption* option, 
             return DrawTab(*painter, *tab);
         break;
     case CE_MenuBarItem:
-        TouchTargetStyle::drawControl(element, option, painter, widget);
-        if (!(option->state & State_Selected)) // Fusion's line beneath it
-            painter->fillRect(QRect(option->rect.bottomLeft(), QSize(option->rect.width(), 1)),
-                              option->palette.color(QPalette::Window));
-        return;
+        if (const auto* item = qstyleoption_cast<const QStyleOptionMenuItem*>(option))
+            return DrawMenuBarItem(*item, *painter, widget);
+        break;
     case CE_ToolBar:
     case CE_MenuBarEmptyArea:
         painter->fillRect(option->rect, option->palette.color(QPalette::Window));
@@ -261,6 +259,17 @@ void FlatStyle::drawControl(ControlElement element, const QStyleOption* option, 
         break;
     }
     TouchTargetStyle::drawControl(element, option, painter, widget);
+}
+
+void FlatStyle::DrawMenuBarItem(QStyleOptionMenuItem item, QPainter& painter, const QWidget* widget) const
+{
+    // The keys go to the bar until Escape is pressed once more: that must be seen.
+    if ((item.state & State_Selected) && widget && widget->hasFocus())
+        item.state |= State_Sunken;
+    TouchTargetStyle::drawControl(CE_MenuBarItem, &item, &painter, widget);
+    if (!(item.state & State_Selected)) // Fusion's line beneath it
+        painter.fillRect(QRect(item.rect.bottomLeft(), QSize(item.rect.width(), 1)),
+                         item.palette.color(QPalette::Window));
 }
 
 void FlatStyle::drawComplexControl(ComplexControl control, const QStyleOptionComplex* option, QPainter* painter,

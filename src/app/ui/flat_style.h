@@ -27,6 +27,7 @@ private:
     void DrawComboBox(const QStyleOptionComboBox& option, QPainter& painter, const QWidget* widget) const;
     void DrawSpinBox(const QStyleOptionSpinBox& option, QPainter& painter, const QWidget* widget) const;
     void DrawScrollBar(const QStyleOptionSlider& option, QPainter& painter, const QWidget* widget) const;
+    void DrawMenuBarItem(QStyleOptionMenuItem item, QPainter& painter, const QWidget* widget) const;
     void DrawArrow(PrimitiveElement arrow, const QStyleOption& option, const QRect& place, QPainter& painter,
                    const QWidget* widget) const;
 };
