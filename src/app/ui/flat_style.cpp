@@ -203,6 +203,13 @@ void FlatStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* opti
         painter->restore();
         return;
     }
+    case PE_IndicatorHeaderArrow: // Qt says "down" of an ascending order; here the arrow points to where it grows
+        if (const auto* header = qstyleoption_cast<const QStyleOptionHeader*>(option)) {
+            const bool ascending = header->sortIndicator == QStyleOptionHeader::SortDown;
+            return DrawArrow(ascending ? PE_IndicatorArrowUp : PE_IndicatorArrowDown, *option, option->rect, *painter,
+                             widget);
+        }
+        break;
     case PE_FrameGroupBox:
     case PE_FrameTabWidget:
         return DrawBox(*painter, option->rect, {}, Role(LookRole::Line, *option));
