@@ -1,5 +1,7 @@
 #include "cli/table_writer.h"
 
+#include "platform/utf8_bytes.h"
+
 #include <QList>
 
 #include <algorithm>
@@ -33,11 +35,6 @@ int WidthOf(char32_t character)
     }
     const auto block = std::ranges::lower_bound(kWide, character, {}, &CodePoints::last);
     return block != kWide.end() && character >= block->first ? 2 : 1;
-}
-
-bool IsAscii(std::string_view text)
-{
-    return std::ranges::none_of(text, [](char byte) { return static_cast<unsigned char>(byte) >= 0x80; });
 }
 
 QString WithoutControls(QString text)

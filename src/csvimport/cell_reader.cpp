@@ -166,7 +166,10 @@ Hr CellReader::Read(std::string_view text, Cell& cell)
 
 void CellReader::CountRest(const char* numberEnd, std::string_view text)
 {
-    cutNumbers_ += !std::all_of(numberEnd, text.data() + text.size(), IsBlank);
+    const char* const end = text.data() + text.size();
+    while (numberEnd != end && IsBlank(*numberEnd))
+        ++numberEnd;
+    cutNumbers_ += numberEnd != end;
 }
 
 Hr CellReader::ReadInteger(std::string_view text, Cell& cell)

@@ -1,5 +1,7 @@
 #include "csvimport/csv_reader.h"
 
+#include "platform/utf8_bytes.h"
+
 #include <QByteArrayView>
 
 #include <algorithm>
@@ -14,11 +16,6 @@ constexpr size_t kNone = std::string_view::npos;
 bool HasNul(std::string_view bytes)
 {
     return !bytes.empty() && std::memchr(bytes.data(), 0, bytes.size()) != nullptr;
-}
-
-bool IsUtf8(std::string_view bytes)
-{
-    return QByteArrayView(bytes.data(), qsizetype(bytes.size())).isValidUtf8();
 }
 
 // Each writes what is left of a text to `room`, which it moves behind it.
@@ -246,7 +243,7 @@ bool CsvReader::CutRecord(size_t maxTexts)
             for (std::string_view& text : texts_)
                 text = {text.data() + moved, text.size()};
         }
-        texts_.push_back(Record().substr(from, end - from));
+        texts_.push_back({Record().data() + from, end - from});
         if (end == Record().size())
             break;
         from = end + separator_.Length();
@@ -314,6 +311,11 @@ std::string_view CsvReader::WithoutMarks(std::string_view text) const
 // itself stays as it is in the file.
 void CsvReader::CleanTexts()
 {
+    if (!doubledQuotes_ && !hasNuls_) {
+        for (std::string_view& text : texts_)
+            text = WithoutMarks(text);
+        return;
+    }
     char* room = nullptr;
     for (std::string_view& text : texts_) {
         const std::string_view bare = WithoutMarks(text);

@@ -9,7 +9,10 @@
 namespace mirel {
 namespace {
 
-constexpr auto kDigits = std::string_view("0123456789");
+bool IsDigit(char byte)
+{
+    return byte >= '0' && byte <= '9';
+}
 
 std::string_view Trimmed(std::string_view text)
 {
@@ -22,7 +25,9 @@ std::string_view Trimmed(std::string_view text)
 // Cuts a run of digits off the front.
 std::string_view CutDigits(std::string_view& text)
 {
-    const size_t count = std::min(text.find_first_not_of(kDigits), text.size());
+    size_t count = 0;
+    while (count < text.size() && IsDigit(text[count]))
+        ++count;
     const std::string_view digits = text.substr(0, count);
     text.remove_prefix(count);
     return digits;
@@ -69,7 +74,7 @@ bool FitsInteger(std::string_view digits)
 bool IsWrittenAsDate(const DateFormat& format, std::string_view text)
 {
     const auto belongs = [&format](char byte) {
-        return kDigits.find(byte) != std::string_view::npos || char16_t(byte) == format.dateSeparator ||
+        return IsDigit(byte) || char16_t(byte) == format.dateSeparator ||
                char16_t(byte) == format.timeSeparator || byte == ' ';
     };
     return format.order == DateOrder::Locale || std::ranges::all_of(text, belongs);
@@ -95,21 +100,18 @@ void TypeGuess::Add(std::string_view text)
     if (text.size() > size_t(longest_))
         longest_ = std::max(longest_, Utf16Length(text));
     mayBeYesNo_ = mayBeYesNo_ && (text == "0" || text == "1");
-    if (mayBeDouble_ || mayBeComma_) {
-        const std::string_view trimmed = Trimmed(text);
-        if (mayBeComma_)
-            NarrowComma(trimmed);
-        if (mayBeDouble_)
-            NarrowNumber(trimmed);
-    }
+    if (mayBeDouble_ || mayBeComma_)
+        NarrowNumbers(Trimmed(text));
     if (mayBeDate_ || mayBeIsoDate_)
         NarrowDate(text);
 }
 
-void TypeGuess::NarrowNumber(std::string_view text)
+void TypeGuess::NarrowNumbers(std::string_view text)
 {
     const NumberShape shape = ShapeOf(text);
-    mayBeDouble_ = shape != NumberShape::None;
+    if (mayBeComma_ && shape != NumberShape::Integer) // digits alone are a number either way
+        NarrowComma(text);
+    mayBeDouble_ = mayBeDouble_ && shape != NumberShape::None;
     mayBeInteger_ = mayBeInteger_ && shape == NumberShape::Integer && FitsInteger(text);
 }
 

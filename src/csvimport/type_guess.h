@@ -35,7 +35,7 @@ public:
 
 private:
     void NarrowComma(std::string_view text);
-    void NarrowNumber(std::string_view text);
+    void NarrowNumbers(std::string_view text);
     void NarrowDate(std::string_view text);
 
     DateFormat dates_;

@@ -1,5 +1,6 @@
 #include "provider/sqlite/cell_checker.h"
 
+#include "platform/utf8_bytes.h"
 #include "provider/conversion.h"
 #include "provider/sqlite/date_forms.h"
 #include "provider/sqlite/row_reader.h"
@@ -62,7 +63,7 @@ Hr CellChecker::Check(const Cell& cell, Cell& stored)
 
 Hr CellChecker::CheckText(std::string_view utf8, Cell& stored) const
 {
-    if (!QByteArrayView(utf8.data(), qsizetype(utf8.size())).isValidUtf8())
+    if (!IsUtf8(utf8))
         return Hr::BadLiteral;
     const bool limited = type_ == FieldType::Text && size_ > 0;
     if (limited && utf8.size() > size_t(size_) && UnitsOf(utf8) > size_)

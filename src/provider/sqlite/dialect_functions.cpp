@@ -2,6 +2,7 @@
 
 #include "platform/ole_date.h"
 #include "platform/user_locale.h"
+#include "platform/utf8_bytes.h"
 #include "provider/conversion.h"
 #include "provider/sqlite/plan.h"
 
@@ -27,11 +28,6 @@ QString TextOf(sqlite3_value* value)
 void ResultText(sqlite3_context* context, const QByteArray& utf8)
 {
     sqlite3_result_text64(context, utf8.constData(), sqlite3_uint64(utf8.size()), SQLITE_TRANSIENT, SQLITE_UTF8);
-}
-
-bool IsAscii(std::string_view text)
-{
-    return std::ranges::all_of(text, [](char unit) { return static_cast<unsigned char>(unit) < 0x80; });
 }
 
 enum class Case : quint8 { Upper, Lower };

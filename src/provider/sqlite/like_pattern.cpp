@@ -1,5 +1,7 @@
 #include "provider/sqlite/like_pattern.h"
 
+#include "platform/utf8_bytes.h"
+
 #include <QStringList>
 
 #include <algorithm>
@@ -8,20 +10,6 @@
 
 namespace mirel::sqlite {
 namespace {
-
-bool IsAscii(std::string_view text)
-{
-    uint64_t all = 0;
-    size_t at = 0;
-    for (; at + 8 <= text.size(); at += 8) {
-        uint64_t bytes = 0;
-        std::memcpy(&bytes, text.data() + at, 8);
-        all |= bytes;
-    }
-    uint64_t rest = 0;
-    std::memcpy(&rest, text.data() + at, text.size() - at);
-    return ((all | rest) & 0x8080808080808080) == 0;
-}
 
 // Whether a search for ASCII letters may miss one that the text has once its case is folded: two characters beyond
 // ASCII become one, the long s and the Kelvin sign.

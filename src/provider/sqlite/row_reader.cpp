@@ -1,5 +1,6 @@
 #include "provider/sqlite/row_reader.h"
 
+#include "platform/utf8_bytes.h"
 #include "provider/dialect/column_value.h"
 #include "provider/sqlite/date_forms.h"
 
@@ -17,29 +18,13 @@ Cell TextOf(sqlite3_value* value)
     return Cell::OfText({text ? text : "", size_t(sqlite3_value_bytes(value))});
 }
 
-bool IsAscii(std::string_view text)
-{
-    constexpr quint64 kHighBits = 0x8080808080808080;
-    quint64 seen = 0;
-    size_t at = 0;
-    for (; at + sizeof(quint64) <= text.size(); at += sizeof(quint64)) {
-        quint64 word = 0;
-        std::memcpy(&word, text.data() + at, sizeof word);
-        seen |= word;
-    }
-    for (; at < text.size(); ++at)
-        seen |= quint8(text[at]);
-    return (seen & kHighBits) == 0;
-}
-
 // A text whose bytes are no UTF-8 comes with a replacement character for each fault, everywhere alike.
-Cell WithValidText(const Cell& cell, QByteArray& repaired)
+Cell WithValidText(const Cell& text, QByteArray& room)
 {
-    const QByteArrayView bytes(cell.bytes.data(), qsizetype(cell.bytes.size()));
-    if (cell.kind != Cell::Kind::Text || IsAscii(cell.bytes) || bytes.isValidUtf8())
-        return cell;
-    repaired = QString::fromUtf8(bytes).toUtf8();
-    return Cell::OfText({repaired.constData(), size_t(repaired.size())});
+    if (IsUtf8(text.bytes))
+        return text;
+    room = QString::fromUtf8(text.bytes.data(), qsizetype(text.bytes.size())).toUtf8();
+    return Cell::OfText({room.constData(), size_t(room.size())});
 }
 
 Cell BinaryOf(sqlite3_value* value)
@@ -77,7 +62,7 @@ Cell TextCell(sqlite3_value* value)
     }
 }
 
-Cell DateCell(sqlite3_value* value, StoredDate& rewritten)
+Cell DateCell(sqlite3_value* value, StoredDate& rewritten, QByteArray& repaired)
 {
     const Cell cell = StoredCell(value);
     std::optional<StoredDate> date;
@@ -98,7 +83,7 @@ Cell DateCell(sqlite3_value* value, StoredDate& rewritten)
         break;
     }
     if (!date)
-        return cell;
+        return cell.kind == Cell::Kind::Text ? WithValidText(cell, repaired) : cell;
     rewritten = *date;
     return Cell::OfText(rewritten.Text());
 }
@@ -128,6 +113,7 @@ Cell TruthCell(sqlite3_value* value)
 RowReader::RowReader(std::span<const ResultField> result, std::span<const int> fields, Layout layout)
     : cells_(fields.size())
 {
+    slots_.reserve(fields.size());
     for (size_t i = 0; i < fields.size(); ++i)
         slots_.push_back({layout == Layout::Whole ? fields[i] : int(i), result[size_t(fields[i])].type, {}, {}});
 }
@@ -136,17 +122,15 @@ std::span<const Cell> RowReader::Read(sqlite3_stmt* row)
 {
     // Each cell is made in its place: copying one that was just written made the processor wait for the stores, a
     // third of the time that a text took.
-    for (size_t i = 0; i < slots_.size(); ++i)
-        new (&cells_[i]) Cell(ReadSlot(slots_[i], row));
+    for (size_t i = 0; i < slots_.size(); ++i) {
+        const Cell& cell = *new (&cells_[i]) Cell(ReadSlot(slots_[i], row));
+        if (cell.kind == Cell::Kind::Text && slots_[i].type != FieldType::Date && !IsUtf8(cell.bytes))
+            cells_[i] = WithValidText(cell, slots_[i].repaired);
+    }
     return cells_;
 }
 
 Cell RowReader::ReadSlot(Slot& slot, sqlite3_stmt* row)
-{
-    return WithValidText(ReadStored(slot, row), slot.repaired);
-}
-
-Cell RowReader::ReadStored(Slot& slot, sqlite3_stmt* row)
 {
     sqlite3_value* value = sqlite3_column_value(row, slot.column);
     switch (slot.type) {
@@ -154,7 +138,7 @@ Cell RowReader::ReadStored(Slot& slot, sqlite3_stmt* row)
     case FieldType::Memo:
         return TextCell(value);
     case FieldType::Date:
-        return DateCell(value, slot.date);
+        return DateCell(value, slot.date, slot.repaired);
     case FieldType::YesNo:
         return TruthCell(value);
     case FieldType::None:

@@ -36,7 +36,6 @@ private:
     };
 
     static Cell ReadSlot(Slot& slot, sqlite3_stmt* row);
-    static Cell ReadStored(Slot& slot, sqlite3_stmt* row);
 
     std::vector<Slot> slots_;
     std::vector<Cell> cells_;
