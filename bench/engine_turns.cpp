@@ -9,6 +9,7 @@
 #include "data/db_recordset.h"
 #include "tableview/aggregate.h"
 #include "tableview/csv_export.h"
+#include "tableview/record_browser.h"
 
 #include <QElapsedTimer>
 #include <QFile>
@@ -120,6 +121,21 @@ Time TimeOf(const std::function<void()>& work)
     return {processorMs() - begin, double(timer.nsecsElapsed()) / 1e6};
 }
 
+class SilentPrompt : public UserPrompt {
+public:
+    bool AskYesNo(const UserMessage&) override { return false; }
+    void Show(const UserMessage& message) override { Fail(message.Text()); }
+    void ShowError(const QString& text) override { Fail(text); }
+    std::optional<QString> AskText(const UserMessage&, const UserMessage&, const QString&) override { return {}; }
+    std::unique_ptr<Progress> StartProgress(const UserMessage&, qint64) override
+    {
+        struct Quiet : Progress {
+            bool Advance(qint64) override { return true; }
+        };
+        return std::make_unique<Quiet>();
+    }
+};
+
 class Turns {
 public:
     Turns(QString large, QString small, int repeat)
@@ -174,6 +190,8 @@ private:
     void Order();
     void Sum();
     void Writes();
+    void Undo();
+    void TakeUp();
 
     QString large_;
     QString small_;
@@ -316,6 +334,57 @@ void Turns::Writes()
     CompareWrites("delete a half", "-", remove(some), "DELETE FROM Birds WHERE Cost<50000");
 }
 
+// Two hundred thousand changed values, taken back; against making them.
+void Turns::Undo()
+{
+    const QString statement = u"SELECT * FROM Birds WHERE Number<=200000"_s;
+    constexpr int kDamage = 7;
+    Time making;
+    Time undoing;
+    for (int i = 0; i < repeat_; ++i) {
+        Copy(large_, table_);
+        {
+            SilentPrompt prompt;
+            OpenResult result(connection_, table_, prompt);
+            if (!result.Open(statement))
+                Fail(u"no result"_s);
+            const qint64 count = result.Count();
+            making.KeepShorter(TimeOf([&] {
+                if (!result.UpdateAll(kDamage, Value::Integer(7), count, [](qint64) { return true; }))
+                    Fail(result.LastFailure());
+            }));
+            undoing.KeepShorter(TimeOf([&] { result.Undo(); }));
+            if (result.CanUndo() || !result.CanRedo())
+                Fail(u"nothing was undone"_s);
+        }
+        connection_.Provider()->CloseDatabase(table_);
+    }
+    Say("undo of 200,000 changes", undoing, making, "1.5", u"making them"_s);
+}
+
+// Another program writes a record of a sorted result; against opening that result.
+void Turns::TakeUp()
+{
+    Copy(large_, table_);
+    {
+        SilentPrompt prompt;
+        RecordBrowser browser(connection_, table_, prompt, {});
+        const Time opening = TimeOf([&] {
+            if (!browser.Open(u"SELECT * FROM Birds ORDER BY Remarks"_s))
+                Fail(u"no result"_s);
+            browser.SetRowsPerPage(kPage);
+        });
+        Plain other(table_);
+        Time taking;
+        for (int i = 0; i < repeat_; ++i) {
+            other.Run("UPDATE Birds SET Cost=Cost+1 WHERE Number=500000");
+            taking.KeepShorter(TimeOf([&] { browser.TakeUpChanges(); }));
+        }
+        Say("sorted page after another program's commit", taking, opening, "50 ms", u"opening it"_s);
+    }
+    connection_.Provider()->CloseDatabase(table_);
+}
+
 void Turns::Run(bool alsoWrites)
 {
     FirstPage();
@@ -328,8 +397,11 @@ void Turns::Run(bool alsoWrites)
     AnyPage("50 records of a sorted result", u" ORDER BY Cost"_s, large_, small_);
     Order();
     Sum();
-    if (alsoWrites)
+    TakeUp();
+    if (alsoWrites) {
         Writes();
+        Undo();
+    }
 }
 
 int Export(const QString& database, const QString& path)

@@ -28,7 +28,8 @@ struct Turn {
 constexpr Turn kUndo{&RecordChange::Field::after, &RecordChange::Field::before, RecordChange::Kind::Deleted};
 constexpr Turn kRedo{&RecordChange::Field::before, &RecordChange::Field::after, RecordChange::Kind::Added};
 
-// Turns changes on recordsets of their whole tables: they reach every record, in any order, at the same cost.
+// Turns changes on recordsets of the tables, which reach every record, in any order, at the same cost. What changes a
+// few fields of many records reads no others.
 class ChangeTurner {
 public:
     ChangeTurner(DbConnection& connection, const DatabaseLocation& database, const Turn& turn)
@@ -41,7 +42,7 @@ public:
     // `id`: of the record as it is now; on return, as it is then.
     Taken Apply(const RecordChange& change, RecordId& id)
     {
-        Table& table = TableOf(change.table);
+        Table& table = TableOf(change);
         if (!table.records.IsOpen())
             return Refuse(table.records);
         if (change.kind == turn_.adds) {
@@ -72,14 +73,24 @@ private:
         QHash<QString, int> fields;
     };
 
-    Table& TableOf(const QString& name)
+    Table& TableOf(const RecordChange& change)
     {
-        const auto known = tables_.find(name);
+        QStringList fields;
+        if (change.kind == RecordChange::Kind::Changed) {
+            for (const RecordChange::Field& field : change.fields)
+                fields += FieldReference(field.column);
+        }
+        const QString of = u" FROM "_s + FieldReference(change.table);
+        const QString key = fields.join(u',') + of;
+        const auto known = tables_.find(key);
         if (known != tables_.end())
             return known->second;
-        Table& table = tables_.try_emplace(name, connection_).first->second;
-        const QString statement = u"SELECT * FROM "_s + FieldReference(name);
-        if (!table.records.Open(statement, database_, CursorType::Static, LockType::Optimistic))
+        Table& table = tables_.try_emplace(key, connection_).first->second;
+        const auto open = [&](const QString& what) {
+            return table.records.Open(u"SELECT "_s + what + of, database_, CursorType::Static, LockType::Optimistic);
+        };
+        // A field may be gone by now: the others then tell that its record is another one.
+        if ((fields.isEmpty() || !open(fields.join(u','))) && !open(u"*"_s))
             return table;
         for (int field = 0; field < table.records.FieldCount(); ++field)
             table.fields.insert(table.records.Fields()[size_t(field)].column, field);

@@ -1,4 +1,6 @@
 // The main window with its views: side bar and tabs when it is wide, one view in front when it is narrow.
+#include "app/form_view_options.h"
+#include "app/table_view_options.h"
 #include "app/ui/entry_panel.h"
 #include "app/ui/lumo_view.h"
 #include "app/ui/side_bar.h"
@@ -290,6 +292,33 @@ TEST_F(WorkspaceTest, WhatOneViewWritesTheOthersShowAtOnce)
     }
     QTest::qWait(50);
     EXPECT_EQ(birds->Browser().CounterText(), u"3/4"_s) << "the selection stays on its record";
+}
+
+TEST_F(WorkspaceTest, OptionsOfOneViewReachAllThatAreOpen)
+{
+    EXPECT_TRUE(Execute(u"ALTER TABLE Birds ADD COLUMN Rare Bit"_s));
+    EXPECT_TRUE(Execute(u"UPDATE Birds SET Rare=1"_s));
+    CTableView* birds = Open(kBirds);
+    Command(ShellCommand::OpenInWindow)->trigger(); // in a window of its own
+    auto* form = qobject_cast<CFormEngView*>(Frame().OpenView(kBirdForm));
+    CTableView* bees = Open(kBees);
+    ASSERT_TRUE(birds && form && bees);
+    const auto shown = [birds] { return birds->Browser().Page().At(0, 2).text; };
+    EXPECT_EQ(shown(), u"Yes"_s);
+
+    TableViewSettings options = ReadTableViewSettings(program_->settings);
+    options.words = {u"Ja"_s, u"Nein"_s};
+    options.maxColumnChars = 7;
+    Q_EMIT bees->settingsChanged(options);
+    EXPECT_EQ(shown(), u"Ja"_s);
+    EXPECT_EQ(ReadFormViewSettings(program_->settings).words.yes, u"Ja"_s);
+
+    FormViewSettings ofForms = ReadFormViewSettings(program_->settings);
+    ofForms.words = {u"Oui"_s, u"Non"_s};
+    Q_EMIT form->settingsChanged(ofForms);
+    EXPECT_EQ(shown(), u"Oui"_s);
+    EXPECT_EQ(ReadTableViewSettings(program_->settings).maxColumnChars, 7) << "written back by nobody";
+    EXPECT_EQ(Open(kBirds)->Browser().Page().At(0, 2).text, u"Oui"_s);
 }
 
 TEST_F(WorkspaceTest, TakesUpWhatOtherProgramsChange)
