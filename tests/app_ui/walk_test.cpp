@@ -22,6 +22,7 @@
 #include "querybuilder/ui/query_dialog.h"
 #include "resources/string_table.h"
 #include "support/ui/screen_checks.h"
+#include "support/ui/spoken_in_windows.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/csv_options_dialog.h"
@@ -70,16 +71,19 @@ protected:
     template <typename Make>
     void ExpectDialogFits(const QString& name, Make make)
     {
-        for (const QSize size : {kUpright, kFlat, kDesktop}) {
+        for (const QSize size : sizes_) {
             QWidget window;
             window.resize(size);
             window.show();
             const std::unique_ptr<QDialog> dialog(make(window));
             FillSmallWindow(*dialog, window);
             dialog->show();
-            ExpectFits(*dialog, name, size);
+            ExpectFits(*dialog, prefix_ + name, size);
         }
     }
+    void GoThroughTheDialogs();
+    void GoThroughTheTableView();
+    void GoThroughTheFormMaker();
 
     void MakeLongNames()
     {
@@ -91,9 +95,33 @@ protected:
     }
 
     QPalette before_;
+    QList<QSize> sizes_ = {kUpright, kFlat, kDesktop};
+    QString prefix_; // of the pictures
+};
+
+// In a language whose words are longer.
+class WalkInGerman : public Walk {
+protected:
+    WalkInGerman()
+    {
+        sizes_ = {kUpright, kDesktop};
+        prefix_ = u"de-"_s;
+    }
+
+    const SpokenInWindows german_{u"de"_s};
 };
 
 TEST_F(Walk, GoesThroughTheDialogs)
+{
+    GoThroughTheDialogs();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheDialogs)
+{
+    GoThroughTheDialogs();
+}
+
+void Walk::GoThroughTheDialogs()
 {
     FieldLists lists(connection, path, prompt);
     FormStore store(folder.filePath(u"walk.raf"_s));
@@ -163,8 +191,18 @@ TEST_F(Walk, GoesThroughTheDialogs)
 
 TEST_F(Walk, GoesThroughTheTableView)
 {
+    GoThroughTheTableView();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheTableView)
+{
+    GoThroughTheTableView();
+}
+
+void Walk::GoThroughTheTableView()
+{
     MakeLongNames();
-    for (const QSize size : {QSize(200, 200), kUpright, kFlat, kDesktop}) {
+    for (const QSize size : QList{QSize(200, 200)} + sizes_) {
         CTableView view(connection, path, prompt, {});
         view.resize(size);
         ASSERT_TRUE(view.OpenTable(u"Long names"_s));
@@ -176,25 +214,25 @@ TEST_F(Walk, GoesThroughTheTableView)
                     action->trigger();
             }
         };
-        ExpectFits(view, u"table"_s, size);
+        ExpectFits(view, prefix_ + u"table"_s, size);
         grid->setFocus();
         QTest::keyClicks(grid, u"abc"_s);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
-        ExpectFits(view, u"table-refused"_s, size);
+        ExpectFits(view, prefix_ + u"table-refused"_s, size);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
         command(Str::ActionFind);
-        ExpectFits(view, u"table-find"_s, size);
+        ExpectFits(view, prefix_ + u"table-find"_s, size);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
         command(Str::ActionDetail);
-        ExpectFits(view, u"table-detail"_s, size);
+        ExpectFits(view, prefix_ + u"table-detail"_s, size);
         command(Str::ActionList);
         grid->setFocus();
         QTest::keyClick(grid, Qt::Key_Right);
         command(Str::ZoomIn);
-        ExpectFits(view, u"table-zoom"_s, size);
+        ExpectFits(view, prefix_ + u"table-zoom"_s, size);
         command(Str::ZoomBack);
         command(Str::ActionFilterBy);
-        ExpectFits(view, u"table-filtered"_s, size);
+        ExpectFits(view, prefix_ + u"table-filtered"_s, size);
     }
 }
 
@@ -289,6 +327,16 @@ TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
 
 TEST_F(Walk, GoesThroughTheFormMaker)
 {
+    GoThroughTheFormMaker();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheFormMaker)
+{
+    GoThroughTheFormMaker();
+}
+
+void Walk::GoThroughTheFormMaker()
+{
     FormStore store(folder.filePath(u"walk.raf"_s));
     std::optional<FormDef> form = DefaultFormOf(connection, path, u"People"_s, prompt);
     ASSERT_TRUE(form);
@@ -321,12 +369,12 @@ TEST_F(Walk, GoesThroughTheFormMaker)
             return dialog;
         });
     }
-    for (const QSize size : {kUpright, kFlat, kDesktop}) {
+    for (const QSize size : sizes_) {
         CFormMakView view(*form, FormMaker::Start::New,
                           {.maker = {connection, path, store, prompt}, .dialogs = {}, .words = {}});
         view.resize(size);
         view.show();
-        ExpectFits(view, u"maker"_s, size);
+        ExpectFits(view, prefix_ + u"maker"_s, size);
         view.GiveUpEdits();
     }
 }
