@@ -82,10 +82,10 @@ constexpr std::array kControls = {
 
 QString Plain(QString label)
 {
-    label.remove(u'&');
+    label = label.remove(u'&').simplified(); // a narrow window breaks it into lines
     while (label.endsWith(u':') || label.endsWith(u'.'))
         label.chop(1);
-    return label.trimmed();
+    return label;
 }
 
 } // namespace

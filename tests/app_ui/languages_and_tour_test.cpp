@@ -1,6 +1,7 @@
 // The window in each of its languages, and the tour of its first start.
 #include "app/ui/tour.h"
 #include "app/ui/window_language.h"
+#include "forms/ui/design_surface.h"
 #include "forms/ui/form_eng_view.h"
 #include "forms/ui/form_mak_view.h"
 #include "resources/string_table.h"
@@ -30,6 +31,14 @@ using namespace Qt::StringLiterals;
 
 constexpr QSize kHandheld(240, 320);
 constexpr QSize kDesktop(1100, 700);
+
+// A window of that size on a screen that may be smaller.
+void ResizeTo(QSize size, CMainFrame& frame)
+{
+    frame.setWindowState(Qt::WindowNoState);
+    frame.resize(size);
+    QApplication::processEvents();
+}
 
 // Entries of one menu whose letters are the same, and entries without one, of the menu and those behind it.
 void ExpectLettersOfTheirOwn(const QList<QAction*>& entries, const QString& where)
@@ -74,6 +83,7 @@ TEST_P(InLanguage, NoTwoEntriesOfAMenuHaveOneLetter)
 {
     for (const QSize size : {kDesktop, kHandheld}) {
         Show(size);
+        ResizeTo(size, Frame());
         ExpectLetters(u"lists"_s);
         ASSERT_TRUE(Frame().OpenView({EntryKind::Table, u"Orders"_s}));
         ExpectLetters(u"table"_s);
@@ -82,6 +92,11 @@ TEST_P(InLanguage, NoTwoEntriesOfAMenuHaveOneLetter)
         CFormMakView* maker = Frame().DesignForm(u"Order"_s);
         ASSERT_TRUE(maker);
         ExpectLetters(u"form maker"_s);
+        auto* surface = maker->findChild<DesignSurface*>();
+        QTest::keyClick(surface, Qt::Key_Tab);
+        ExpectLetters(u"form maker, one control"_s);
+        QTest::keyClick(surface, Qt::Key_A, Qt::ControlModifier);
+        ExpectLetters(u"form maker, all controls"_s);
         Frame().close();
     }
 }
@@ -89,6 +104,7 @@ TEST_P(InLanguage, NoTwoEntriesOfAMenuHaveOneLetter)
 TEST_P(InLanguage, IconsSayWhatTheyDo)
 {
     Show(kHandheld);
+    ResizeTo(kHandheld, Frame());
     const auto expectTips = [this](const QString& where) {
         for (const QAbstractButton* button : Frame().findChildren<QAbstractButton*>()) {
             if (button->isVisibleTo(&Frame()) && !button->icon().isNull() &&
@@ -110,10 +126,14 @@ TEST_P(InLanguage, FitsItsWindow)
 {
     for (const QSize size : {kHandheld, kDesktop}) {
         Show(size);
+        ResizeTo(size, Frame());
         const QString name = QString::fromLatin1(GetParam());
-        ExpectFits(Frame(), name + u"-main"_s, size);
+        Paint(Frame(), u"%1-main-%2"_s.arg(name, QString::number(size.width())));
+        ExpectFits(*Frame().centralWidget(), name + u"-lists"_s, size);
         ASSERT_TRUE(Frame().OpenView({EntryKind::Table, u"Bird Strikes"_s}));
-        ExpectFits(Frame(), name + u"-frame-table"_s, size);
+        QTest::qWait(50); // its fields are counted
+        Paint(Frame(), u"%1-table-%2"_s.arg(name, QString::number(size.width())));
+        ExpectFits(*Frame().centralWidget(), name + u"-records"_s, size);
         Frame().close();
     }
 }
@@ -122,6 +142,7 @@ TEST_P(InLanguage, TheTourGoesThroughTheWindow)
 {
     for (const QSize size : {kHandheld, kDesktop}) {
         Show(size);
+        ResizeTo(size, Frame());
         Frame().ShowTour();
         Frame().ShowTour(); // once is enough
         ASSERT_EQ(Frame().findChildren<Tour*>().size(), 1);
@@ -148,6 +169,7 @@ protected:
     {
         Start();
         Show(size);
+        ResizeTo(size, Frame());
         Frame().ShowTour();
         return Frame().findChild<Tour*>();
     }
@@ -215,6 +237,7 @@ TEST_F(TourTest, ALanguageIsChosenForTheNextStart)
 {
     Start();
     Show(kHandheld);
+    ResizeTo(kHandheld, Frame());
     const auto choose = [this](const QString& name) {
         QTimer::singleShot(0, &Frame(), [name] {
             auto* dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());

@@ -124,6 +124,14 @@ TEST_P(Languages, TranslateEveryTextOnce)
     EXPECT_TRUE(doubled.isEmpty()) << "more than once:" << AllOf(doubled).toStdString();
 }
 
+TEST_P(Languages, ArePartsOfTheProgram)
+{
+    QFile list(QStringLiteral(MIREL_SOURCE_DIR "/src/resources/languages.qrc"));
+    ASSERT_TRUE(list.open(QIODevice::ReadOnly));
+    EXPECT_TRUE(list.readAll().contains("<file>languages/" + GetParam().toUtf8() + ".ts</file>"));
+    EXPECT_EQ(LanguageTexts::Read(LanguageBytes(GetParam()))->Code(), GetParam());
+}
+
 TEST_P(Languages, KeepPlaceholdersLinesEndsAndLetters)
 {
     for (const Message& message : MessagesOf(GetParam())) {

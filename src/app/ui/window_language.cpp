@@ -49,6 +49,8 @@ void UseQtTextsOf(const QString& code)
 
 QString NameOf(const QString& code)
 {
+    if (code == u"en")
+        return u"English"_s; // without a country
     const QString name = QLocale(code).nativeLanguageName();
     if (name.isEmpty())
         return code;
@@ -80,6 +82,7 @@ void ChooseLanguage(const ProgramFolder& folder, Settings& settings, QWidget& wi
     prompt->setWordWrap(true);
     auto* list = new QListWidget(&dialog);
     prompt->setBuddy(list);
+    list->setAccessibleName(dialog.windowTitle());
     new QListWidgetItem(StringText(Str::LanguageOfSystem), list);
     list->setCurrentRow(0);
     for (const LanguageFile& language : LanguagesIn(FoldersOf(folder))) {

@@ -8,6 +8,7 @@
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
+#include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QDragEnterEvent>
 #include <QDropEvent>
@@ -64,7 +65,7 @@ CImportWizard::CImportWizard(ImportDraft& draft, UserPrompt& prompt, const QStri
 
 void CImportWizard::LayOut()
 {
-    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), this);
+    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
     QFont bold = heading_->font();
     bold.setBold(true);
     heading_->setFont(bold);

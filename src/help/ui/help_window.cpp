@@ -57,7 +57,8 @@ QString FunctionRows()
 
 QString StyleSheet(const QPalette& palette)
 {
-    return u"h1, h2 { color: %1; } h2 { margin-top: 28px; } p, li { margin-bottom: 6px; } a { color: %2; } "
+    return u"h1, h2 { color: %1; } h1 { font-size: x-large; } h2 { font-size: large; margin-top: 28px; } p, li { "
+           u"margin-bottom: 6px; } a { color: %2; } "
            "td { padding: 2px 6px 2px 0; } .dim { color: %3; }"_s.arg(
                ColorOfRole(LookRole::Text, palette).name(), ColorOfRole(LookRole::Accent, palette).name(),
                ColorOfRole(LookRole::Dim, palette).name());
@@ -159,36 +160,40 @@ void CHelpWindow::MakeBar()
     auto* row = new QHBoxLayout(bar_);
     row->setContentsMargins(spacing::kTight, spacing::kTight, spacing::kTight, spacing::kTight);
     row->setSpacing(spacing::kTight);
-    const auto button = [this, row](Str name, Str tip, const char16_t* icon, QKeySequence key) {
-        auto* made = new QToolButton(bar_);
-        made->setIcon(ThemeIcon(icon));
-        made->setAutoRaise(true);
-        made->setFocusPolicy(Qt::TabFocus);
-        made->setShortcut(key);
-        made->setAccessibleName(StringText(name).remove(u'&'));
-        made->setToolTip(StringText(Str::TipWithKeys, {StringText(tip), key.toString(QKeySequence::NativeText)}));
-        row->addWidget(made);
-        return made;
+    // Actions, because a button waits a moment before it obeys its key.
+    const auto command = [this, row](Str name, Str tip, const char16_t* icon, QKeySequence key) {
+        auto* action = new QAction(ThemeIcon(icon), StringText(name), this);
+        action->setShortcut(key);
+        action->setToolTip(
+            StringText(Str::TipWithKeys, {StringText(tip), key.toString(QKeySequence::NativeText)}));
+        addAction(action);
+        auto* button = new QToolButton(bar_);
+        button->setDefaultAction(action);
+        button->setAutoRaise(true);
+        button->setFocusPolicy(Qt::TabFocus);
+        button->setAccessibleName(StringText(name).remove(u'&'));
+        row->addWidget(button);
+        return action;
     };
     connect(
-        button(Str::HelpContents, Str::HelpContentsTip, u"help-contents", QKeySequence(Qt::ALT | Qt::Key_Home)),
-        &QToolButton::clicked, this, [this] { GoTo(u"contents"_s); });
-    back_ = button(Str::HelpBack, Str::HelpBackTip, u"go-previous", QKeySequence(Qt::ALT | Qt::Key_Left));
-    connect(back_, &QToolButton::clicked, text_, &QTextBrowser::backward);
-    forward_ = button(Str::HelpForward, Str::HelpForwardTip, u"go-next", QKeySequence(Qt::ALT | Qt::Key_Right));
-    connect(forward_, &QToolButton::clicked, text_, &QTextBrowser::forward);
+        command(Str::HelpContents, Str::HelpContentsTip, u"help-contents", QKeySequence(Qt::ALT | Qt::Key_Home)),
+        &QAction::triggered, this, [this] { GoTo(u"contents"_s); });
+    back_ = command(Str::HelpBack, Str::HelpBackTip, u"go-previous", QKeySequence(Qt::ALT | Qt::Key_Left));
+    connect(back_, &QAction::triggered, text_, &QTextBrowser::backward);
+    forward_ = command(Str::HelpForward, Str::HelpForwardTip, u"go-next", QKeySequence(Qt::ALT | Qt::Key_Right));
+    connect(forward_, &QAction::triggered, text_, &QTextBrowser::forward);
     search_->setPlaceholderText(StringText(Str::FindPrompt));
     search_->setAccessibleName(StringText(Str::HelpFind));
     search_->setClearButtonEnabled(true);
     search_->setMinimumWidth(1);
     row->addWidget(search_, 1);
     connect(
-        button(Str::ActionFindPrevious, Str::HelpFindPreviousTip, u"go-up", QKeySequence(Qt::SHIFT | Qt::Key_F3)),
-        &QToolButton::clicked, this, [this] { FindAgain(true); });
-    connect(button(Str::ActionFindNext, Str::HelpFindNextTip, u"go-down", QKeySequence(Qt::Key_F3)),
-            &QToolButton::clicked, this, [this] { FindAgain(false); });
-    connect(button(Str::ActionClose, Str::ActionCloseTip, u"window-close", QKeySequence(Qt::CTRL | Qt::Key_W)),
-            &QToolButton::clicked, this, &QDialog::close);
+        command(Str::ActionFindPrevious, Str::HelpFindPreviousTip, u"go-up", QKeySequence(Qt::SHIFT | Qt::Key_F3)),
+        &QAction::triggered, this, [this] { FindAgain(true); });
+    connect(command(Str::ActionFindNext, Str::HelpFindNextTip, u"go-down", QKeySequence(Qt::Key_F3)),
+            &QAction::triggered, this, [this] { FindAgain(false); });
+    connect(command(Str::ActionClose, Str::ActionCloseTip, u"window-close", QKeySequence(Qt::CTRL | Qt::Key_W)),
+            &QAction::triggered, this, &QDialog::close);
     connect(search_, &QLineEdit::textEdited, this, [this] {
         QTextCursor from = text_->textCursor();
         from.setPosition(from.selectionStart()); // a longer text is looked for from the same place

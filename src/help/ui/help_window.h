@@ -5,9 +5,9 @@
 #include <QTextBrowser>
 #include <QUrl>
 
+class QAction;
 class QLineEdit;
 class QListWidget;
-class QToolButton;
 
 namespace mirel {
 
@@ -54,8 +54,8 @@ private:
     HelpBrowser* text_;
     QListWidget* pages_;
     QLineEdit* search_;
-    QToolButton* back_ = nullptr;
-    QToolButton* forward_ = nullptr;
+    QAction* back_ = nullptr;
+    QAction* forward_ = nullptr;
     QWidget* bar_;
 };
 

@@ -648,7 +648,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60529">
         <source>R&amp;un Again</source>
         <extracomment>ActionRunAgain</extracomment>
-        <translation>Erneut aus&amp;führen</translation>
+        <translation>E&amp;rneut ausführen</translation>
     </message>
     <message id="60530">
         <source>Read the records again</source>
@@ -668,7 +668,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60533">
         <source>AutoSize &amp;this Column</source>
         <extracomment>ActionFitColumn</extracomment>
-        <translation>&amp;Diese Spalte anpassen</translation>
+        <translation>Diese Spalte an&amp;passen</translation>
     </message>
     <message id="60534">
         <source>Fit the selected column to its content</source>
@@ -838,7 +838,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60573">
         <source>List &amp;Text Color</source>
         <extracomment>CommandListTextColor</extracomment>
-        <translation>&amp;Textfarbe der Liste</translation>
+        <translation>Textfarbe der L&amp;iste</translation>
     </message>
     <message id="60574">
         <source>Button Te&amp;xt Color</source>
@@ -1670,7 +1670,7 @@ Sind Sie ganz sicher?</numerusform>
     <message id="61042">
         <source>S&amp;ort Expression ...</source>
         <extracomment>ActionSortExpression</extracomment>
-        <translation>Sorti&amp;erausdruck ...</translation>
+        <translation>So&amp;rtierausdruck ...</translation>
     </message>
     <message id="61043">
         <source>Sort by several fields</source>
@@ -1690,7 +1690,7 @@ Sind Sie ganz sicher?</numerusform>
     <message id="61046">
         <source>Aggrega&amp;te</source>
         <extracomment>ActionAggregate</extracomment>
-        <translation>A&amp;uswerten</translation>
+        <translation>Auswer&amp;ten</translation>
     </message>
     <message id="61047">
         <source>Sum up the selected column</source>
@@ -2189,7 +2189,7 @@ Möchten Sie sie ersetzen?</translation>
     <message id="61159">
         <source>&amp;Undo</source>
         <extracomment>ActionUndo</extracomment>
-        <translation>&amp;Rückgängig</translation>
+        <translation>Rück&amp;gängig</translation>
     </message>
     <message id="61160">
         <source>Take back the last change of cells, or bring back the deleted record</source>
@@ -2294,7 +2294,7 @@ Möchten Sie sie ersetzen?</translation>
     <message id="61180">
         <source>State&amp;ment ...</source>
         <extracomment>ActionStatement</extracomment>
-        <translation>&amp;Anweisung ...</translation>
+        <translation>An&amp;weisung ...</translation>
     </message>
     <message id="61181">
         <source>Show the statement that this result comes from</source>
@@ -2584,7 +2584,7 @@ Möchten Sie sie ersetzen?</translation>
     <message id="61400">
         <source>&amp;First Record</source>
         <extracomment>FormFirst</extracomment>
-        <translation>&amp;Erster Datensatz</translation>
+        <translation>E&amp;rster Datensatz</translation>
     </message>
     <message id="61401">
         <source>First Record</source>
@@ -2709,7 +2709,7 @@ Möchten Sie sie ersetzen?</translation>
     <message id="61425">
         <source>&amp;Recalculate</source>
         <extracomment>FormRecalculate</extracomment>
-        <translation>&amp;Neu berechnen</translation>
+        <translation>Neu be&amp;rechnen</translation>
     </message>
     <message id="61426">
         <source>Read the records again, and compute sums and averages</source>
@@ -2752,7 +2752,7 @@ Möchten Sie sie ersetzen?</translation>
         <translation>Die Datensätze mit dem Wert dieses Feldes ausblenden</translation>
     </message>
     <message id="61434">
-        <source>S&amp;ort Ascending</source>
+        <source>Sor&amp;t Ascending</source>
         <extracomment>FormSortAscending</extracomment>
         <translation>&amp;Aufsteigend sortieren</translation>
     </message>
@@ -3835,7 +3835,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="62967">
         <source>&amp;Edit ...</source>
         <extracomment>StatementEdit</extracomment>
-        <translation>&amp;Bearbeiten ...</translation>
+        <translation>&amp;Ändern ...</translation>
     </message>
     <message id="62968">
         <source>Change the statement in the query builder and show its result here</source>
@@ -3983,7 +3983,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63222">
         <source>I&amp;mport</source>
         <extracomment>ImportRun</extracomment>
-        <translation>&amp;Importieren</translation>
+        <translation>&amp;Import</translation>
     </message>
     <message id="63223">
         <source>&amp;Open File ...</source>
@@ -4003,7 +4003,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63226">
         <source>From &amp;Clipboard</source>
         <extracomment>ImportPaste</extracomment>
-        <translation>Aus &amp;Zwischenablage</translation>
+        <translation>&amp;Zwischenablage</translation>
     </message>
     <message id="63227">
         <source>Import the table or text that was copied</source>
@@ -4385,7 +4385,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63618">
         <source>&amp;Import Form</source>
         <extracomment>MakerImport</extracomment>
-        <translation>Formular &amp;importieren</translation>
+        <translation>Formular im&amp;portieren</translation>
     </message>
     <message id="63619">
         <source>Replace this form by one from a form file</source>
@@ -4413,7 +4413,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
         <translation>Das Formular ausführen, wie es jetzt ist, ohne es zu speichern</translation>
     </message>
     <message id="63624">
-        <source>Form Scroll &amp;Bar</source>
+        <source>Form Scro&amp;ll Bar</source>
         <extracomment>MakerScrollBar</extracomment>
         <translation>&amp;Rollbalken</translation>
     </message>
@@ -4423,7 +4423,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
         <translation>Den Rollbalken des Entwurfs zeigen</translation>
     </message>
     <message id="63626">
-        <source>&amp;Delete All Controls</source>
+        <source>Delete All Con&amp;trols</source>
         <extracomment>MakerDeleteAll</extracomment>
         <translation>Alle &amp;Elemente löschen</translation>
     </message>
@@ -4433,9 +4433,9 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
         <translation>Alles auf dem Formular löschen</translation>
     </message>
     <message id="63628">
-        <source>&amp;Help</source>
+        <source>Hel&amp;p</source>
         <extracomment>MakerHelp</extracomment>
-        <translation>&amp;Hilfe</translation>
+        <translation>Hil&amp;fe</translation>
     </message>
     <message id="63629">
         <source>Shows the help page of the form maker</source>
@@ -4455,7 +4455,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63632">
         <source>Form &amp;Color</source>
         <extracomment>MakerFormColor</extracomment>
-        <translation>Formular&amp;farbe</translation>
+        <translation>Fa&amp;rbe des Formulars</translation>
     </message>
     <message id="63633">
         <source>Choose the color behind the controls</source>
@@ -4465,7 +4465,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63634">
         <source>Form &amp;Font</source>
         <extracomment>MakerFormFont</extracomment>
-        <translation>Formular&amp;schrift</translation>
+        <translation>&amp;Schrift des Formulars</translation>
     </message>
     <message id="63635">
         <source>Choose the font that new controls get</source>
@@ -4495,7 +4495,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63640">
         <source>New &amp;Button</source>
         <extracomment>MakerNewButton</extracomment>
-        <translation>Neue Schalt&amp;fläche</translation>
+        <translation>Neue Schal&amp;tfläche</translation>
     </message>
     <message id="63641">
         <source>New &amp;EditBox</source>
@@ -4510,7 +4510,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63643">
         <source>New &amp;Label</source>
         <extracomment>MakerNewLabel</extracomment>
-        <translation>Neue Besch&amp;riftung</translation>
+        <translation>Neue &amp;Beschriftung</translation>
     </message>
     <message id="63644">
         <source>New L&amp;ist</source>
@@ -4520,7 +4520,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63645">
         <source>New &amp;DropDownBox</source>
         <extracomment>MakerNewDropDown</extracomment>
-        <translation>Neues Auswahl&amp;feld</translation>
+        <translation>Neues Auswa&amp;hlfeld</translation>
     </message>
     <message id="63646">
         <source>Then tap the place for it</source>
@@ -4550,7 +4550,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63651">
         <source>&amp;Paste</source>
         <extracomment>MakerPaste</extracomment>
-        <translation>Ein&amp;fügen</translation>
+        <translation>E&amp;infügen</translation>
     </message>
     <message id="63652">
         <source>Add the controls that were copied</source>
@@ -4570,7 +4570,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63655">
         <source>&amp;Delete</source>
         <extracomment>MakerDelete</extracomment>
-        <translation>&amp;Löschen</translation>
+        <translation>L&amp;öschen</translation>
     </message>
     <message id="63656">
         <source>Delete the selected controls</source>
@@ -4665,7 +4665,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
     <message id="63674">
         <source>&amp;Undo</source>
         <extracomment>MakerUndo</extracomment>
-        <translation>&amp;Rückgängig</translation>
+        <translation>Rü&amp;ckgängig</translation>
     </message>
     <message id="63675">
         <source>Take the last change back</source>

@@ -11,6 +11,7 @@
 
 #include <QCheckBox>
 #include <QComboBox>
+#include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QDir>
 #include <QGridLayout>
@@ -119,7 +120,7 @@ CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, Wri
 
 void CExportWizard::LayOut()
 {
-    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), this);
+    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
     QFont bold = heading_->font();
     bold.setBold(true);
     heading_->setFont(bold);
