@@ -141,6 +141,7 @@ TEST_P(InLanguage, FitsItsWindow)
 TEST_P(InLanguage, TheTourGoesThroughTheWindow)
 {
     for (const QSize size : {kHandheld, kDesktop}) {
+        ASSERT_TRUE(UsePalette(size == kHandheld ? u"light" : u"dark"));
         Show(size);
         ResizeTo(size, Frame());
         Frame().ShowTour();

@@ -17,6 +17,7 @@
 #include "forms/ui/form_mak_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/property_sheet.h"
+#include "help/ui/help_desk.h"
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
 #include "querybuilder/ui/query_dialog.h"
@@ -94,6 +95,7 @@ protected:
             Run(u"INSERT INTO [Long names] VALUES(%1)"_s.arg(values));
     }
 
+    HelpDesk desk_{*qobject_cast<QApplication*>(QCoreApplication::instance())}; // its button is in the dialogs
     QPalette before_;
     QList<QSize> sizes_ = {kUpright, kFlat, kDesktop};
     QString prefix_; // of the pictures

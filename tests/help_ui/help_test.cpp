@@ -1,6 +1,6 @@
 // The help: every topic that a view names has its page, every link and picture is there, nothing is wider than a
 // handheld's screen.
-#include "app/ui/main_frame.h"
+#include "app/ui/look.h"
 #include "help/help_topics.h"
 #include "help/ui/help_desk.h"
 #include "help/ui/help_window.h"
@@ -20,6 +20,7 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QRegularExpression>
+#include <QStyle>
 #include <QTest>
 #include <QToolButton>
 #include <QWhatsThis>
@@ -97,7 +98,9 @@ TEST_P(Help, FollowsItsLinksAndFindsItsPictures)
 TEST_P(Help, IsNoWiderThanAHandheld)
 {
     QWidget window;
+    const auto [style, palette] = std::pair(QApplication::style()->objectName(), QApplication::palette());
     for (const QSize size : {QSize(240, 320), QSize(320, 240), QSize(1100, 700)}) {
+        ASSERT_TRUE(UsePalette(size.width() == 320 ? u"dark" : u"light"));
         window.resize(size);
         window.show();
         ShowHelp(window, u"main"_s);
@@ -108,6 +111,8 @@ TEST_P(Help, IsNoWiderThanAHandheld)
         EXPECT_LE(text->document()->size().width(), text->viewport()->width()) << size.width();
         delete help;
     }
+    QApplication::setStyle(style);
+    QApplication::setPalette(palette);
 }
 
 TEST_P(Help, SaysSomethingOfEachControlInItsTable)

@@ -153,7 +153,7 @@ void Tour::paintEvent(QPaintEvent*)
     const QRect part = PartRect();
     if (!part.isEmpty())
         dimmed.addRoundedRect(part, spacing::kCorner, spacing::kCorner);
-    QColor shade(Qt::black);
+    QColor shade = ColorOfRole(LookRole::Base, LookScheme::Dark); // in the light, too
     shade.setAlphaF(kDimmed);
     painter.fillPath(dimmed, shade);
     if (part.isEmpty())

@@ -2,6 +2,7 @@
 
 #include "help/help_topics.h"
 #include "help/ui/help_window.h"
+#include "platform/ui/look_roles.h"
 #include "resources/string_table.h"
 
 #include <QAbstractButton>
@@ -37,6 +38,19 @@ QStringList LabelsOf(const QWidget& part, const QWidget& window)
             labels += label->text();
     }
     return labels;
+}
+
+// On a small screen the dialog's own buttons come first; F1 is there in any case.
+bool HasRoomForOneMore(const QDialogButtonBox& box, const QDialog& dialog)
+{
+    const QFontMetrics metrics = dialog.fontMetrics();
+    int needed = 2 * metrics.height() + 2 * spacing::kRoom;
+    for (const QAbstractButton* button : box.buttons()) {
+        const int icon = button->icon().isNull() ? 0 : button->iconSize().width() + spacing::kTight;
+        needed +=
+            metrics.size(Qt::TextShowMnemonic, button->text()).width() + icon + spacing::kWide + spacing::kTight;
+    }
+    return needed <= dialog.width();
 }
 
 } // namespace
@@ -117,7 +131,7 @@ void HelpDesk::OfferButton(QDialog& dialog)
 {
     auto* buttons = dialog.findChild<QDialogButtonBox*>(QString(), Qt::FindDirectChildrenOnly);
     const bool hasPage = !HelpTopicOfClass(ClassOf(dialog)).isEmpty();
-    if (!buttons || !hasPage || dialog.findChild<QWidget*>(kButtonName))
+    if (!buttons || !hasPage || dialog.findChild<QWidget*>(kButtonName) || !HasRoomForOneMore(*buttons, dialog))
         return;
     auto* help = new QPushButton(u"?"_s, &dialog);
     help->setObjectName(kButtonName);

@@ -133,6 +133,7 @@ CHelpWindow::CHelpWindow(QWidget* parent)
     pages_ = new QListWidget(parts);
     pages_->setAccessibleName(StringText(Str::HelpPages));
     pages_->setTextElideMode(Qt::ElideRight);
+    pages_->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     text_ = new HelpBrowser(parts);
     parts->setChildrenCollapsible(false);
     parts->setStretchFactor(1, 1);
