@@ -17,6 +17,7 @@
 #include "forms/ui/form_mak_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/property_sheet.h"
+#include "help/help_topics.h"
 #include "help/ui/help_desk.h"
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
@@ -24,6 +25,7 @@
 #include "resources/string_table.h"
 #include "support/ui/screen_checks.h"
 #include "support/ui/spoken_in_windows.h"
+#include "tableeditor/ui/field_dialog.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/csv_options_dialog.h"
@@ -80,6 +82,19 @@ protected:
             FillSmallWindow(*dialog, window);
             dialog->show();
             ExpectFits(*dialog, prefix_ + name, size);
+            for (const QWidget* part : dialog->findChildren<QWidget*>())
+                said_ += HelpDesk::TextOf(*part);
+        }
+    }
+    // Every row on a control of these dialogs has met its control.
+    void ExpectSomethingWasSaidOf(const QStringList& dialogs)
+    {
+        for (const ControlHelp& row : ControlHelps()) {
+            if (dialogs.contains(QStringView(row.viewClass))) {
+                EXPECT_TRUE(said_.contains(StringText(row.text)))
+                    << QStringView(row.viewClass).toUtf8().toStdString() << ": "
+                    << StringText(row.label).toStdString();
+            }
         }
     }
     void GoThroughTheDialogs();
@@ -99,6 +114,7 @@ protected:
     QPalette before_;
     QList<QSize> sizes_ = {kUpright, kFlat, kDesktop};
     QString prefix_; // of the pictures
+    QSet<QString> said_;
 };
 
 // In a language whose words are longer.
@@ -189,6 +205,14 @@ void Walk::GoThroughTheDialogs()
         dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click();
         return dialog;
     });
+    ExpectDialogFits(u"field"_s, [](QWidget& window) {
+        return new CFieldDialog(
+            StringText(Str::DesignNewFieldTitle), {}, CFieldDialog::Focus::Name,
+            [](const FieldDesign&) { return true; }, &window);
+    });
+    ExpectSomethingWasSaidOf({u"CFilterDialog"_s, u"CSortDialog"_s, u"COptionsDialog"_s, u"CFormOptionsDialog"_s,
+                              u"CCsvOptionsDialog"_s, u"CImportOptionsDialog"_s, u"CQueryDialog"_s,
+                              u"CColorsDialog"_s, u"CFieldDialog"_s});
 }
 
 TEST_F(Walk, GoesThroughTheTableView)
@@ -350,6 +374,10 @@ void Walk::GoThroughTheFormMaker()
     items.type = ControlType::DropDownBox;
     items.SetSource(JoinDropDown({u"SELECT Name FROM People"_s, u"a"_s}));
     form->AddControl(items);
+    ControlDef call;
+    call.type = ControlType::Button;
+    call.buttonFunction = ButtonFunction::CallForm;
+    form->AddControl(call);
     FormMaker maker(*form, FormMaker::Start::New, {connection, path, store, prompt});
     ExpressionDesk desk(connection, path, {});
     const MakerDialogs dialogs;
@@ -371,6 +399,7 @@ void Walk::GoThroughTheFormMaker()
             return dialog;
         });
     }
+    ExpectSomethingWasSaidOf({u"CPropertySheet"_s, u"CExpressionDesk"_s});
     for (const QSize size : sizes_) {
         CFormMakView view(*form, FormMaker::Start::New,
                           {.maker = {connection, path, store, prompt}, .dialogs = {}, .words = {}});

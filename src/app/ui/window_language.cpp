@@ -7,6 +7,7 @@
 #include "resources/string_table.h"
 
 #include <QCoreApplication>
+#include <QDialog>
 #include <QDialogButtonBox>
 #include <QDir>
 #include <QLabel>

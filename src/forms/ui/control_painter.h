@@ -2,6 +2,7 @@
 
 #include "forms/form_records.h"
 
+#include <QFont>
 #include <QHash>
 #include <QPalette>
 #include <QRect>
