@@ -191,6 +191,18 @@ TEST_F(TourTest, IsLeftAtAnyStepWithEscapeOrItsCross)
     EXPECT_FALSE(tour);
 }
 
+TEST_F(TourTest, KeepsTheTabKey)
+{
+    const Tour* tour = Begin(kHandheld);
+    ASSERT_TRUE(tour);
+    for (const Qt::Key key : {Qt::Key_Tab, Qt::Key_Backtab}) {
+        for (int i = 0; i < 4; ++i) {
+            QTest::keyClick(QApplication::focusWidget(), key);
+            EXPECT_TRUE(tour->isAncestorOf(QApplication::focusWidget())) << i;
+        }
+    }
+}
+
 TEST_F(TourTest, FollowsTheWindowsSize)
 {
     Tour* tour = Begin(kDesktop);

@@ -248,6 +248,13 @@ TEST_F(Desk, SaysWhatAControlIsAndOtherwiseOpensThePage)
     EXPECT_FALSE(dialog.findChild<CHelpWindow*>());
     QWidget plain(&dialog);
     EXPECT_EQ(HelpDesk::TextOf(plain), QString());
+    plain.setGeometry(0, 0, 20, 20);
+    plain.show();
+    plain.raise();
+    QWhatsThis::enterWhatsThisMode();
+    QTest::mouseClick(&plain, Qt::LeftButton);
+    EXPECT_TRUE(dialog.findChild<CHelpWindow*>());
+    EXPECT_FALSE(QWhatsThis::inWhatsThisMode()) << "the next tap would be a question again";
 }
 
 } // namespace

@@ -4,6 +4,7 @@
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
+#include <QAbstractButton>
 #include <QBoxLayout>
 #include <QEvent>
 #include <QFrame>
@@ -168,6 +169,18 @@ void Tour::keyPressEvent(QKeyEvent* event)
         close();
     else
         QWidget::keyPressEvent(event);
+}
+
+bool Tour::focusNextPrevChild(bool next)
+{
+    QList<QAbstractButton*> buttons = bubble_->findChildren<QAbstractButton*>();
+    buttons.removeIf([](const QAbstractButton* button) { return !button->isVisible(); });
+    if (buttons.isEmpty())
+        return false;
+    const qsizetype now = std::ranges::find(buttons, focusWidget()) - buttons.begin();
+    const qsizetype step = next ? 1 : buttons.size() - 1;
+    buttons[(now + step) % buttons.size()]->setFocus(next ? Qt::TabFocusReason : Qt::BacktabFocusReason);
+    return true;
 }
 
 bool Tour::eventFilter(QObject* watched, QEvent* event)

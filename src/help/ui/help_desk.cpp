@@ -122,8 +122,10 @@ bool HelpDesk::TakeKey(QWidget& part, const QEvent& event)
 void HelpDesk::Explain(QWidget& part)
 {
     const QString text = TextOf(part);
-    if (text.isEmpty())
+    if (text.isEmpty()) {
+        QWhatsThis::leaveWhatsThisMode(); // as showText does
         return ShowHelp(part, HelpTopicOf(part));
+    }
     QWhatsThis::showText(part.mapToGlobal(QPoint(0, part.height())), text, &part);
 }
 

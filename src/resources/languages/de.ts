@@ -1113,7 +1113,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60700">
         <source>Puts the selected table, form or query into the favorites of this database</source>
         <extracomment>TipAddFavorites</extracomment>
-        <translation>Nimmt die ausgewählte Tabelle, Abfrage oder das Formular in die Favoriten dieser Datenbank auf</translation>
+        <translation>Nimmt die ausgewählte Tabelle, das Formular oder die Abfrage in die Favoriten dieser Datenbank auf</translation>
     </message>
     <message id="60701">
         <source>Takes the selected entry out of the favorites; the entry itself stays</source>
@@ -1188,7 +1188,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60716">
         <source>Makes a new table, form or query, whichever tab is shown</source>
         <extracomment>TipNew</extracomment>
-        <translation>Legt eine neue Tabelle, Abfrage oder ein neues Formular an, je nach Seite</translation>
+        <translation>Legt eine neue Tabelle, ein neues Formular oder eine neue Abfrage an, je nach Seite</translation>
     </message>
     <message id="60717">
         <source>Design a new table</source>
@@ -1243,7 +1243,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60727">
         <source>No favorites yet. Add Favorites, in the menu of a table, form or query, puts it here.</source>
         <extracomment>EmptyFavorites</extracomment>
-        <translation>Noch keine Favoriten. „Zu Favoriten hinzufügen“ im Menü einer Tabelle, Abfrage oder eines Formulars setzt sie hierher.</translation>
+        <translation>Noch keine Favoriten. „Zu Favoriten hinzufügen“ im Menü eines Eintrags setzt ihn hierher.</translation>
     </message>
     <message id="60728">
         <source>No tables yet. New makes one.</source>
@@ -5317,7 +5317,7 @@ Möchten Sie sie ersetzen?</translation>
     <message id="63849">
         <source>Raise Input Panel on Startup</source>
         <extracomment>PropRaisePanel</extracomment>
-        <translation>Eingabefeld beim Start zeigen</translation>
+        <translation>Bildschirmtastatur beim Start</translation>
     </message>
     <message id="63850">
         <source>Form Scroll Bar on Startup</source>
