@@ -77,6 +77,7 @@ public:
     Catalog& GetCatalog() { return catalog_; }
     DbConnection& Connection() { return connection_; }
     UserPrompt& Prompt() { return prompt_; }
+    const ProgramFolder& Folder() const { return folder_; }
 
     // Each must be removed before it goes.
     void AddListener(SessionListener& listener) { listeners_.push_back(&listener); }

@@ -14,9 +14,9 @@ namespace {
 
 const QString kDot = QStringLiteral(" · ");
 
-QString CountText(qint64 count, Str one, Str many)
+QString CountText(qint64 count, Str text)
 {
-    return count == 1 ? StringText(one) : StringText(many, {UserLocale::Current().Locale().toString(count)});
+    return StringText(text, {UserLocale::Current().Locale().toString(count)});
 }
 
 QString ChangeText(const QDateTime& changed)
@@ -106,9 +106,9 @@ QString EntrySummary::EntryLine() const
     }
     QStringList parts;
     if (fields_)
-        parts += CountText(*fields_, Str::SummaryOneField, Str::SummaryFields);
+        parts += CountText(*fields_, Str::SummaryFields);
     if (records_)
-        parts += CountText(*records_, Str::SummaryOneRecord, Str::SummaryRecords);
+        parts += CountText(*records_, Str::SummaryRecords);
     else if (counted_)
         parts += StringText(Str::SummaryCounting);
     return parts.join(kDot);

@@ -27,6 +27,8 @@ enum class Setting {
     MainViewTextColor,
     MainViewFont,
     MainViewPalette,
+    MainViewLanguage,
+    MainViewTourSeen,
     TableViewMaxColumnChars,
     TableViewConfirmDelete,
     TableViewSortColumn,

@@ -24,6 +24,8 @@ const std::array kOptions = {
               nullptr},
     OptionDef{u"palette", u"own|light|dark|desktop", u"the program's own look, or the desktop's",
               &WindowOptions::palette, nullptr},
+    OptionDef{u"language", u"CODE", u"the language of the window, such as de or en", &WindowOptions::language,
+              nullptr},
     OptionDef{u"sample", u"", u"open the sample database, and make it first where it is not there", nullptr,
               &WindowOptions::sample},
     OptionDef{u"picture", u"FILE", u"write a picture of the window to a PNG file and end", &WindowOptions::picture,
@@ -69,6 +71,11 @@ bool ReadOptions(const QCommandLineParser& parser, WindowOptions& options, QStri
     static const QStringList palettes = {{}, u"own"_s, u"light"_s, u"dark"_s, u"desktop"_s};
     if (!palettes.contains(options.palette)) {
         complaint = u"--palette is own, light, dark or desktop, not \"%1\""_s.arg(options.palette);
+        return false;
+    }
+    static const QRegularExpression language(u"^[A-Za-z]{2,3}([_-][A-Za-z0-9]{1,8}){0,3}$"_s);
+    if (!options.language.isEmpty() && !language.match(options.language).hasMatch()) {
+        complaint = u"--language is a code such as de or pt-BR, not \"%1\""_s.arg(options.language);
         return false;
     }
     if (parser.isSet(u"size"_s)) {

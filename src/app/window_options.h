@@ -13,6 +13,7 @@ struct WindowOptions {
     QString database;    // to open; empty: the one of the last time
     QString home;        // the program folder; empty: as ProgramFolder::Find says
     QString palette;     // "own", "light", "dark", "desktop"; empty: as the settings have it
+    QString language;    // of the texts, such as "de"; empty: as the settings have it
     bool sample = false; // opens the sample, and makes it when it is not there
 
     // A picture of the window instead of the window.

@@ -2,9 +2,11 @@
 
 #include "data/catalog.h"
 #include "platform/ole_date.h"
+#include "resources/string_table.h"
 
 #include <QLocale>
 
+#include <algorithm>
 #include <array>
 #include <optional>
 
@@ -13,6 +15,22 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+struct ShownOperator {
+    std::u16string_view name;
+    Str shown;
+};
+// Those that are words; the others are shown as they are written.
+constexpr std::array kShownOperators = {
+    ShownOperator{u"contains", Str::OperatorContains},
+    ShownOperator{u"begins with", Str::OperatorBeginsWith},
+    ShownOperator{u"ends with", Str::OperatorEndsWith},
+    ShownOperator{u"not contains", Str::OperatorNotContains},
+    ShownOperator{u"not begins with", Str::OperatorNotBeginsWith},
+    ShownOperator{u"not ends with", Str::OperatorNotEndsWith},
+    ShownOperator{u"not =", Str::OperatorNotEqual},
+    ShownOperator{u"is true", Str::OperatorIsTrue},
+    ShownOperator{u"is false", Str::OperatorIsFalse},
+};
 constexpr std::array<std::u16string_view, 6> kComparisons = {u"=", u">", u">=", u"<", u"<=", u"not ="};
 constexpr std::array<std::u16string_view, 2> kTruths = {u"is true", u"is false"};
 
@@ -119,6 +137,12 @@ QString ConditionFromCell(CellFilter filter, const QString& reference, FieldType
         return u"%1 = %2"_s.arg(reference, QuoteText(displayText));
     }();
     return filter == CellFilter::ExcludingSelection ? u"(NOT(%1))"_s.arg(condition) : condition;
+}
+
+QString FilterOperatorText(std::u16string_view name)
+{
+    const auto row = std::ranges::find(kShownOperators, name, &ShownOperator::name);
+    return row == kShownOperators.end() ? QStringView(name).toString() : StringText(row->shown);
 }
 
 std::span<const std::u16string_view> FilterOperators(FieldType type, FilterKind kind)

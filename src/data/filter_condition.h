@@ -22,6 +22,7 @@ QString ConditionFromCell(CellFilter filter, const QString& reference, FieldType
 // of a From-To filter.
 enum class FilterKind { Single, Range };
 std::span<const std::u16string_view> FilterOperators(FieldType type, FilterKind kind = FilterKind::Single);
+QString FilterOperatorText(std::u16string_view name); // as a person reads it
 
 // The contents of the filter dialog: a field, an operator and a value, or two of each.
 struct FilterDraft {

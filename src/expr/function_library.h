@@ -1,6 +1,7 @@
 #pragma once
 
 #include "expr/evaluation.h"
+#include "resources/string_id.h"
 
 #include <span>
 #include <string_view>
@@ -21,7 +22,7 @@ struct FunctionDef {
     // "a".
     std::string_view parameters;
     ResultKind result;
-    std::u16string_view help; // "UPPER(text): the text in upper case"
+    Str help; // "UPPER(text): the text in upper case"
 
     int required = Count(parameters.substr(0, parameters.find('|')));
     int allowed = Count(parameters);

@@ -10,8 +10,10 @@ namespace mirel {
 enum class Str : int {
 #ifndef Q_MOC_RUN // which cannot follow includes inside an enum
 #define MIREL_STRING(name, number, text) name = (number),
+#define MIREL_COUNTED(name, number, counted, one, many) name = (number),
 #include "resources/strings.def"
 #undef MIREL_STRING
+#undef MIREL_COUNTED
 #endif
 };
 

@@ -69,7 +69,7 @@ TEST_F(RenamingTest, MendsWhatRefersToATableOrAField)
     field.name = u"Full Name"_s;
     EXPECT_FALSE(designer.ChangeField(0, field)) << "No keeps the name";
     EXPECT_EQ(prompt_.questions,
-              QStringList{u"\"Name\" is used here:\r\nForm \"Entry\": 1 place(s)\r\nQuery \"All\": 1 place(s)\r\n"
+              QStringList{u"\"Name\" is used here:\r\nForm \"Entry\": 1 place\r\nQuery \"All\": 1 place\r\n"
                           "Shall all of these say \"Full Name\" from now on?"_s});
     EXPECT_EQ(designer.Fields()[0].name, u"Name"_s);
     EXPECT_EQ(Query(), u"SELECT Name FROM Birds ORDER BY Name"_s);
@@ -89,7 +89,7 @@ TEST_F(RenamingTest, RenamesFormsAndQueries)
 {
     prompt_.answers = {true, true};
     EXPECT_TRUE(renaming_.RenameInStore(EntryKind::Form, u"Entry"_s, u" Start "_s));
-    EXPECT_EQ(prompt_.questions[0], u"\"Entry\" is used here:\r\nForm \"Menu\": 1 place(s)\r\nFavorites\r\n"
+    EXPECT_EQ(prompt_.questions[0], u"\"Entry\" is used here:\r\nForm \"Menu\": 1 place\r\nFavorites\r\n"
                                     "Shall all of these say \"Start\" from now on?"_s);
     EXPECT_EQ(Source(u"Menu"_s), u"Start"_s);
     EXPECT_NE(session_.Store().FindForm(u"Start"), nullptr);

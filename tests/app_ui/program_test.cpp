@@ -68,6 +68,7 @@ TEST_F(ProgramTest, FailsWithAWordAndAStatus)
     };
     const Row rows[] = {
         {{u"--pallette"_s}, 2, u"pallette"_s},
+        {{u"--language"_s, u"../de"_s}, 2, u"--language"_s},
         {{u"--picture"_s, PathOf(u"p.png"_s), u"--sample"_s, u"--table"_s, u"Bees"_s}, 1, u"table"_s},
         {{u"--picture"_s, PathOf(u"no/such/folder/p.png"_s)}, 1, u"p.png"_s},
         {{u"--picture"_s, PathOf(u"p.png"_s), PathOf(u"gone.cdb"_s)}, 1, u"gone.cdb"_s},
@@ -77,6 +78,29 @@ TEST_F(ProgramTest, FailsWithAWordAndAStatus)
         EXPECT_TRUE(messages_.contains(row.said)) << messages_.toStdString();
     }
     EXPECT_FALSE(QFileInfo::exists(PathOf(u"p.png"_s)));
+}
+
+TEST_F(ProgramTest, SpeaksTheLanguageThatItIsToldAndOtherwiseEnglish)
+{
+    const auto picture = [this](const QString& language) {
+        const QString path = PathOf(language + u".png"_s);
+        EXPECT_EQ(Run({u"--picture"_s, path, u"--size"_s, u"480x400"_s, u"--language"_s, language}), 0)
+            << messages_.toStdString();
+        return QImage(path);
+    };
+    const QImage english = picture(u"en"_s);
+    EXPECT_NE(picture(u"de"_s), english);
+    EXPECT_EQ(picture(u"xx"_s), english);
+    // The user's own file comes first, and does no harm: here the bytes of a picture.
+    ASSERT_TRUE(QDir(folder_.path()).mkdir(u"Languages"_s));
+    ASSERT_TRUE(QFile::copy(PathOf(u"en.png"_s), PathOf(u"Languages/xx.ts"_s)));
+    EXPECT_EQ(picture(u"xx"_s), english);
+    EXPECT_TRUE(messages_.contains(u"cannot read the language file"_s)) << messages_.toStdString();
+    QFile own(PathOf(u"Languages/de.ts"_s));
+    ASSERT_TRUE(own.open(QIODevice::WriteOnly));
+    own.write("<TS language=\"de\"></TS>"); // translates nothing
+    own.close();
+    EXPECT_EQ(picture(u"de"_s), english);
 }
 
 } // namespace

@@ -17,11 +17,15 @@
 #include "forms/ui/form_mak_view.h"
 #include "forms/ui/form_options_dialog.h"
 #include "forms/ui/property_sheet.h"
+#include "help/help_topics.h"
+#include "help/ui/help_desk.h"
 #include "platform/ui/day_chooser.h"
 #include "platform/ui/window_place.h"
 #include "querybuilder/ui/query_dialog.h"
 #include "resources/string_table.h"
 #include "support/ui/screen_checks.h"
+#include "support/ui/spoken_in_windows.h"
+#include "tableeditor/ui/field_dialog.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/csv_options_dialog.h"
@@ -70,16 +74,32 @@ protected:
     template <typename Make>
     void ExpectDialogFits(const QString& name, Make make)
     {
-        for (const QSize size : {kUpright, kFlat, kDesktop}) {
+        for (const QSize size : sizes_) {
             QWidget window;
             window.resize(size);
             window.show();
             const std::unique_ptr<QDialog> dialog(make(window));
             FillSmallWindow(*dialog, window);
             dialog->show();
-            ExpectFits(*dialog, name, size);
+            ExpectFits(*dialog, prefix_ + name, size);
+            for (const QWidget* part : dialog->findChildren<QWidget*>())
+                said_ += HelpDesk::TextOf(*part);
         }
     }
+    // Every row on a control of these dialogs has met its control.
+    void ExpectSomethingWasSaidOf(const QStringList& dialogs)
+    {
+        for (const ControlHelp& row : ControlHelps()) {
+            if (dialogs.contains(QStringView(row.viewClass))) {
+                EXPECT_TRUE(said_.contains(StringText(row.text)))
+                    << QStringView(row.viewClass).toUtf8().toStdString() << ": "
+                    << StringText(row.label).toStdString();
+            }
+        }
+    }
+    void GoThroughTheDialogs();
+    void GoThroughTheTableView();
+    void GoThroughTheFormMaker();
 
     void MakeLongNames()
     {
@@ -90,10 +110,36 @@ protected:
             Run(u"INSERT INTO [Long names] VALUES(%1)"_s.arg(values));
     }
 
+    HelpDesk desk_{*qobject_cast<QApplication*>(QCoreApplication::instance())}; // its button is in the dialogs
     QPalette before_;
+    QList<QSize> sizes_ = {kUpright, kFlat, kDesktop};
+    QString prefix_; // of the pictures
+    QSet<QString> said_;
+};
+
+// In a language whose words are longer.
+class WalkInGerman : public Walk {
+protected:
+    WalkInGerman()
+    {
+        sizes_ = {kUpright, kDesktop};
+        prefix_ = u"de-"_s;
+    }
+
+    const SpokenInWindows german_{u"de"_s};
 };
 
 TEST_F(Walk, GoesThroughTheDialogs)
+{
+    GoThroughTheDialogs();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheDialogs)
+{
+    GoThroughTheDialogs();
+}
+
+void Walk::GoThroughTheDialogs()
 {
     FieldLists lists(connection, path, prompt);
     FormStore store(folder.filePath(u"walk.raf"_s));
@@ -159,12 +205,30 @@ TEST_F(Walk, GoesThroughTheDialogs)
         dialog->findChild<QDialogButtonBox*>()->button(QDialogButtonBox::Ok)->click();
         return dialog;
     });
+    ExpectDialogFits(u"field"_s, [](QWidget& window) {
+        return new CFieldDialog(
+            StringText(Str::DesignNewFieldTitle), {}, CFieldDialog::Focus::Name,
+            [](const FieldDesign&) { return true; }, &window);
+    });
+    ExpectSomethingWasSaidOf({u"CFilterDialog"_s, u"CSortDialog"_s, u"COptionsDialog"_s, u"CFormOptionsDialog"_s,
+                              u"CCsvOptionsDialog"_s, u"CImportOptionsDialog"_s, u"CQueryDialog"_s,
+                              u"CColorsDialog"_s, u"CFieldDialog"_s});
 }
 
 TEST_F(Walk, GoesThroughTheTableView)
 {
+    GoThroughTheTableView();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheTableView)
+{
+    GoThroughTheTableView();
+}
+
+void Walk::GoThroughTheTableView()
+{
     MakeLongNames();
-    for (const QSize size : {QSize(200, 200), kUpright, kFlat, kDesktop, QSize(4000, 3000)}) {
+    for (const QSize size : QList{QSize(200, 200), QSize(4000, 3000)} + sizes_) {
         CTableView view(connection, path, prompt, {});
         view.resize(size);
         ASSERT_TRUE(view.OpenTable(u"Long names"_s));
@@ -176,25 +240,25 @@ TEST_F(Walk, GoesThroughTheTableView)
                     action->trigger();
             }
         };
-        ExpectFits(view, u"table"_s, size);
+        ExpectFits(view, prefix_ + u"table"_s, size);
         grid->setFocus();
         QTest::keyClicks(grid, u"abc"_s);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
-        ExpectFits(view, u"table-refused"_s, size);
+        ExpectFits(view, prefix_ + u"table-refused"_s, size);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
         command(Str::ActionFind);
-        ExpectFits(view, u"table-find"_s, size);
+        ExpectFits(view, prefix_ + u"table-find"_s, size);
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
         command(Str::ActionDetail);
-        ExpectFits(view, u"table-detail"_s, size);
+        ExpectFits(view, prefix_ + u"table-detail"_s, size);
         command(Str::ActionList);
         grid->setFocus();
         QTest::keyClick(grid, Qt::Key_Right);
         command(Str::ZoomIn);
-        ExpectFits(view, u"table-zoom"_s, size);
+        ExpectFits(view, prefix_ + u"table-zoom"_s, size);
         command(Str::ZoomBack);
         command(Str::ActionFilterBy);
-        ExpectFits(view, u"table-filtered"_s, size);
+        ExpectFits(view, prefix_ + u"table-filtered"_s, size);
     }
 }
 
@@ -289,6 +353,16 @@ TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
 
 TEST_F(Walk, GoesThroughTheFormMaker)
 {
+    GoThroughTheFormMaker();
+}
+
+TEST_F(WalkInGerman, GoesThroughTheFormMaker)
+{
+    GoThroughTheFormMaker();
+}
+
+void Walk::GoThroughTheFormMaker()
+{
     FormStore store(folder.filePath(u"walk.raf"_s));
     std::optional<FormDef> form = DefaultFormOf(connection, path, u"People"_s, prompt);
     ASSERT_TRUE(form);
@@ -300,6 +374,10 @@ TEST_F(Walk, GoesThroughTheFormMaker)
     items.type = ControlType::DropDownBox;
     items.SetSource(JoinDropDown({u"SELECT Name FROM People"_s, u"a"_s}));
     form->AddControl(items);
+    ControlDef call;
+    call.type = ControlType::Button;
+    call.buttonFunction = ButtonFunction::CallForm;
+    form->AddControl(call);
     FormMaker maker(*form, FormMaker::Start::New, {connection, path, store, prompt});
     ExpressionDesk desk(connection, path, {});
     const MakerDialogs dialogs;
@@ -321,12 +399,13 @@ TEST_F(Walk, GoesThroughTheFormMaker)
             return dialog;
         });
     }
-    for (const QSize size : {kUpright, kFlat, kDesktop}) {
+    ExpectSomethingWasSaidOf({u"CPropertySheet"_s, u"CExpressionDesk"_s});
+    for (const QSize size : sizes_) {
         CFormMakView view(*form, FormMaker::Start::New,
                           {.maker = {connection, path, store, prompt}, .dialogs = {}, .words = {}});
         view.resize(size);
         view.show();
-        ExpectFits(view, u"maker"_s, size);
+        ExpectFits(view, prefix_ + u"maker"_s, size);
         view.GiveUpEdits();
     }
 }

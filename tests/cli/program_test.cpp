@@ -226,8 +226,8 @@ TEST_F(Program, TellsWhatAnImportLeftOut)
     const QStringList columns = {u"--create"_s, u"--columns"_s, u"N:Integer,T:Memo"_s};
     EXPECT_EQ(Import(file, columns),
               (Ended{0, u"1 record(s) imported.\n"_s,
-                     u"1 text(s) of more than 8192 characters were cut.\n"
-                     "1 text(s) held more than the number at their beginning; the rest was left out.\n"_s}));
+                     u"1 text of more than 8192 characters was cut.\n"
+                     "1 text held more than the number at its beginning; the rest was left out.\n"_s}));
     EXPECT_EQ(Sql(u"SELECT * FROM T"_s), u"N,T\n12,"_s + QString(8192, u'x') + u'\n');
     Sql(u"DROP TABLE T"_s);
     Import(file, columns + QStringList{u"--whole-texts"_s});

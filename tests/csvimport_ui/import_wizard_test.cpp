@@ -183,7 +183,7 @@ TEST_F(ImportWizard, LeadsAFileIntoANewTableByTheStylus)
         GoOn();
         EXPECT_EQ(Heading(), u"Define Fields (step 4 of 4)"_s);
         EXPECT_EQ(Next()->text(), StringText(Str::ImportRun));
-        TrialEnds(u"All 2 line(s) fit."_s);
+        TrialEnds(u"All 2 lines fit."_s);
         auto* list = wizard_->findChild<QTreeWidget*>();
         EXPECT_EQ(list->topLevelItem(3)->text(2), u"Text"_s) << "a code with zeros in front";
         EXPECT_EQ(list->topLevelItem(0)->text(4), u"Elster"_s);
@@ -264,7 +264,7 @@ TEST_F(ImportWizard, MarksLinesThatWillFailAndPassesThemOver)
     auto* list = wizard_->findChild<QTreeWidget*>();
     TapRow(list, 1, 1);
     wizard_->findChild<QSpinBox*>()->setValue(5);
-    TrialEnds(u"1 line(s) will fail. Line 3, column 2"_s);
+    TrialEnds(u"1 line will fail. Line 3, column 2"_s);
     EXPECT_TRUE(list->topLevelItem(1)->toolTip(4).contains(u"line 3"_s));
     Paint(u"4-failing"_s);
     // Without the option the run ends there; with it the line goes to a file.

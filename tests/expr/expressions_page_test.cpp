@@ -116,7 +116,7 @@ TEST(ExpressionsPage, TellsOfEveryFunctionAndOperator)
         return QString::fromUtf16(units.data(), qsizetype(units.size()));
     };
     for (const FunctionDef& function : Functions())
-        EXPECT_TRUE(functions.contains(text(function.help))) << text(function.help).toStdString();
+        EXPECT_TRUE(functions.contains(StringText(function.help))) << StringText(function.help).toStdString();
     for (const std::span<const OperatorDef> table : {ArithmeticOperators(), ConditionWords()}) {
         for (const OperatorDef& def : table)
             EXPECT_TRUE(tokens.contains(text(def.text))) << text(def.text).toStdString();

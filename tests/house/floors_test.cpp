@@ -16,8 +16,8 @@ using namespace Qt::StringLiterals;
 
 // Ground first. A path belongs to the longest entry that it begins with; ui folders stand above all.
 constexpr std::array kFloors = {
-    "resources", "platform", "provider/dialect", "provider",    "provider/sqlite", "data", "result",
-    "expr",      "forms",    "tableview",        "querybuilder", "tableeditor", "csvimport",       "app",  "cli"};
+    "resources", "platform", "help",      "provider/dialect", "provider",    "provider/sqlite", "data", "result",
+    "expr",      "forms",    "tableview", "querybuilder",     "tableeditor", "csvimport",       "app",  "cli"};
 
 int FloorOf(const QString& path)
 {

@@ -14,7 +14,7 @@ public:
     std::deque<bool> answers;
     std::deque<std::optional<QString>> texts;
     bool cancels = false; // questions that can be cancelled
-    qint64 stopAt = -1; // progress asks to stop once this many are done; -1: never
+    qint64 stopAt = -1;   // progress asks to stop once this many are done; -1: never
 
     QStringList questions; // what was asked
     QStringList shown;     // messages and errors

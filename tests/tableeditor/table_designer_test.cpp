@@ -115,7 +115,7 @@ TEST_F(TableDesignerTest, ChangesKeepRecordsAndRowIds)
     field.type = FieldType::Integer;
     EXPECT_TRUE(designer_.ChangeField(6, field));
     EXPECT_EQ(prompt_.questions.last(), u"Change the field \"Code\" from Text (10) to Integer?\r\n"
-                                        "Its 10000 value(s) keep their meaning."_s);
+                                        "Its 10000 values keep their meaning."_s);
     EXPECT_EQ(Records(kRenamed), before);
     field = FieldAt(designer_, 0);
     field.type = FieldType::YesNo;
@@ -125,7 +125,7 @@ TEST_F(TableDesignerTest, ChangesKeepRecordsAndRowIds)
               "9999 of its 10000 value(s) will read differently, and cannot be got back."_s);
     EXPECT_TRUE(designer_.DropField(RowOf(designer_, u"Note"_s)));
     EXPECT_EQ(prompt_.questions.last(), u"Are you sure you want to drop this field \"Note\"?\r\n"
-                                        "It holds 8000 value(s), which go with it."_s);
+                                        "It holds 8000 values, which go with it."_s);
     EXPECT_TRUE(designer_.AddField({.name = u"O'Brien \"x\""_s, .index = IndexOrder::Descending}));
     EXPECT_EQ(Describe(u"Bird s"_s), u"N Yes/No NO, Who Text 60 ASC, Price Double NO, Seen DateTime NO, "
                                      "Rare Yes/No NO, Code Integer NO, O'Brien \"x\" Text 255 DESC"_s);
@@ -138,7 +138,7 @@ TEST_F(TableDesignerTest, ChangesKeepRecordsAndRowIds)
     EXPECT_EQ(designer_.FirstValues(2)[1], QStringList({u"bird 1"_s, u"bird 2"_s}));
     EXPECT_TRUE(designer_.DropTable());
     EXPECT_EQ(prompt_.questions.last(), u"Are you sure you want to drop this table \"Vogel\"?\r\n"
-                                        "It holds 10000 record(s), which go with it."_s);
+                                        "It holds 10000 records, which go with it."_s);
     EXPECT_EQ(Describe(u"Vogel"_s), u"gone"_s);
     EXPECT_EQ(host_.told.last(), u"dropped Vogel"_s);
 }
@@ -214,7 +214,7 @@ TEST_F(TableDesignerTest, AsksAgainWhenMoreIsLostThanWasSaid)
     prompt.meddle = [this] { SqliteFile(path_).Run("UPDATE [Bird s] SET Note='x' WHERE N=5"); };
     EXPECT_FALSE(designer.DropField(6));
     ASSERT_EQ(prompt.questions.size(), 2);
-    EXPECT_TRUE(prompt.questions[1].contains(u"41 value(s)"_s)) << prompt.questions[1].toStdString();
+    EXPECT_TRUE(prompt.questions[1].contains(u"41 values"_s)) << prompt.questions[1].toStdString();
     prompt.answers = {true};
     prompt.meddle = [this] { SqliteFile(path_).Run("UPDATE [Bird s] SET Code='x' WHERE N=5"); };
     FieldDesign code = designer.Fields()[5];
@@ -224,7 +224,7 @@ TEST_F(TableDesignerTest, AsksAgainWhenMoreIsLostThanWasSaid)
     prompt.answers = {true, true};
     prompt.meddle = [this] { SqliteFile(path_).Run("INSERT INTO [Bird s](N) VALUES (51)"); };
     EXPECT_TRUE(designer.DropTable());
-    EXPECT_TRUE(prompt.questions.last().contains(u"51 record(s)"_s));
+    EXPECT_TRUE(prompt.questions.last().contains(u"51 records"_s));
 }
 
 TEST_F(TableDesignerTest, LeavesTheTableAsItWasWhenTheDatabaseRefuses)

@@ -107,7 +107,7 @@ TEST_F(OpenViewsTest, CloseWithTheirTable)
     prompt_.answers = {true};
     Give(ShellCommand::Delete);
     EXPECT_EQ(prompt_.questions, QStringList{u"Are you sure you want to drop this table \"Birds\"?\r\n"
-                                             "It holds 1 record(s), which go with it."_s});
+                                             "It holds 1 record, which goes with it."_s});
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     EXPECT_TRUE(view.isNull());
     EXPECT_TRUE(form.isNull());

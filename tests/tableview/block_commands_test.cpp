@@ -297,7 +297,7 @@ TEST_F(Blocks, UndoLeavesAloneWhatSomebodyElseChanged)
     Run(u"DELETE FROM People WHERE Name='c'"_s);
     EXPECT_TRUE(browser.Undo());
     EXPECT_EQ(All(u"Name"_s), u"P1 mine P4"_s);
-    EXPECT_EQ(prompt.shown, QStringList{u"2 record(s) have been changed or deleted since, and were left as they "
+    EXPECT_EQ(prompt.shown, QStringList{u"2 records have been changed or deleted since, and were left as they "
                                         "are."_s});
     EXPECT_FALSE(browser.CanUndo());
 }

@@ -114,13 +114,13 @@ void CFontsDialog::LayOut()
     grid->addWidget(size_, 1, 1);
     grid->addWidget(bold_, 2, 0);
     grid->addWidget(italic_, 2, 1);
-    grid->addWidget(strikeout_, 3, 0);
-    grid->addWidget(underline_, 3, 1);
-    grid->addWidget(color, 4, 0);
-    grid->addWidget(swatch_, 4, 1);
-    grid->addWidget(sample_, 5, 0, 1, 2);
+    grid->addWidget(strikeout_, 3, 0, 1, 2); // in some languages as long as a small window is wide
+    grid->addWidget(underline_, 4, 0, 1, 2);
+    grid->addWidget(color, 5, 0);
+    grid->addWidget(swatch_, 5, 1);
+    grid->addWidget(sample_, 6, 0, 1, 2);
     grid->setColumnStretch(1, 1);
-    grid->setRowStretch(5, 1);
+    grid->setRowStretch(6, 1);
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
     connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);

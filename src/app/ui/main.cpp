@@ -2,11 +2,14 @@
 #include "app/ui/look.h"
 #include "app/ui/main_frame.h"
 #include "app/ui/message_box_prompt.h"
+#include "app/ui/window_language.h"
 #include "app/window_options.h"
 #include "cli/console_prompt.h"
+#include "help/ui/help_desk.h"
 
 #include <QApplication>
 #include <QEventLoop>
+#include <QFileInfo>
 #include <QTimer>
 
 #include <cstdio>
@@ -129,10 +132,20 @@ int TakePicture(const WindowOptions& options)
     return kFailed;
 }
 
+// Nothing was kept yet, and nothing to look at was asked for. Once, even where it is left at its first step.
+bool IsFirstStart(const WindowOptions& options, Settings& settings)
+{
+    const bool asks = options.sample || !options.database.isEmpty() || !options.table.isEmpty() ||
+                      !options.form.isEmpty() || !options.query.isEmpty();
+    return !asks && !QFileInfo::exists(ProgramFolder::Find(options.home).ProfileFile()) &&
+           settings.SetInt(Setting::MainViewTourSeen, 1);
+}
+
 int ShowWindow(const WindowOptions& options)
 {
     MessageBoxPrompt prompt;
     Core core(options.home, prompt);
+    const bool isFirst = IsFirstStart(options, core.settings);
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
     frame.show();
     (void)Open(core, options); // after show: what it has to say stands over the window
@@ -141,6 +154,8 @@ int ShowWindow(const WindowOptions& options)
         return kFailed;
     if (!frame.IsAlone())
         frame.RestoreViews();
+    if (isFirst)
+        frame.ShowTour();
     const int result = QApplication::exec();
     core.commands.KeepForNextRun();
     return result;
@@ -190,7 +205,10 @@ int main(int argc, char** argv)
     const bool picture = !options->picture.isEmpty();
     if (picture)
         qputenv("QT_QPA_PLATFORM", "offscreen");
-    const QApplication application(argc, argv);
+    QApplication application(argc, argv);
+    const ProgramFolder folder = ProgramFolder::Find(options->home);
+    UseLanguage(options->language, folder, Settings(Profile(folder.ProfileFile())));
+    new HelpDesk(application);
     // Without a display name of its own: that would be put behind every window's title.
     if (!UsePalette(PaletteToUse(*options)))
         QApplication::setStyle(new TouchTargetStyle({}));

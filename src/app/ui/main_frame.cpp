@@ -11,6 +11,7 @@
 #include "app/ui/view_window.h"
 #include "forms/ui/form_eng_view.h"
 #include "platform/ui/keys_dialog.h"
+#include "platform/ui/look_roles.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
@@ -46,7 +47,18 @@ constexpr QSize kSmallestSize(160, 160);
 constexpr int kSideBarFirstWidth = 212;
 constexpr int kSideBarLeastWidth = 140;
 constexpr int kLookAtFileMs = 1000;
-constexpr int kCornerShare = 3; // of the window's width, the most that the name in the corner takes
+// What the name in the corner takes of the window's width: a third of it at most, a fifth at least.
+constexpr int kMostCornerShare = 3;
+constexpr int kLeastCornerShare = 5;
+
+// What the menus leave for the name in the corner.
+int RoomForName(const QMenuBar& menus, int widthPx)
+{
+    int taken = spacing::kSection; // the arrow beside the name
+    for (const QAction* menu : menus.actions())
+        taken += menus.fontMetrics().size(Qt::TextShowMnemonic, menu->text()).width() + spacing::kWide;
+    return std::clamp(widthPx - taken, widthPx / kLeastCornerShare, widthPx / kMostCornerShare);
+}
 
 // Between parts of the window.
 QFrame* Line(QFrame::Shape shape, QWidget* parent)
@@ -227,8 +239,9 @@ void CMainFrame::ShowTitle()
     const QString name = front && !wide_ ? tabs_->TitleAt(tabs_->Current())
                          : wide_         ? database
                                          : StringText(Str::OpenViews);
-    const QString shown =
-        corner_->fontMetrics().elidedText(name, Qt::ElideMiddle, width() / kCornerShare).replace(u'&', u"&&"_s);
+    const QString shown = corner_->fontMetrics()
+                              .elidedText(name, Qt::ElideMiddle, RoomForName(*menuBar(), width()))
+                              .replace(u'&', u"&&"_s);
     if (shown != corner_->text())
         corner_->hide(); // the bar measures a corner only when it comes to show
     corner_->setText(shown);
@@ -254,6 +267,7 @@ void CMainFrame::FitWidth()
     ShowState();
     shownFront_ = nullptr;
     ShowMenus();
+    ShowTitle();
     if (focusInLists && !tabs_->Front())
         ShowLists();
 }

@@ -76,6 +76,10 @@ public:
     // From here on the window is that of the views opened in it: it shows no lists, and closes with the last view.
     void BeAlone();
     bool IsAlone() const { return alone_; }
+    // The help page of the view in front.
+    void ShowHelpOfFront();
+    // Points at the parts of the window one by one.
+    void ShowTour();
 
 protected:
     void closeEvent(QCloseEvent* event) override;

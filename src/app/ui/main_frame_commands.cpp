@@ -3,9 +3,12 @@
 #include "app/ui/main_frame.h"
 #include "app/ui/shell_actions.h"
 #include "app/ui/view_tabs.h"
+#include "app/ui/window_language.h"
 #include "csvimport/import_source.h"
 #include "resources/string_table.h"
 #include "tableview/ui/export_wizard.h"
+
+#include <QWhatsThis>
 
 #include <array>
 
@@ -69,7 +72,9 @@ struct CMainFrame::Commands {
         }
     }
     static void Import(CMainFrame& frame) { frame.ImportFrom({}); }
-    static void Nothing(CMainFrame&) {} // opens a menu, or is not built yet
+    static void AskWhatThisIs(CMainFrame&) { QWhatsThis::enterWhatsThisMode(); }
+    static void Language(CMainFrame& frame) { ChooseLanguage(frame.session_.Folder(), frame.settings_, frame); }
+    static void Nothing(CMainFrame&) {} // opens a menu
 
     static State Always(const CMainFrame&) { return {}; }
     static State HasView(const CMainFrame& frame) { return {.enabled = frame.tabs_->Front() != nullptr}; }
@@ -87,7 +92,6 @@ std::span<const CommandRow<CMainFrame>> CMainFrame::CommandTable()
     using M = MainViewCommands;
     using F = CMainFrame;
     using T = ViewTabs;
-    constexpr bool kLater = false;
     constexpr bool kCheckable = true;
     static constexpr std::array kRows = {
         Row{{.id = Id(Command::SideBar),
@@ -252,15 +256,32 @@ std::span<const CommandRow<CMainFrame>> CMainFrame::CommandTable()
              .tip = Str::TipHelp,
              .icon = u"help-contents",
              .keys = {{{Qt::Key_F1}}},
-             .menus = ShellHelpMenu,
-             .built = kLater},
-            C::Nothing},
+             .menus = ShellHelpMenu},
+            C::Frame<&F::ShowHelpOfFront>,
+            C::Always},
+        Row{{.id = Id(Command::WhatsThis),
+             .text = Str::CommandWhatsThis,
+             .tip = Str::TipWhatsThis,
+             .menus = ShellHelpMenu},
+            C::AskWhatThisIs,
+            C::Always},
         Row{{.id = Id(Command::Keys),
              .text = Str::CommandKeys,
              .tip = Str::TipKeys,
              .keys = {{{Qt::CTRL | Qt::Key_Slash}}},
              .menus = ShellHelpMenu},
             C::Frame<&F::ShowKeyList>},
+        Row{{.id = Id(Command::Tour), .text = Str::CommandTour, .tip = Str::TipTour, .menus = ShellHelpMenu},
+            C::Frame<&F::ShowTour>,
+            C::Always},
+        Row{{.id = Id(Command::Language),
+             .text = Str::CommandLanguage,
+             .tip = Str::TipLanguage,
+             .menus = ShellHelpMenu,
+             .group = 1,
+             .asks = true},
+            C::Language,
+            C::Always},
         Row{{.id = Id(Command::About),
              .text = Str::CommandAbout,
              .tip = Str::TipAbout,

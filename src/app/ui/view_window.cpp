@@ -1,6 +1,7 @@
 #include "app/ui/view_window.h"
 
 #include "app/ui/view_tabs.h"
+#include "help/ui/help_window.h"
 #include "resources/string_table.h"
 
 #include <QCloseEvent>
@@ -23,6 +24,13 @@ std::span<const CommandRow<CViewWindow>> CViewWindow::CommandTable()
              .keys = {{{Qt::CTRL | Qt::Key_Slash}}},
              .menus = 1},
             [](CViewWindow& window) { ShowKeyHints(window, window.view_->Keys() + window.actions_->KeyHints()); }},
+        Row{{.id = 3,
+             .text = Str::CommandHelp,
+             .tip = Str::TipHelp,
+             .icon = u"help-contents",
+             .keys = {{{Qt::Key_F1}}},
+             .menus = 1},
+            [](CViewWindow& window) { ShowHelp(window, HelpTopicOf(*window.view_)); }},
         Row{{.id = 2,
              .text = Str::CommandCloseView,
              .tip = Str::TipCloseView,

@@ -4,10 +4,12 @@
 #include "csvimport/ui/fields_page.h"
 #include "csvimport/ui/separator_page.h"
 #include "csvimport/ui/source_page.h"
+#include "platform/ui/look_roles.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
+#include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QDragEnterEvent>
 #include <QDropEvent>
@@ -64,7 +66,7 @@ CImportWizard::CImportWizard(ImportDraft& draft, UserPrompt& prompt, const QStri
 
 void CImportWizard::LayOut()
 {
-    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), this);
+    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
     QFont bold = heading_->font();
     bold.setBold(true);
     heading_->setFont(bold);
@@ -82,6 +84,8 @@ void CImportWizard::LayOut()
         button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
         button->setMinimumWidth(4 * fontMetrics().height());
     }
+    cancel->setMinimumWidth( // it is the longest in some languages
+        std::max(cancel->minimumWidth(), fontMetrics().horizontalAdvance(cancel->text()) + spacing::kWide));
     next_->setDefault(true);
     for (QPushButton* button : {cancel, back_})
         button->setAutoDefault(false);

@@ -105,8 +105,7 @@ void CExpressionDesk::FillLists()
     QListWidget* functions = AddList(Str::DeskFunctions);
     for (const FunctionDef& function : Functions()) {
         const QString name = QStringView(function.name).toString();
-        add(functions, name, function.allowed > 0 ? name + u'(' : name + u"()"_s,
-            QStringView(function.help).toString());
+        add(functions, name, function.allowed > 0 ? name + u'(' : name + u"()"_s, StringText(function.help));
     }
     QListWidget* controls = AddList(Str::DeskControls);
     for (const ControlDef& control : maker_.Design().Form().controls) {

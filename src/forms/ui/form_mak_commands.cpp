@@ -2,6 +2,7 @@
 #include "forms/ui/design_surface.h"
 #include "forms/ui/form_mak_command.h"
 #include "forms/ui/form_mak_view.h"
+#include "help/ui/help_window.h"
 #include "platform/ui/view_command.h"
 #include "resources/string_table.h"
 
@@ -140,7 +141,7 @@ struct CFormMakView::Commands {
     }
     static void ZoomIn(CFormMakView& view) { view.SetZoom(view.surface_->Zoom() + 0.25); }
     static void ZoomOut(CFormMakView& view) { view.SetZoom(view.surface_->Zoom() - 0.25); }
-    static void Nothing(CFormMakView&) {} // not built yet
+    static void ShowPage(CFormMakView& view) { ShowHelp(view, HelpTopicOf(view)); }
 
     static State HasControls(const CFormMakView& view) { return {.enabled = view.maker_.Design().Count() > 0}; }
     static State HasFields(const CFormMakView& view) { return {.enabled = view.fieldList_->count() > 0}; }
@@ -228,9 +229,8 @@ std::span<const Row> CFormMakView::Commands::Table()
              .tip = Str::MakerHelpTip,
              .icon = u"help-contents",
              .menus = FileMenu,
-             .group = 3,
-             .built = false},
-            Nothing},
+             .group = 3},
+            ShowPage},
         Row{{.id = Id(Command::FormProperties),
              .text = Str::MakerFormProperties,
              .tip = Str::MakerFormPropertiesTip,

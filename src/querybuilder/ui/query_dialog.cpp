@@ -19,6 +19,7 @@
 #include "tableview/saved_queries.h"
 
 #include <QCloseEvent>
+#include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QGridLayout>
 #include <QLabel>
@@ -173,11 +174,12 @@ QWidget* CQueryDialog::MakeButtons()
     recentButton_->setMenu(recent_);
     connect(recent_, &QMenu::aboutToShow, this, &CQueryDialog::FillRecent);
     const bool saves = draft_.Request().nameUse == QueryRequest::Name::Required;
-    auto* save = new QPushButton(saves ? StringText(Str::QuerySave) : QDialogButtonBox::tr("OK"), row);
+    auto* save = new QPushButton(
+        saves ? StringText(Str::QuerySave) : QCoreApplication::translate("QPlatformTheme", "OK"), row);
     save->setObjectName(u"save"_s);
     save->setToolTip(saves ? StringText(Str::QuerySaveTip) : QString());
     save->setAutoDefault(false);
-    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), row);
+    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), row);
     cancel->setAutoDefault(false);
     for (QPushButton* button : {run, save, cancel})
         button->setMinimumWidth(3 * fontMetrics().height());

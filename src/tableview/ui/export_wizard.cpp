@@ -2,6 +2,7 @@
 
 #include "platform/ui/elided_label.h"
 #include "platform/ui/file_choice.h"
+#include "platform/ui/look_roles.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/wait_cursor.h"
 #include "platform/ui/window_place.h"
@@ -11,6 +12,7 @@
 
 #include <QCheckBox>
 #include <QComboBox>
+#include <QCoreApplication>
 #include <QDialogButtonBox>
 #include <QDir>
 #include <QGridLayout>
@@ -119,7 +121,7 @@ CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, Wri
 
 void CExportWizard::LayOut()
 {
-    auto* cancel = new QPushButton(QDialogButtonBox::tr("Cancel"), this);
+    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
     QFont bold = heading_->font();
     bold.setBold(true);
     heading_->setFont(bold);
@@ -137,6 +139,8 @@ void CExportWizard::LayOut()
         button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
         button->setMinimumWidth(4 * fontMetrics().height());
     }
+    cancel->setMinimumWidth( // it is the longest in some languages
+        std::max(cancel->minimumWidth(), fontMetrics().horizontalAdvance(cancel->text()) + spacing::kWide));
     next_->setDefault(true);
     for (QPushButton* button : {cancel, back_})
         button->setAutoDefault(false);

@@ -86,14 +86,15 @@ void FilterTerm::SetType(FieldType type, FilterKind kind)
     type_ = type;
     operators_->clear();
     for (const std::u16string_view name : FilterOperators(type, kind))
-        operators_->addItem(QStringView(name).toString());
+        operators_->addItem(FilterOperatorText(name), QStringView(name).toString());
     value_->SetTakesDates(type == FieldType::Date);
     value_->setEnabled(type != FieldType::YesNo);
 }
 
 void FilterTerm::SetOperator(const QString& operatorText)
 {
-    operators_->setCurrentText(operatorText);
+    if (const int row = operators_->findData(operatorText); row >= 0)
+        operators_->setCurrentIndex(row);
 }
 
 void FilterTerm::SetValue(const QString& displayText)
@@ -104,7 +105,7 @@ void FilterTerm::SetValue(const QString& displayText)
 
 QString FilterTerm::Operator() const
 {
-    return operators_->currentText();
+    return operators_->currentData().toString();
 }
 
 QString FilterTerm::Value() const

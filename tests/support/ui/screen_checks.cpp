@@ -65,6 +65,10 @@ void ExpectReachable(QWidget& part, const std::string& where)
     if (!operated || !part.isEnabled() || (line && line->isReadOnly()))
         return;
     EXPECT_FALSE(NameOf(part).isEmpty()) << where << " has no name";
+    const auto* drawn = qobject_cast<const QAbstractButton*>(&part);
+    if (drawn && drawn->text().isEmpty() && !drawn->icon().isNull()) {
+        EXPECT_FALSE(part.toolTip().isEmpty()) << where << " is an icon that does not say what it does";
+    }
     // The button of a date or of a long text has its keys in the box; tool bars and the corner of a menu bar offer
     // what menus do, too.
     const QWidget* parent = part.parentWidget();
