@@ -846,7 +846,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
         <translation>Te&amp;xtfarbe der Schaltflächen</translation>
     </message>
     <message id="60575">
-        <source>&amp;Import from CSV ...</source>
+        <source>Import &amp;from CSV ...</source>
         <extracomment>CommandImportCsv</extracomment>
         <translation>Aus CSV &amp;importieren ...</translation>
     </message>
