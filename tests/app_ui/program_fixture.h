@@ -49,6 +49,7 @@ protected:
     {
         program_->frame = std::make_unique<CMainFrame>(program_->session, program_->state, program_->commands,
                                                        program_->settings, program_->profile);
+        Frame().setWindowState(Qt::WindowNoState); // the test's screen is small: it would fill that
         Frame().move(0, 0);
         Frame().resize(size);
         Frame().show();

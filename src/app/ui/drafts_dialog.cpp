@@ -123,7 +123,8 @@ CDraftsDialog::CDraftsDialog(std::vector<LeftDraft> drafts, Actions actions, QWi
     });
     connect(later_, &QPushButton::clicked, this, &QDialog::reject);
     ShowList();
-    resize(fontMetrics().averageCharWidth() * kFirstColumns, fontMetrics().lineSpacing() * kFirstLines);
+    resize(QSize(fontMetrics().averageCharWidth() * kFirstColumns, fontMetrics().lineSpacing() * kFirstLines)
+               .expandedTo(minimumSizeHint()));
     FillSmallWindow(*this, *parent->window());
     (putBack_->isEnabled() ? putBack_ : copy_)->setFocus();
 }
