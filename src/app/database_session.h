@@ -75,6 +75,7 @@ public:
 
     bool ListTables(QStringList& tables) { return catalog_.ListTables(location_, tables); }
     Catalog& GetCatalog() { return catalog_; }
+    const ProgramFolder& Folder() const { return folder_; }
     DbConnection& Connection() { return connection_; }
     UserPrompt& Prompt() { return prompt_; }
     const ProgramFolder& Folder() const { return folder_; }

@@ -2,6 +2,7 @@
 
 #include "app/shell_commands.h"
 #include "forms/default_form.h"
+#include "forms/form_file.h"
 #include "resources/string_table.h"
 #include "tableview/saved_queries.h"
 
@@ -61,15 +62,20 @@ void MainViewCommands::RestoreLastRun(const QString& database)
         OpenDatabase(path);
 }
 
-void MainViewCommands::KeepForNextRun()
+bool MainViewCommands::KeepForNextRun()
 {
+    bool kept = true;
     for (const TabMemory& memory : kTabMemories) {
-        settings_.SetText(memory.selection, state_.Remembered(memory.tab));
+        kept = settings_.SetText(memory.selection, state_.Remembered(memory.tab)) && kept;
         if (memory.tab == state_.Tab())
-            settings_.SetText(Setting::ActiveView, memory.name.toString());
+            kept = settings_.SetText(Setting::ActiveView, memory.name.toString()) && kept;
     }
-    settings_.SetInt(Setting::OpenByDoubleClick, state_.OpensByDoubleTap() ? 1 : 0);
-    settings_.SetText(Setting::ActiveDb, session_.Location().Text());
+    kept = settings_.SetInt(Setting::OpenByDoubleClick, state_.OpensByDoubleTap() ? 1 : 0) && kept;
+    kept = settings_.SetText(Setting::ActiveDb, session_.Location().Text()) && kept;
+    // As they are in force: a damaged line is written as the default that stood in for it.
+    for (const Setting look : {Setting::MainViewBkColor, Setting::MainViewTextColor, Setting::MainViewFont})
+        kept = settings_.SetText(look, settings_.Text(look)) && kept;
+    return kept;
 }
 
 bool MainViewCommands::ReadContents(UserPrompt& prompt, DatabaseContents& contents)
@@ -163,6 +169,49 @@ bool MainViewCommands::DeleteDatabase(const QString& path)
     if (!dropped && closes)
         host_->OpenAgain(before);
     return dropped;
+}
+
+bool MainViewCommands::ImportFormFile(const QString& path)
+{
+    UserPrompt& prompt = session_.Prompt();
+    QString error;
+    std::optional<FormDef> form = ImportForm(path, error);
+    if (!form) {
+        prompt.ShowError(error);
+        return false;
+    }
+    if (session_.Store().Path().isEmpty()) {
+        prompt.Show({Str::MakerStoreMissing, {}});
+        return false;
+    }
+    // The question is asked while the store is not locked; then all is looked at again.
+    const QString name = form->name.Text();
+    bool mayReplace = false;
+    bool exists = false;
+    const auto put = [&](FormStore& store) {
+        FormDef* there = store.FindForm(name);
+        exists = there && !mayReplace;
+        if (exists)
+            return false;
+        if (there)
+            there->CopyFrom(*form);
+        else
+            store.AddForm(*form);
+        return true;
+    };
+    while (!session_.Store().Apply(put)) {
+        if (!exists) {
+            prompt.ShowError(session_.Store().LastError());
+            return false;
+        }
+        if (!prompt.AskYesNo({Str::FormExists, {name}}))
+            return false;
+        mayReplace = true;
+    }
+    Refill();
+    state_.SetTab(MainTab::Form);
+    state_.Select({EntryKind::Form, name, form->tableName.Text(), false});
+    return true;
 }
 
 bool MainViewCommands::OpenSample()

@@ -55,7 +55,7 @@ public:
     // What the last run left behind: its selections, its tab, its database. A database that no longer opens is
     // reported, and none is open then. `database` is opened instead when it is not empty.
     void RestoreLastRun(const QString& database);
-    void KeepForNextRun();
+    bool KeepForNextRun(); // false: the profile cannot be written
 
     // The views that are open, for what changes tables under them; must outlive this. Null: there are none.
     void SetOpenViews(DesignHost* views) { views_ = views ? views : &noViews_; }
@@ -73,6 +73,8 @@ public:
     // Asks twice; No leaves everything as it is, and nothing is asked about a file that is no database.
     bool DeleteDatabase(const QString& path);
 
+    // Brings the form of a form file into the open database, and selects it; asks before it replaces one.
+    bool ImportFormFile(const QString& path);
     bool OpenSample(); // makes it first where it is not there
 
     // These act on the entry selected on the tab in front, and do nothing when there is none.

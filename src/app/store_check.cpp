@@ -66,7 +66,7 @@ QStringList FieldsOf(const ControlDef& control)
 class FormCheck {
 public:
     FormCheck(DbConnection& connection, const DatabaseLocation& database, const FormStore& store,
-              const QStringList& tables, QStringList& findings)
+              const QStringList& tables, std::vector<CheckFinding>& findings)
         : connection_(connection)
         , database_(database)
         , store_(store)
@@ -81,7 +81,7 @@ public:
         const QString table = form.tableName.Text();
         CheckCalls(form);
         if (!table.isEmpty() && !IsKnown(tables_, table)) {
-            findings_ += StringText(Str::CheckFormTable, {name, table});
+            Note(StringText(Str::CheckFormTable, {name, table}));
             return;
         }
         const QString query = form.defaultQueryOnStartup != 0 && form.defaultQuery.IsSet()
@@ -94,21 +94,23 @@ public:
         DbRecordset rows(connection_);
         if (!rows.OpenSource(CompleteQuery(query, table, noText), database_, CursorType::ForwardOnly,
                              LockType::ReadOnly)) {
-            findings_ += StringText(Str::CheckFormQuery, {name, FaultOf(rows)});
+            Note(StringText(Str::CheckFormQuery, {name, FaultOf(rows)}));
             return;
         }
         CheckFields(form, rows);
     }
 
 private:
+    void Note(const QString& text) { findings_.push_back({text, Str::RemedyForm}); }
+
     void CheckCalls(const FormDef& form)
     {
         for (const ControlDef& control : form.controls) {
             const bool calls =
                 control.type == ControlType::Button && control.buttonFunction == ButtonFunction::CallForm;
             if (calls && !store_.FindForm(control.source.Text()))
-                findings_ +=
-                    StringText(Str::CheckFormCall, {form.name.Text(), control.name.Text(), control.source.Text()});
+                Note(StringText(Str::CheckFormCall,
+                                {form.name.Text(), control.name.Text(), control.source.Text()}));
         }
     }
 
@@ -119,7 +121,7 @@ private:
         for (const ControlDef& control : form.controls) {
             for (const QString& field : FieldsOf(control)) {
                 if (context.FindColumn(field) < 0)
-                    findings_ += StringText(Str::CheckFormField, {form.name.Text(), control.name.Text(), field});
+                    Note(StringText(Str::CheckFormField, {form.name.Text(), control.name.Text(), field}));
             }
         }
     }
@@ -128,28 +130,29 @@ private:
     const DatabaseLocation& database_;
     const FormStore& store_;
     const QStringList& tables_;
-    QStringList& findings_;
+    std::vector<CheckFinding>& findings_;
 };
 
 } // namespace
 
-QStringList CheckStoreFile(const QString& path, FormStore& store)
+std::vector<CheckFinding> CheckStoreFile(const QString& path, FormStore& store)
 {
     if (!QFileInfo::exists(path))
         return {};
     const std::optional<QByteArray> bytes = ReadWholeFile(path);
     if (!bytes)
-        return {StringText(Str::CheckStoreUnread, {path, qt_error_string()})};
+        return {{StringText(Str::CheckStoreUnread, {path, qt_error_string()}), Str::RemedyStore}};
     if (bytes->isEmpty())
-        return {StringText(Str::CheckStoreEmpty, {path})};
+        return {{StringText(Str::CheckStoreEmpty, {path}), Str::RemedyStore}};
     if (!store.LoadFrom(*bytes))
-        return {StringText(Str::CheckStoreShort, {path})};
+        return {{StringText(Str::CheckStoreShort, {path}), Str::RemedyStore}};
     return {};
 }
 
-QStringList CheckReferences(DbConnection& connection, const DatabaseLocation& database, const FormStore& store)
+std::vector<CheckFinding> CheckReferences(DbConnection& connection, const DatabaseLocation& database,
+                                          const FormStore& store)
 {
-    QStringList findings;
+    std::vector<CheckFinding> findings;
     DbRecordset list(connection);
     QStringList tables;
     bool more =
@@ -157,7 +160,7 @@ QStringList CheckReferences(DbConnection& connection, const DatabaseLocation& da
     for (; more && !list.IsEof(); more = list.MoveNext())
         tables += list.ValueText(0);
     if (!more)
-        return {FaultOf(list)};
+        return {{FaultOf(list), Str::RemedyTables}};
     FormCheck check(connection, database, store, tables, findings);
     for (const FormDef& form : store.Forms())
         check.Run(form);
@@ -166,7 +169,8 @@ QStringList CheckReferences(DbConnection& connection, const DatabaseLocation& da
         const QString statement = query.text.Text();
         if (OnlyReads(statement) &&
             !rows.OpenSource(statement, database, CursorType::ForwardOnly, LockType::ReadOnly))
-            findings += StringText(Str::CheckQuery, {query.name.Text(), FaultOf(rows)});
+            findings.push_back(
+                {StringText(Str::CheckQuery, {query.name.Text(), FaultOf(rows)}), Str::RemedyQuery});
     }
     return findings;
 }

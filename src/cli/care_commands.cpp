@@ -8,6 +8,7 @@
 
 #include <QFileInfo>
 
+#include <algorithm>
 #include <utility>
 
 namespace mirel::cli {
@@ -26,21 +27,25 @@ ExitStatus StatusOf(Run& run, Hr hr, const QString& context)
 ExitStatus RunCheck(Run& run)
 {
     const DatabaseLocation database(run.PathArgument(0));
-    QStringList findings;
+    QStringList damage;
     QString context;
-    const Hr hr = run.Connection().Provider()->Care().Check(database, findings, context);
+    const Hr hr = run.Connection().Provider()->Care().Check(
+        database, [] { return !IsStopWanted(); }, damage, context);
     if (Failed(hr))
         return StatusOf(run, hr, context);
     QString stamp;
     if (!Catalog(run.Connection(), run.Prompt()).FindDatabaseStamp(database, stamp))
         return ExitStatus::Failed;
     FormStore store;
+    std::vector<CheckFinding> findings;
     if (!stamp.isEmpty())
-        findings += CheckStoreFile(SideFilePath(run.Folder().FormsFolder(), stamp), store);
-    findings += CheckReferences(run.Connection(), database, store);
-    for (const QString& finding : std::as_const(findings))
-        run.Out().WriteLine(finding);
-    return findings.isEmpty() ? ExitStatus::Done : ExitStatus::Failed;
+        findings = CheckStoreFile(SideFilePath(run.Folder().FormsFolder(), stamp), store);
+    for (const QString& line : std::as_const(damage))
+        run.Out().WriteLine(line);
+    std::ranges::copy(CheckReferences(run.Connection(), database, store), std::back_inserter(findings));
+    for (const CheckFinding& finding : findings)
+        run.Out().WriteLine(finding.text);
+    return damage.isEmpty() && findings.empty() ? ExitStatus::Done : ExitStatus::Failed;
 }
 
 ExitStatus RunBackup(Run& run)
@@ -69,7 +74,8 @@ ExitStatus RunBackup(Run& run)
 ExitStatus RunCompact(Run& run)
 {
     QString context;
-    const Hr hr = run.Connection().Provider()->Care().Compact(DatabaseLocation(run.PathArgument(0)), context);
+    const Hr hr = run.Connection().Provider()->Care().Compact(
+        DatabaseLocation(run.PathArgument(0)), [] { return !IsStopWanted(); }, context);
     return StatusOf(run, hr, context);
 }
 

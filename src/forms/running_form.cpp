@@ -123,6 +123,7 @@ void RunningForm::RefreshItems(int control)
 
 void RunningForm::ShowRecord(FormControls::Edits edits)
 {
+    fingerprint_.clear();
     controls_.ShowRecord(source_, edits);
 }
 
@@ -241,6 +242,46 @@ RunningForm::Outcome RunningForm::TapListHeader(int index, int column)
     if (outcome == Outcome::Done)
         controls_.MarkSorted(index, column, descending);
     return outcome;
+}
+
+// --- drafts -----------------------------------------------------------------------------------------------------
+
+std::optional<RecordDraft> RunningForm::Draft()
+{
+    if (!IsDirty())
+        return {};
+    const bool hasRecord = source_.Index() >= 0;
+    if (hasRecord && fingerprint_.isEmpty())
+        fingerprint_ = source_.Result().Fingerprint();
+    RecordDraft draft{.statement = source_.Result().BaseStatement(),
+                      .record = hasRecord ? source_.Records().Id() : RecordId(),
+                      .fingerprint = hasRecord ? fingerprint_ : QByteArray(),
+                      .texts = {}};
+    for (int i = 0; i < int(Controls().size()); ++i) {
+        if (controls_[i].edited)
+            draft.texts.push_back({i, controls_[i].name, ShownText(i), controls_.Is(i, IsTicked)});
+    }
+    return draft;
+}
+
+bool RunningForm::PutBack(const RecordDraft& draft)
+{
+    const bool fits = std::ranges::all_of(draft.texts, [this](const TypedText& typed) {
+        return controls_.Is(typed.place, typed.isTick ? IsTicked : ShowsText) &&
+               controls_[typed.place].name == typed.name;
+    });
+    if (IsDirty() || !fits || (!draft.record.IsNull() && !HasResult()))
+        return false;
+    OpenResult& result = source_.Result();
+    if (draft.record.IsNull() ? source_.Index() >= 0 : !result.MoveToRecord(draft.record))
+        return false;
+    ShowRecord();
+    controls_.TouchLists();
+    if (!draft.record.IsNull() && result.Fingerprint() != draft.fingerprint)
+        return false;
+    for (const TypedText& typed : draft.texts)
+        typed.isTick ? SetTicked(typed.place, typed.text == u"1") : SetText(typed.place, typed.text);
+    return IsDirty();
 }
 
 // --- moving, adding, deleting -----------------------------------------------------------------------------------

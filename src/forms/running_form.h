@@ -8,6 +8,7 @@
 #include "forms/form_store.h"
 #include "forms/form_view_settings.h"
 #include "platform/user_prompt.h"
+#include "result/record_draft.h"
 
 #include <QDateTime>
 #include <QHash>
@@ -105,6 +106,13 @@ public:
     void RefreshItems(int control);
     // The button that saves; -1: the form has none.
     int FirstUpdateButton() const;
+
+    // What was typed into the current record, or into none, and is not saved; to be kept for the case that the
+    // program is killed. None: nothing was.
+    std::optional<RecordDraft> Draft();
+    // Types it into the same controls on the same record again. False, and nothing changed but the current record,
+    // where that is gone or holds other values by now, the form has other controls, or something else is typed.
+    bool PutBack(const RecordDraft& draft);
 
     // --- moving, adding, deleting -------------------------------------------------------------------------
 
@@ -218,6 +226,7 @@ private:
     QHash<QString, QStringList> itemsOfQuery_; // while many drop-down boxes are filled
     bool dataChanged_ = false;
     QString whyFailed_;
+    QByteArray fingerprint_; // of the record that is typed into, once it was asked for
 };
 
 } // namespace mirel

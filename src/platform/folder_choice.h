@@ -17,8 +17,8 @@ public:
         friend bool operator==(const Entry&, const Entry&) = default;
     };
 
-    // Lists the files whose names end in one of `endings` (".cdb"), in any case. If the folder does not exist, the
-    // nearest existing one above it is used.
+    // Lists the files whose names end in one of `endings` (".cdb"; an empty one: all files), in any case. If the
+    // folder does not exist, the nearest existing one above it is used.
     FolderChoice(const QString& folder, QStringList endings);
 
     QString Folder() const { return folder_; }

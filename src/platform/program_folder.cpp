@@ -27,6 +27,11 @@ QString ProgramFolder::FavoritesFile() const
     return path + u"/Mirel.fvs"_s;
 }
 
+QString ProgramFolder::DraftsFolder() const
+{
+    return path + u"/Drafts"_s;
+}
+
 QString ProgramFolder::ProfileFile() const
 {
     return path + u"/Mirel.ini"_s;

@@ -17,6 +17,7 @@ struct ProgramFolder {
 
     QString FormsFolder() const;   // the side files of the databases
     QString FavoritesFile() const; // Mirel.fvs
+    QString DraftsFolder() const;  // what is typed and not saved, a file for each running program
     QString ProfileFile() const;   // Mirel.ini
     Profile OpenProfile() const;
 };

@@ -25,10 +25,15 @@ public:
                       const std::function<bool(int)>& progress, QString& context) = 0;
     // What a copy carries along; empty for any other database.
     virtual QByteArray Belongings(const DatabaseLocation& database) = 0;
+    // Both ask `goesOn` every few milliseconds meanwhile, from within this call; false stops them, which is
+    // kStopped, and nothing has changed then.
+
     // AccessDenied while another program reads or writes. Results that are open close.
-    virtual Hr Compact(const DatabaseLocation& database, QString& context) = 0;
+    virtual Hr Compact(const DatabaseLocation& database, const std::function<bool()>& goesOn,
+                       QString& context) = 0;
     // What the engine finds wrong with its file, a line each; none: it is sound. Writes nothing.
-    virtual Hr Check(const DatabaseLocation& database, QStringList& findings, QString& context) = 0;
+    virtual Hr Check(const DatabaseLocation& database, const std::function<bool()>& goesOn, QStringList& findings,
+                     QString& context) = 0;
 };
 
 } // namespace mirel

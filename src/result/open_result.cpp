@@ -8,6 +8,7 @@
 #include "provider/conversion.h"
 #include "resources/string_table.h"
 #include "result/cell_text.h"
+#include "result/record_draft.h"
 
 #include <algorithm>
 
@@ -346,6 +347,11 @@ SeenRecord OpenResult::Seen()
     for (int field = 0; field < FieldCount(); ++field)
         seen.values.push_back(records_.FieldValue(field));
     return seen;
+}
+
+QByteArray OpenResult::Fingerprint()
+{
+    return IsOpen() && Position() >= 0 && !IsGone() ? FingerprintOf(Fields(), Seen().values) : QByteArray();
 }
 
 std::vector<RecordId> OpenResult::IdsFrom(qint64 first, qint64 count)

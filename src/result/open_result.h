@@ -120,6 +120,7 @@ public:
 
     // The current record as it is shown now.
     SeenRecord Seen();
+    QByteArray Fingerprint(); // of that; empty without a record
     // The records from a position on, as positions were at the last look; fewer at the end. SeenFrom reads their
     // values as well, when they are few enough to be undone.
     std::vector<RecordId> IdsFrom(qint64 first, qint64 count);

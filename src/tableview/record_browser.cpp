@@ -264,6 +264,7 @@ void RecordBrowser::RevertEdit()
 {
     EndResult();
     edit_.Revert();
+    fingerprint_.clear();
     writeFailed_ = false;
     TakeUpChanges(); // what others did to this very record was kept from the editor
 }

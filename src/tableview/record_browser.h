@@ -3,6 +3,7 @@
 #include "data/filter_condition.h"
 #include "platform/user_prompt.h"
 #include "result/open_result.h"
+#include "result/record_draft.h"
 #include "tableview/cell_block.h"
 #include "tableview/cell_edit.h"
 #include "tableview/presentation.h"
@@ -230,6 +231,12 @@ public:
     void ShowWriteError();
     const QString& WriteError() const { return writeError_; } // of the last write that failed
 
+    // What is pending, to be kept for the case that the program is killed before it is written; none: nothing is.
+    std::optional<RecordDraft> Draft();
+    // Makes it pending again, in the cell that it was typed into. False, and nothing changed, where that cell's
+    // record is gone or holds other values by now, or while something else is pending.
+    bool PutBack(const RecordDraft& draft);
+
     // --- records ------------------------------------------------------------------------------------------
 
     // Whether the selected record is still there, once what others did has been taken up; else the user is told,
@@ -325,7 +332,8 @@ private:
     bool extending_ = false;
 
     CellEdit edit_;
-    QString shownLabel_; // of a command's result; empty: the editor shows the cell
+    QByteArray fingerprint_; // of the record that the edit was begun on, once it was asked for
+    QString shownLabel_;     // of a command's result; empty: the editor shows the cell
     QString shownResult_;
     bool writeFailed_ = false;
     QString writeError_;

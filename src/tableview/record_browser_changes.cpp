@@ -33,12 +33,56 @@ bool RecordBrowser::WriteEdit()
         break;
     }
     writeFailed_ = false;
+    fingerprint_.clear();
     if (SelectedRecord() >= 0 && list_.RowOf(SelectedRecord()) != SelectedRow())
         ShowRecordAgain(SelectedRecord()); // others have moved it meanwhile
     edit_.Load(Recordset().FieldValue(selectedField_), TypeOfField(selectedField_),
                Recordset().FieldSize(selectedField_), settings_.leadingNumber);
     RefreshCell();
     return true;
+}
+
+// --- drafts -------------------------------------------------------------------------------------------------
+
+std::optional<RecordDraft> RecordBrowser::Draft()
+{
+    if (!edit_.IsPending())
+        return {};
+    if (fingerprint_.isEmpty())
+        fingerprint_ = result_.Fingerprint();
+    const bool isTick = edit_.Kind() == EditorKind::Check;
+    const QString text = isTick ? QString::number(edit_.IsChecked() ? 1 : 0) : edit_.Text();
+    return RecordDraft{.statement = BaseStatement(),
+                       .record = Recordset().Id(),
+                       .fingerprint = fingerprint_,
+                       .texts = {{selectedField_, FieldName(selectedField_), text, isTick}}};
+}
+
+bool RecordBrowser::PutBack(const RecordDraft& draft)
+{
+    if (!IsOpen() || HasPendingEdit() || draft.texts.size() != 1 || draft.record.IsNull())
+        return false;
+    const TypedText& typed = draft.texts.front();
+    const bool isTick = typed.place >= 0 && TypeOfField(typed.place) == FieldType::YesNo;
+    if (!IsWritable(typed.place) || FieldName(typed.place) != typed.name || isTick != typed.isTick)
+        return false;
+    TakeUpChanges();
+    const qint64 before = SelectedRecord();
+    const bool isThere = result_.MoveToRecord(draft.record) && result_.Fingerprint() == draft.fingerprint;
+    if (isThere) {
+        selectedField_ = typed.place;
+        visible_[size_t(typed.place)] = true;
+        RebuildColumns();
+    } else if (before >= 0) {
+        (void)result_.MoveTo(before);
+    }
+    KeepSelectionInPage();
+    ShowRecordAgain(SelectedRecord());
+    LoadEditor();
+    if (!isThere || Recordset().Id() != draft.record)
+        return false;
+    typed.isTick ? EditChecked(typed.text == u"1") : EditText(typed.text);
+    return HasPendingEdit();
 }
 
 // --- records ------------------------------------------------------------------------------------------------

@@ -236,6 +236,7 @@ void RecordBrowser::LoadEditor()
     CollapseBlock();
     writeFailed_ = false;
     shownLabel_.clear();
+    fingerprint_.clear();
     if (!IsOpen() || SelectedRecord() < 0 || selectedField_ < 0 || result_.IsGone()) {
         edit_.Unload();
         return;

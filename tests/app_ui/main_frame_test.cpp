@@ -68,6 +68,7 @@ protected:
         QDropEvent drop(QPointF(50, 50), Qt::CopyAction | Qt::MoveAction, &data, Qt::LeftButton, {});
         QApplication::sendEvent(&Frame(), &drop);
         EXPECT_EQ(drop.dropAction(), Qt::CopyAction);
+        QCoreApplication::processEvents(); // it is opened once the drop is over
         return true;
     }
 };

@@ -410,7 +410,7 @@ TEST_F(WorkspaceTest, QuestionsComeBeforeAnyViewIsClosed)
 
 TEST_F(WorkspaceTest, OneViewAloneEndsTheProgramWhenItCloses)
 {
-    Frame().BeAlone();
+    Frame().BeAlone(kBirds);
     CTableView* birds = Open(kBirds);
     ASSERT_TRUE(birds);
     EXPECT_FALSE(Frame().findChild<SideBar*>()->isVisible());

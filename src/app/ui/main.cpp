@@ -1,3 +1,4 @@
+#include "app/instance.h"
 #include "app/main_view_commands.h"
 #include "app/ui/look.h"
 #include "app/ui/main_frame.h"
@@ -8,6 +9,7 @@
 #include "help/ui/help_desk.h"
 
 #include <QApplication>
+#include <QDir>
 #include <QEventLoop>
 #include <QFileInfo>
 #include <QTimer>
@@ -71,6 +73,17 @@ bool Open(Core& core, const WindowOptions& options)
     return options.database.isEmpty() || core.session.IsOpen();
 }
 
+std::optional<ViewKey> ViewToShow(const WindowOptions& options)
+{
+    for (const auto& [kind, name] :
+         {std::pair(EntryKind::Table, options.table), std::pair(EntryKind::Form, options.form),
+          std::pair(EntryKind::Query, options.query)}) {
+        if (!name.isEmpty())
+            return ViewKey{kind, name};
+    }
+    return std::nullopt;
+}
+
 QString KindName(EntryKind kind)
 {
     switch (kind) {
@@ -84,21 +97,16 @@ QString KindName(EntryKind kind)
     return u"query"_s;
 }
 
-// The view that was asked for, alone in the window. False when there is no such view; why was told then.
-bool ShowAlone(CMainFrame& frame, const WindowOptions& options)
+// The view alone in the window. False when there is no such view; why was told then.
+bool ShowAlone(CMainFrame& frame, const std::optional<ViewKey>& view)
 {
-    for (const auto& [kind, name] :
-         {std::pair(EntryKind::Table, options.table), std::pair(EntryKind::Form, options.form),
-          std::pair(EntryKind::Query, options.query)}) {
-        if (name.isEmpty())
-            continue;
-        frame.BeAlone();
-        if (frame.OpenView({kind, name}))
-            return true;
-        Say(stderr, u"mirel: it has no %1 \"%2\"\n"_s.arg(KindName(kind), name));
-        return false;
-    }
-    return true;
+    if (!view)
+        return true;
+    frame.BeAlone(*view);
+    if (frame.OpenView(*view))
+        return true;
+    Say(stderr, u"mirel: it has no %1 \"%2\"\n"_s.arg(KindName(view->kind), view->name));
+    return false;
 }
 
 // What is counted and read in slices.
@@ -118,7 +126,7 @@ int TakePicture(const WindowOptions& options)
     if (!Open(core, options))
         return kFailed;
     CMainFrame frame(core.session, core.state, core.commands, core.settings, core.profile);
-    if (!ShowAlone(frame, options))
+    if (!ShowAlone(frame, ViewToShow(options)))
         return kFailed;
     frame.setWindowState(Qt::WindowNoState);
     frame.resize(options.size);
@@ -141,7 +149,40 @@ bool IsFirstStart(const WindowOptions& options, Settings& settings)
            settings.SetInt(Setting::MainViewTourSeen, 1);
 }
 
-int ShowWindow(const WindowOptions& options)
+// Of an ordinary start: the one that it names, or the last run's.
+QString DatabaseToOpen(const WindowOptions& options, const ProgramFolder& folder)
+{
+    if (options.sample)
+        return SampleDatabase(folder, kSampleSource).Path();
+    if (!options.database.isEmpty())
+        return QDir::cleanPath(QFileInfo(options.database).absoluteFilePath());
+    return Settings(folder.OpenProfile()).Text(Setting::ActiveDb);
+}
+
+// True when a window that has the database open shows what is wanted. Otherwise this one has the name under which
+// the next start finds it; a window that is stuck keeps its name, and this one goes without.
+bool IsShownByOther(const WindowOptions& options, Instance& instance)
+{
+    constexpr int kTimeoutMs = 1500; // a window that has only begun to open answers within that
+    const ProgramFolder folder = ProgramFolder::Find(options.home);
+    const QString database = DatabaseToOpen(options, folder);
+    if (database.isEmpty())
+        return false;
+    using Answer = Instance::Answer;
+    const InstanceRequest request{ViewToShow(options), qgetenv("XDG_ACTIVATION_TOKEN")};
+    const InstanceRequest forward{{}, request.activation};
+    const QByteArray whole = InstanceName(folder.path, database, {});
+    const QByteArray own = InstanceName(folder.path, database, request.view);
+    if (request.view && Instance::HandOver(own, forward, kTimeoutMs) == Answer::Taken)
+        return true;
+    const Answer answer = Instance::HandOver(whole, request, kTimeoutMs);
+    if (answer != Answer::Nobody)
+        return answer == Answer::Taken;
+    // Another start may have been a moment faster.
+    return !instance.Take(own) && Instance::HandOver(own, forward, kTimeoutMs) == Answer::Taken;
+}
+
+int ShowWindow(const WindowOptions& options, Instance& instance)
 {
     MessageBoxPrompt prompt;
     Core core(options.home, prompt);
@@ -150,14 +191,15 @@ int ShowWindow(const WindowOptions& options)
     frame.show();
     (void)Open(core, options); // after show: what it has to say stands over the window
     frame.ShowState();
-    if (!ShowAlone(frame, options))
+    if (!ShowAlone(frame, ViewToShow(options)))
         return kFailed;
     if (!frame.IsAlone())
         frame.RestoreViews();
     if (isFirst)
         frame.ShowTour();
+    frame.AnswerOtherStarts(instance);
     const int result = QApplication::exec();
-    core.commands.KeepForNextRun();
+    (void)core.commands.KeepForNextRun(); // the window has told already that it cannot be kept
     return result;
 }
 
@@ -203,6 +245,9 @@ int main(int argc, char** argv)
         return *result;
 
     const bool picture = !options->picture.isEmpty();
+    Instance instance;
+    if (!picture && IsShownByOther(*options, instance))
+        return kDone;
     if (picture)
         qputenv("QT_QPA_PLATFORM", "offscreen");
     QApplication application(argc, argv);
@@ -212,5 +257,5 @@ int main(int argc, char** argv)
     // Without a display name of its own: that would be put behind every window's title.
     if (!UsePalette(PaletteToUse(*options)))
         QApplication::setStyle(new TouchTargetStyle({}));
-    return picture ? TakePicture(*options) : ShowWindow(*options);
+    return picture ? TakePicture(*options) : ShowWindow(*options, instance);
 }

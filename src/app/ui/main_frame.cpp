@@ -84,6 +84,7 @@ CMainFrame::CMainFrame(DatabaseSession& session, MainViewState& state, MainViewC
     , openViews_(
           std::make_unique<OpenViews>(session, OpenViews::Lists{[this] { return ViewsOf<CTableView>(); },
                                                                 [this] { return ViewsOf<CFormEngView>(); }}))
+    , drafts_(session.Folder().DraftsFolder())
 {
     MakeParts();
     MakeMenus();
@@ -198,10 +199,17 @@ void CMainFrame::Connect()
     });
     connect(recentMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillRecentMenu);
     connect(windowMenu_, &QMenu::aboutToShow, this, &CMainFrame::FillWindowMenu);
-    connect(&watchTimer_, &QTimer::timeout, this, &CMainFrame::LookAtFile);
+    connect(&watchTimer_, &QTimer::timeout, this, [this] {
+        LookAtFile();
+        if (instance_ && instance_->Name().isEmpty())
+            FollowInstance(); // the window that had the name may be gone
+        TellWhereNothingIsKept();
+    });
     tellTimer_.setSingleShot(true);
     connect(&tellTimer_, &QTimer::timeout, this, [this] { session_.TellRecordsChanged(); });
     watchTimer_.start(kLookAtFileMs);
+    draftTimer_.setSingleShot(true);
+    connect(&draftTimer_, &QTimer::timeout, this, &CMainFrame::KeepDrafts);
 }
 
 // --- showing ------------------------------------------------------------------------------------------------
@@ -224,6 +232,8 @@ void CMainFrame::ShowState()
     watchedPath_ = state_.DatabasePath();
     file_ = FileState::Of(watchedPath_);
     notice_->hide();
+    FollowInstance();
+    QMetaObject::invokeMethod(this, &CMainFrame::OfferDrafts, Qt::QueuedConnection); // once its views are there
 }
 
 void CMainFrame::ShowTitle()
@@ -453,12 +463,17 @@ void CMainFrame::ShowKeyList()
 
 QString CMainFrame::ChooseDatabase(Str title, Str accept, FileUse use)
 {
-    return ChooseFile(*this, {.title = title,
-                              .accept = accept,
-                              .use = use,
-                              .kind = FileKind::Database(),
-                              .near = state_.DatabasePath(),
-                              .name = {}});
+    FileRequest request{.title = title,
+                        .accept = accept,
+                        .use = use,
+                        .kind = FileKind::Database(),
+                        .near = state_.DatabasePath(),
+                        .name = {}};
+    if (use == FileUse::Create) { // a name to begin with: without a keyboard it is the only one
+        request.kind.others.clear();
+        request.name = StringText(Str::MenuDatabase).remove(u'&') + request.kind.endings.first();
+    }
+    return ChooseFile(*this, request);
 }
 
 void CMainFrame::ChooseAndOpenDatabase()
@@ -502,6 +517,9 @@ void CMainFrame::closeEvent(QCloseEvent* event)
         return;
     }
     CloseViews();
+    KeepDrafts();
+    if (instance_)
+        instance_->Release(); // from here on another start is a window of its own
     if (sidePane_->isVisible())
         profile_.WriteInt(kWindowSection, kSideBarKey, sidePane_->width());
     KeepPlace(*this, profile_, kFramePlace);

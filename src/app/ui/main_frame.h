@@ -1,6 +1,8 @@
 #pragma once
 
+#include "app/drafts.h"
 #include "app/file_state.h"
+#include "app/instance.h"
 #include "app/main_view_commands.h"
 #include "app/shell_commands.h"
 #include "forms/design/form_maker.h"
@@ -74,8 +76,14 @@ public:
     // the front; what is gone is left out.
     void RestoreViews();
     // From here on the window is that of the views opened in it: it shows no lists, and closes with the last view.
-    void BeAlone();
-    bool IsAlone() const { return alone_; }
+    void BeAlone(const ViewKey& view);
+    bool IsAlone() const { return aloneWith_.has_value(); }
+    // From here on other starts with the same database lead here; the instance must outlive the frame.
+    void AnswerOtherStarts(Instance& instance);
+    // What was being typed when an earlier run was killed; asks nothing where there is none.
+    void OfferDrafts();
+    // A quiet line that goes by itself.
+    void Note(const QString& text);
     // The help page of the view in front.
     void ShowHelpOfFront();
     // Points at the parts of the window one by one.
@@ -120,6 +128,11 @@ private:
     void ShowLists();
     void MoveToWindow();
     void ShowKeyList();
+    void ShowInformation();
+    QString BackUp();
+    QString Compact();
+    QString Check();
+    void RunCare(QString (CMainFrame::*command)());
     QString ChooseDatabase(Str title, Str accept, FileUse use);
     void ChooseAndOpenDatabase();
     void ChooseAndCreateDatabase();
@@ -127,6 +140,7 @@ private:
     void OpenPath(const QString& path);
     void ImportFrom(const ImportSource& source); // none: the user chooses
     void ImportFromClipboard();
+    void TakeFiles(const QStringList& paths);
 
     // Views.
     CTableView* MakeTable(const TableRequest& request);
@@ -137,6 +151,11 @@ private:
     void FollowMaker(CFormMakView& maker);
     HostedView* MakeView(const ViewKey& key);
     void ConnectView(HostedView& view);
+    void FollowTyping(HostedView& view);
+    void KeepDrafts();
+    QString PutBack(const Draft& draft);
+    HostedView* TableForDraft(const Draft& draft);
+    HostedView* FormForDraft(const Draft& draft);
     void SpreadOptions();
     template <typename View>
     QList<View*> ViewsOf() const
@@ -162,10 +181,16 @@ private:
     void OpenAgain(const ViewList& views) override;
     void CloseViewOf(const ViewKey& view) override;
 
+    // Other starts.
+    void FollowInstance();
+    void ComeForward();
+    void OpenWhenFree(const ViewKey& view);
+
     // What others change.
     void RecordsChanged() override;
     void TakeUpChanges(const HostedView* butNot);
     void LookAtFile();
+    void TellWhereNothingIsKept();
 
     DatabaseSession& session_;
     MainViewState& state_;
@@ -194,8 +219,14 @@ private:
     QString watchedPath_;
     FileState file_;
     bool wide_ = false;
-    bool alone_ = false;
+    bool alone_ = false; // aloneWith_ is set, and the window closes with its last view
+    std::optional<ViewKey> aloneWith_;
     bool telling_ = false;
+    Instance* instance_ = nullptr;
+    Drafts drafts_;
+    QTimer draftTimer_;
+    bool saidDraftsFail_ = false;
+    bool triedSettings_ = false;
 };
 
 } // namespace mirel

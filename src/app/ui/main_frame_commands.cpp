@@ -76,6 +76,13 @@ struct CMainFrame::Commands {
     static void Language(CMainFrame& frame) { ChooseLanguage(frame.session_.Folder(), frame.settings_, frame); }
     static void Nothing(CMainFrame&) {} // opens a menu
 
+    template <auto Call>
+    static void Care(CMainFrame& frame)
+    {
+        frame.RunCare(Call);
+    }
+
+    static State HasDatabase(const CMainFrame& frame) { return {.enabled = frame.state_.HasDatabase()}; }
     static State Always(const CMainFrame&) { return {}; }
     static State HasView(const CMainFrame& frame) { return {.enabled = frame.tabs_->Front() != nullptr}; }
     static State HasTabs(const CMainFrame& frame) { return {.enabled = frame.tabs_->Count() > 0}; }
@@ -244,12 +251,45 @@ std::span<const CommandRow<CMainFrame>> CMainFrame::CommandTable()
              .menus = ShellDatabaseMenu,
              .asks = true},
             C::Frame<&F::ChooseAndDeleteDatabase>},
+        Row{{.id = Id(Command::Information),
+             .text = Str::CommandInformation,
+             .tip = Str::TipInformation,
+             .icon = u"document-properties",
+             .keys = {{{Qt::CTRL | Qt::Key_I}}},
+             .menus = ShellDatabaseMenu,
+             .group = 1,
+             .asks = true},
+            C::Frame<&F::ShowInformation>,
+            C::HasDatabase},
+        Row{{.id = Id(Command::BackUp),
+             .text = Str::CommandBackUp,
+             .tip = Str::TipBackUp,
+             .icon = u"document-save-as",
+             .menus = ShellDatabaseMenu,
+             .group = 1,
+             .asks = true},
+            C::Care<&F::BackUp>,
+            C::HasDatabase},
+        Row{{.id = Id(Command::Compact),
+             .text = Str::CommandCompact,
+             .tip = Str::TipCompact,
+             .menus = ShellDatabaseMenu,
+             .group = 1},
+            C::Care<&F::Compact>,
+            C::HasDatabase},
+        Row{{.id = Id(Command::Check),
+             .text = Str::CommandCheck,
+             .tip = Str::TipCheck,
+             .menus = ShellDatabaseMenu,
+             .group = 1},
+            C::Care<&F::Check>,
+            C::HasDatabase},
         Row{{.id = Id(Command::OpenSample),
              .text = Str::CommandOpenSample,
              .tip = Str::TipOpenSample,
              .icon = u"mirel-sample",
              .menus = ShellDatabaseMenu,
-             .group = 1},
+             .group = 2},
             C::Change<&M::OpenSample>},
         Row{{.id = Id(Command::Help),
              .text = Str::CommandHelp,

@@ -1,3 +1,4 @@
+#include "app/dropped_files.h"
 #include "app/ui/entry_panel.h"
 #include "app/ui/main_frame.h"
 #include "csvimport/ui/import_wizard.h"
@@ -6,6 +7,7 @@
 #include <QClipboard>
 #include <QDragEnterEvent>
 #include <QDropEvent>
+#include <QFileInfo>
 #include <QGuiApplication>
 #include <QMimeData>
 #include <QUrl>
@@ -15,42 +17,65 @@
 namespace mirel {
 namespace {
 
-using namespace Qt::StringLiterals;
-
-// The one database file that is dragged; empty when it is anything else.
-QString DraggedDatabase(const QMimeData* data)
+QStringList DraggedPaths(const QMimeData& data)
 {
-    const QList<QUrl> urls = data->urls();
-    if (urls.size() != 1 || !urls.first().isLocalFile())
-        return {};
-    const QString path = urls.first().toLocalFile();
-    return path.endsWith(u".cdb"_s, Qt::CaseInsensitive) ? path : QString();
+    QStringList paths;
+    for (const QUrl& url : data.urls()) {
+        if (url.isLocalFile())
+            paths += url.toLocalFile();
+    }
+    return paths;
 }
 
 } // namespace
 
 void CMainFrame::dragEnterEvent(QDragEnterEvent* event)
 {
-    if (!DraggedDatabase(event->mimeData()).isEmpty() || !DraggedTextFile(*event->mimeData()).isEmpty())
+    if (DroppedFiles::Of(DraggedPaths(*event->mimeData())).IsUsable())
         event->acceptProposedAction();
 }
 
 void CMainFrame::dropEvent(QDropEvent* event)
 {
-    const QString database = DraggedDatabase(event->mimeData());
-    const QString text = DraggedTextFile(*event->mimeData());
-    if (database.isEmpty() && text.isEmpty())
+    const QStringList paths = DraggedPaths(*event->mimeData());
+    if (!DroppedFiles::Of(paths).IsUsable())
         return;
     // A move would have the file manager delete what was only opened.
     event->setDropAction(Qt::CopyAction);
     event->accept();
-    if (!database.isEmpty()) {
-        OpenPath(database);
+    // The program that it was dragged from waits until this returns, and dialogs stay open for long.
+    QMetaObject::invokeMethod(
+        this, [this, paths] { TakeFiles(paths); }, Qt::QueuedConnection);
+}
+
+// The database first: what comes with it goes into it.
+void CMainFrame::TakeFiles(const QStringList& paths)
+{
+    const DroppedFiles files = DroppedFiles::Of(paths);
+    for (const QString& other : files.others)
+        session_.Prompt().Show({Str::DropNotUsable, {QFileInfo(other).fileName()}});
+    if (files.databases.size() > 1) {
+        session_.Prompt().Show({Str::DropOneDatabase, {}});
         return;
     }
-    // The program that it was dragged from waits until this returns, and the wizard stays open for long.
-    QMetaObject::invokeMethod(
-        this, [this, text] { ImportFrom(ImportSource::OfFile(text)); }, Qt::QueuedConnection);
+    if (!files.databases.isEmpty() && !commands_.OpenDatabase(files.databases.first())) {
+        ShowState();
+        return;
+    }
+    ShowState();
+    for (const QString& form : files.forms) {
+        if (!state_.HasDatabase()) {
+            session_.Prompt().Show({Str::OpenDatabaseFirst, {}});
+            return;
+        }
+        (void)commands_.ImportFormFile(form);
+        ShowState();
+    }
+    for (const QString& text : files.texts) {
+        ImportFrom(ImportSource::OfFile(text));
+        if (!state_.HasDatabase())
+            return;
+    }
 }
 
 void CMainFrame::ImportFrom(const ImportSource& source)

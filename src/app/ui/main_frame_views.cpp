@@ -252,6 +252,7 @@ void CMainFrame::FollowMaker(CFormMakView& maker)
 void CMainFrame::ConnectView(HostedView& view)
 {
     view.setAttribute(Qt::WA_DeleteOnClose);
+    FollowTyping(view);
     connect(&view, &HostedView::recordsChanged, this, [this] {
         if (!telling_)
             tellTimer_.start(0);
@@ -289,9 +290,10 @@ void CMainFrame::FollowNames()
     }
 }
 
-void CMainFrame::BeAlone()
+void CMainFrame::BeAlone(const ViewKey& view)
 {
     alone_ = true;
+    aloneWith_ = view;
     wide_ = !IsWide();
     FitWidth();
 }
@@ -388,9 +390,11 @@ bool CMainFrame::MayCloseViews()
 ViewList CMainFrame::CloseViews()
 {
     KeepViews();
-    const ViewList open = tabs_->Open();
-    for (CViewWindow* window : Windows())
+    ViewList open = tabs_->Open();
+    for (CViewWindow* window : Windows()) {
+        open.views.push_back(window->Key()); // a tab when it is opened again
         window->close();
+    }
     const bool alone = std::exchange(alone_, false); // the window does not close with its last view now
     tabs_->CloseAll();
     alone_ = alone;

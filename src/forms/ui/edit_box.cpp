@@ -88,11 +88,11 @@ public:
 
     bool OpenMore() override
     {
+        const QString before = text_;
         const std::optional<QString> changed = Definition().editKind == EditKind::DatePicker
                                                    ? ChooseDay(text_, BelowBox(), *Main())
                                                    : EditLongText(TextToEdit(), *Main());
-        if (changed && *changed != text_)
-            Q_EMIT textEdited(*changed);
+        HandOver(changed.value_or(before));
         return true;
     }
 
@@ -124,9 +124,18 @@ protected:
 
 private:
     QPoint BelowBox() const { return Main()->mapToGlobal(Main()->rect().bottomLeft()); }
-    LongText TextToEdit() const
+    // What is typed in the large box is the control's at once: it is kept like everything that is typed.
+    LongText TextToEdit()
     {
-        return {.title = Main()->accessibleName(), .text = text_, .lines = Definition().lines};
+        return {.title = Main()->accessibleName(),
+                .text = text_,
+                .lines = Definition().lines,
+                .typed = [this](const QString& text) { HandOver(text); }};
+    }
+    void HandOver(const QString& text)
+    {
+        if (text != text_)
+            Q_EMIT textEdited(text);
     }
 
     QString text_;

@@ -193,6 +193,20 @@ void CFormEngView::TakeUpChanges()
     ShowState();
 }
 
+std::optional<RecordDraft> CFormEngView::Draft()
+{
+    return closing_ ? std::nullopt : form_.Draft();
+}
+
+bool CFormEngView::PutBack(const RecordDraft& draft)
+{
+    const bool done = form_.PutBack(draft);
+    ShowState();
+    if (done)
+        surface_->FocusControl(draft.texts.front().place);
+    return done;
+}
+
 // --- showing ------------------------------------------------------------------------------------------------
 
 void CFormEngView::ShowState()
@@ -202,6 +216,8 @@ void CFormEngView::ShowState()
     setWindowTitle(StringText(readOnly ? Str::TableViewTitleReadOnly : Str::TableViewTitle, {form_.Title()}));
     setWindowModified(form_.IsDirty());
     filters_->Show(form_.Filters());
+    if (std::exchange(wasDirty_, form_.IsDirty()) || wasDirty_)
+        Q_EMIT typed();
     if (!form_.IsDirty())
         Q_EMIT recordsChanged(); // perhaps nothing was written: the listeners look
     if (CurrentPage() == Page::Detail)

@@ -55,6 +55,8 @@ public:
     bool MayClose() override;
     void GiveUpEdits() override;
     void TakeUpChanges() override;
+    std::optional<RecordDraft> Draft() override;
+    bool PutBack(const RecordDraft& draft) override;
     void ChangeSettings(const FormViewSettings& settings);
     // When others have changed the structure of what it shows.
     void RunAgain();
@@ -122,6 +124,7 @@ private:
     int lastFocused_ = -1;  // outlives the focus's way through a menu
     int popupControl_ = -1; // while its popup menu is open
     bool closing_ = false;
+    bool wasDirty_ = false; // when it was shown last
 };
 
 } // namespace mirel

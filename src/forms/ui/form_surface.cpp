@@ -229,6 +229,12 @@ void FormSurface::FocusFirstInput()
         first->setFocus(Qt::TabFocusReason);
 }
 
+void FormSurface::FocusControl(int control)
+{
+    if (control >= 0 && control < int(widgets_.size()))
+        WidgetOf(control)->setFocus(Qt::OtherFocusReason);
+}
+
 // --- the user -----------------------------------------------------------------------------------------------
 
 void FormSurface::Remember(int control)

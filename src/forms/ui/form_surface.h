@@ -33,6 +33,7 @@ public:
     int ControlOf(const QObject* widget) const; // -1: none of them, nor within one
     int FocusedControl() const;                 // -1: none
     void FocusFirstInput();
+    void FocusControl(int control);
     // Gives a control its text of before back. False when it has that already.
     bool Revert(int control);
     const QString& TextBefore(int control) const { return before_[size_t(control)]; }

@@ -28,6 +28,8 @@ std::optional<QString> EditLongText(const LongText& longText, QWidget& parent)
     editor->SetText(longText.text);
     editor->setReadOnly(longText.readOnly);
     editor->setAccessibleName(longText.title);
+    if (longText.typed)
+        QObject::connect(editor, &MemoEdit::edited, &dialog, longText.typed);
     auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
     QObject::connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
     QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);

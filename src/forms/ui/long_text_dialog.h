@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <functional>
 #include <optional>
 
 class QWidget;
@@ -14,6 +15,7 @@ struct LongText {
     QString text;
     int lines = -1; // to be in sight at least; -1: as many as look well
     bool readOnly = false;
+    std::function<void(const QString&)> typed{}; // hears each change; empty: nobody does
 };
 
 // Edits the text in a large box over `parent`'s window. Gives the text; empty when the user cancelled.

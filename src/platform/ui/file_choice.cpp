@@ -7,6 +7,7 @@
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
+#include <QCheckBox>
 #include <QDialog>
 #include <QDialogButtonBox>
 #include <QDir>
@@ -36,10 +37,12 @@ public:
         , choice_(choice)
         , use_(request.use)
         , icon_(request.kind.icon)
+        , endings_(request.kind.endings)
         , up_(new QToolButton(this))
         , folder_(new ElidedLabel(this))
         , list_(new EntryList(this))
         , name_(new QLineEdit(this))
+        , all_(new QCheckBox(StringText(Str::ShowAllFiles), this))
         , buttons_(new QDialogButtonBox(QDialogButtonBox::Cancel, this))
     {
         accept_ = buttons_->addButton(StringText(request.accept), QDialogButtonBox::AcceptRole);
@@ -51,6 +54,7 @@ public:
         name_->setAccessibleName(StringText(Str::FileName));
         name_->setVisible(use_ == FileUse::Create);
         name_->setText(request.name);
+        all_->setVisible(!request.kind.others.empty());
         LayOut();
         Connect();
         ShowFolder();
@@ -68,6 +72,7 @@ private:
         lines->addLayout(top);
         lines->addWidget(list_, 1);
         lines->addWidget(name_);
+        lines->addWidget(all_);
         lines->addWidget(buttons_);
         (use_ == FileUse::Create ? static_cast<QWidget*>(name_) : list_)->setFocus();
     }
@@ -89,6 +94,10 @@ private:
         connect(list_, &EntryList::EnterPressed, this, [this](int row) { Take(entries_[size_t(row)].name); });
         connect(name_, &QLineEdit::textChanged, this,
                 [this](const QString& text) { accept_->setEnabled(!text.trimmed().isEmpty()); });
+        connect(all_, &QCheckBox::toggled, this, [this](bool all) {
+            choice_ = FolderChoice(choice_.Folder(), all ? QStringList(QString()) : endings_);
+            ShowFolder();
+        });
         connect(buttons_, &QDialogButtonBox::accepted, this, [this] { Take(name_->text().trimmed()); });
         connect(buttons_, &QDialogButtonBox::rejected, this, &QDialog::reject);
     }
@@ -127,12 +136,14 @@ private:
     FolderChoice choice_;
     FileUse use_;
     QStringView icon_;
+    QStringList endings_;
     std::vector<FolderChoice::Entry> entries_;
     QString path_;
     QToolButton* up_;
     ElidedLabel* folder_;
     EntryList* list_;
     QLineEdit* name_;
+    QCheckBox* all_;
     QDialogButtonBox* buttons_;
     QPushButton* accept_;
 };
@@ -149,7 +160,7 @@ QString ChooseOnSmallScreen(QWidget& parent, const FileRequest& request, const F
 
 FileKind FileKind::Database()
 {
-    return {Str::DatabaseFilter, {u".cdb"_s}, u"mirel-database"};
+    return {Str::DatabaseFilter, {u".cdb"_s}, u"mirel-database", {Str::SqliteFilter, Str::AllFilesFilter}};
 }
 
 QString ChooseFile(QWidget& parent, const FileRequest& request)
@@ -161,7 +172,10 @@ QString ChooseFile(QWidget& parent, const FileRequest& request)
     if (IsHandheldSize(parent.size()))
         return ChooseOnSmallScreen(parent, request, choice);
     const bool create = request.use == FileUse::Create;
-    QFileDialog dialog(&parent, WithoutMnemonic(request.title), choice.Folder(), StringText(request.kind.filter));
+    QStringList filters{StringText(request.kind.filter)};
+    for (const Str other : request.kind.others)
+        filters += StringText(other);
+    QFileDialog dialog(&parent, WithoutMnemonic(request.title), choice.Folder(), filters.join(u";;"_s));
     dialog.setAcceptMode(create ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
     dialog.setFileMode(create ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
     dialog.setOption(QFileDialog::DontConfirmOverwrite);

@@ -5,6 +5,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <vector>
+
 class QWidget;
 
 namespace mirel {
@@ -17,6 +19,7 @@ struct FileKind {
     Str filter;          // as the desktop's dialog takes it: "Database (*.cdb)", more than one with ";;" between
     QStringList endings; // of the files that the list shows, ".cdb"
     QStringView icon;    // of a file in the list: a name for ThemeIcon
+    std::vector<Str> others{}; // further filters; with any, a small screen's list offers all files
 
     static FileKind Database();
 };

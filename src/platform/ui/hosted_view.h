@@ -1,8 +1,11 @@
 #pragma once
 
 #include "platform/ui/keys_dialog.h"
+#include "result/record_draft.h"
 
 #include <QWidget>
+
+#include <optional>
 
 class QMenu;
 
@@ -28,12 +31,21 @@ public:
     // What was typed is lost: what it belongs to is gone.
     virtual void GiveUpEdits() = 0;
     bool HasEdits() const { return isWindowModified(); }
+    // What was typed into a record and is not saved yet, to be kept for the case that the program is killed.
+    virtual std::optional<RecordDraft> Draft() { return std::nullopt; }
+    // Makes it typed and not saved again, on its own record. False, and nothing typed, where that cannot be.
+    virtual bool PutBack(const RecordDraft& draft)
+    {
+        (void)draft;
+        return false;
+    }
     // Shows what others have changed in the database. The selection stays on its record, typed text stays.
     virtual void TakeUpChanges() = 0;
 
 Q_SIGNALS:
     void recordsChanged(); // by this view: others may show them as well
     void closed();         // it is hidden by then
+    void typed();          // Draft() may be another one by now
 
 protected:
     void closeEvent(QCloseEvent* event) override;

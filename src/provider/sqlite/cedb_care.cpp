@@ -9,7 +9,10 @@
 #include <QFileInfo>
 #include <QThread>
 
+#include <atomic>
+#include <chrono>
 #include <cstdio>
+#include <future>
 #include <sqlite3.h>
 
 namespace mirel::sqlite {
@@ -20,6 +23,8 @@ using namespace Qt::StringLiterals;
 constexpr int kPagesAtOnce = 256; // others wait no longer than that takes
 constexpr int kThousandths = 1000;
 constexpr unsigned long kBusyPauseMs = 20;
+constexpr int kOperationsPerLook = 10'000;
+constexpr std::chrono::milliseconds kLookPause(15);
 
 // A file that is gone again unless it was kept.
 class NewFile {
@@ -98,6 +103,36 @@ Outcome PutBelongings(const QString& path, const QByteArray& belongings)
     return outcome;
 }
 
+int IsStopped(void* stop)
+{
+    return static_cast<const std::atomic<bool>*>(stop)->load() ? 1 : 0;
+}
+
+// One statement that may take minutes, on a thread and a handle of its own: the engine cannot be left in the
+// middle of a statement, and the window wants to live on. The engine shares the locks of this process among its
+// handles.
+Outcome RunAside(const QString& path, const std::function<bool()>& goesOn,
+                 const std::function<Outcome(DatabaseFile&)>& work)
+{
+    std::atomic<bool> stop = false;
+    std::future<Outcome> result = std::async(std::launch::async, [&] {
+        Outcome outcome;
+        const std::shared_ptr<DatabaseFile> file = DatabaseFile::Open(path, outcome);
+        if (!file)
+            return outcome;
+        sqlite3_progress_handler(file->Handle(), kOperationsPerLook, IsStopped, &stop);
+        outcome = work(*file);
+        file->Close();
+        return outcome;
+    });
+    while (result.wait_for(kLookPause) != std::future_status::ready) {
+        if (!stop && !goesOn())
+            stop = true;
+    }
+    const Outcome outcome = result.get();
+    return stop && !outcome.Ok() ? Outcome{kStopped, {}} : outcome;
+}
+
 } // namespace
 
 template <typename Work>
@@ -142,30 +177,49 @@ QByteArray CedbCare::Belongings(const DatabaseLocation& database)
     return content;
 }
 
-Hr CedbCare::Compact(const DatabaseLocation& database, QString& context)
+Hr CedbCare::Compact(const DatabaseLocation& database, const std::function<bool()>& goesOn, QString& context)
 {
-    provider_.CloseDatabase(database); // results that read on would be in its way
-    return OnFile(database, context, [](DatabaseFile& file) -> Outcome {
+    QString path;
+    const Hr found = OnFile(database, context, [&path](DatabaseFile& file) -> Outcome {
+        path = file.Path();
         if (file.IsReadOnly())
-            return {Hr::AccessDenied, StringText(Str::DatabaseIsReadOnly, {file.Path()})};
-        return file.Execute("VACUUM");
+            return {Hr::AccessDenied, StringText(Str::DatabaseIsReadOnly, {path})};
+        return {};
     });
+    if (Failed(found))
+        return found;
+    provider_.CloseDatabase(database); // results that read on would be in its way
+    const Outcome outcome = RunAside(path, goesOn, [](DatabaseFile& file) { return file.Execute("VACUUM"); });
+    context = outcome.context;
+    return outcome.code;
 }
 
-Hr CedbCare::Check(const DatabaseLocation& database, QStringList& findings, QString& context)
+Hr CedbCare::Check(const DatabaseLocation& database, const std::function<bool()>& goesOn, QStringList& findings,
+                   QString& context)
 {
-    return OnFile(database, context, [&](DatabaseFile& file) {
-        Outcome outcome;
-        Statement row = file.Prepare("PRAGMA integrity_check", outcome);
-        if (!row)
-            return outcome;
-        int step = row.Step();
-        for (; step == SQLITE_ROW; step = row.Step()) {
-            if (const QString finding = row.Text(0); finding != u"ok")
-                findings += finding.split(u'\n');
-        }
-        return file.OutcomeOf(step);
+    QString path;
+    const Hr found = OnFile(database, context, [&path](DatabaseFile& file) -> Outcome {
+        path = file.Path();
+        return {};
     });
+    if (Failed(found))
+        return found;
+    QStringList lines;
+    const Outcome outcome = RunAside(path, goesOn, [&lines](DatabaseFile& file) {
+        Outcome step;
+        Statement row = file.Prepare("PRAGMA integrity_check", step);
+        if (!row)
+            return step;
+        int result = row.Step();
+        for (; result == SQLITE_ROW; result = row.Step()) {
+            if (const QString finding = row.Text(0); finding != u"ok")
+                lines += finding.split(u'\n');
+        }
+        return file.OutcomeOf(result);
+    });
+    findings += lines;
+    context = outcome.context;
+    return outcome.code;
 }
 
 } // namespace mirel::sqlite

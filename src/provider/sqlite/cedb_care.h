@@ -23,8 +23,9 @@ public:
     Hr BackUp(const DatabaseLocation& database, const QString& file, const QByteArray& belongings,
               const std::function<bool(int)>& progress, QString& context) override;
     QByteArray Belongings(const DatabaseLocation& database) override;
-    Hr Compact(const DatabaseLocation& database, QString& context) override;
-    Hr Check(const DatabaseLocation& database, QStringList& findings, QString& context) override;
+    Hr Compact(const DatabaseLocation& database, const std::function<bool()>& goesOn, QString& context) override;
+    Hr Check(const DatabaseLocation& database, const std::function<bool()>& goesOn, QStringList& findings,
+             QString& context) override;
 
 private:
     // Runs `work` on the open file; `context` is what the failure, of either, has to say.

@@ -848,7 +848,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60575">
         <source>Import &amp;from CSV ...</source>
         <extracomment>CommandImportCsv</extracomment>
-        <translation>Aus CSV &amp;importieren ...</translation>
+        <translation>Aus CSV im&amp;portieren ...</translation>
     </message>
     <message id="60576">
         <source>&amp;Export to CSV ...</source>
@@ -4218,7 +4218,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
         <translation>Schlägt in Zeile %1 fehl: %2</translation>
     </message>
     <message id="63267">
-        <source>&amp;Paste as New Table ...</source>
+        <source>Pas&amp;te as New Table ...</source>
         <extracomment>CommandPasteTable</extracomment>
         <translation>Als neue &amp;Tabelle einfügen ...</translation>
     </message>
@@ -6223,6 +6223,368 @@ Trotzdem verwenden?</translation>
         <source>query "%1": %2</source>
         <extracomment>CheckQuery</extracomment>
         <translation>Abfrage „%1“: %2</translation>
+    </message>
+    <message id="66000">
+        <source>SQLite database (*.db *.db3 *.sqlite *.sqlite3)</source>
+        <extracomment>SqliteFilter</extracomment>
+        <translation>SQLite-Datenbank (*.db *.db3 *.sqlite *.sqlite3)</translation>
+    </message>
+    <message id="66001">
+        <source>All files (*)</source>
+        <extracomment>AllFilesFilter</extracomment>
+        <translation>Alle Dateien (*)</translation>
+    </message>
+    <message id="66002">
+        <source>&amp;All files</source>
+        <extracomment>ShowAllFiles</extracomment>
+        <translation>&amp;Alle Dateien</translation>
+    </message>
+    <message id="66010">
+        <source>&amp;Information</source>
+        <extracomment>CommandInformation</extracomment>
+        <translation>&amp;Informationen</translation>
+    </message>
+    <message id="66011">
+        <source>Path, stamp and size of the open database, and what it holds</source>
+        <extracomment>TipInformation</extracomment>
+        <translation>Pfad, Stempel und Größe der offenen Datenbank, und was sie enthält</translation>
+    </message>
+    <message id="66012">
+        <source>&amp;Back Up</source>
+        <extracomment>CommandBackUp</extracomment>
+        <translation>&amp;Sichern</translation>
+    </message>
+    <message id="66013">
+        <source>Writes a copy with all forms and queries; the database stays open</source>
+        <extracomment>TipBackUp</extracomment>
+        <translation>Schreibt eine Kopie mit allen Formularen und Abfragen; die Datenbank bleibt offen</translation>
+    </message>
+    <message id="66014">
+        <source>&amp;Compact</source>
+        <extracomment>CommandCompact</extracomment>
+        <translation>&amp;Komprimieren</translation>
+    </message>
+    <message id="66015">
+        <source>Gives the unused space of the database back</source>
+        <extracomment>TipCompact</extracomment>
+        <translation>Gibt den ungenutzten Platz der Datenbank frei</translation>
+    </message>
+    <message id="66016">
+        <source>C&amp;heck</source>
+        <extracomment>CommandCheck</extracomment>
+        <translation>&amp;Prüfen</translation>
+    </message>
+    <message id="66017">
+        <source>Looks for damage, and for forms and queries that refer to what is missing</source>
+        <extracomment>TipCheck</extracomment>
+        <translation>Sucht nach Schäden und nach Formularen und Abfragen, die auf Fehlendes verweisen</translation>
+    </message>
+    <message id="66020">
+        <source>Database Information</source>
+        <extracomment>InformationTitle</extracomment>
+        <translation>Informationen zur Datenbank</translation>
+    </message>
+    <message id="66021">
+        <source>Name:</source>
+        <extracomment>InformationName</extracomment>
+        <translation>Name:</translation>
+    </message>
+    <message id="66022">
+        <source>Folder:</source>
+        <extracomment>InformationFolder</extracomment>
+        <translation>Ordner:</translation>
+    </message>
+    <message id="66023">
+        <source>Stamp:</source>
+        <extracomment>InformationStamp</extracomment>
+        <translation>Stempel:</translation>
+    </message>
+    <message id="66024">
+        <source>Size:</source>
+        <extracomment>InformationSize</extracomment>
+        <translation>Größe:</translation>
+    </message>
+    <message id="66025">
+        <source>Changed:</source>
+        <extracomment>InformationChanged</extracomment>
+        <translation>Geändert:</translation>
+    </message>
+    <message id="66026">
+        <source>Tables:</source>
+        <extracomment>InformationTables</extracomment>
+        <translation>Tabellen:</translation>
+    </message>
+    <message id="66027">
+        <source>Records:</source>
+        <extracomment>InformationRecords</extracomment>
+        <translation>Datensätze:</translation>
+    </message>
+    <message id="66028">
+        <source>Forms:</source>
+        <extracomment>InformationForms</extracomment>
+        <translation>Formulare:</translation>
+    </message>
+    <message id="66029">
+        <source>Queries:</source>
+        <extracomment>InformationQueries</extracomment>
+        <translation>Abfragen:</translation>
+    </message>
+    <message id="66030">
+        <source>%1, counting …</source>
+        <extracomment>InformationCounting</extracomment>
+        <translation>%1, wird gezählt …</translation>
+    </message>
+    <message id="66031">
+        <source>cannot be read</source>
+        <extracomment>InformationUnread</extracomment>
+        <translation>nicht lesbar</translation>
+    </message>
+    <message id="66041">
+        <source>%1 (copy %2).cdb</source>
+        <extracomment>BackUpName</extracomment>
+        <translation>%1 (Kopie %2).cdb</translation>
+    </message>
+    <message id="66042">
+        <source>"%1" exists:
+Do you want to replace it?</source>
+        <extracomment>BackUpReplace</extracomment>
+        <translation>„%1“ ist bereits vorhanden:
+Möchten Sie die Datei ersetzen?</translation>
+    </message>
+    <message id="66043">
+        <source>The copy is complete: %1 (%2)</source>
+        <extracomment>BackUpDone</extracomment>
+        <translation>Die Kopie ist fertig: %1 (%2)</translation>
+    </message>
+    <message id="66044">
+        <source>Stopped. No copy was written.</source>
+        <extracomment>BackUpStopped</extracomment>
+        <translation>Abgebrochen. Es wurde keine Kopie geschrieben.</translation>
+    </message>
+    <message id="66050">
+        <source>Compacting the database …</source>
+        <extracomment>Compacting</extracomment>
+        <translation>Die Datenbank wird komprimiert …</translation>
+    </message>
+    <message id="66051">
+        <source>Compacted: %1 before, %2 now</source>
+        <extracomment>CompactDone</extracomment>
+        <translation>Komprimiert: vorher %1, jetzt %2</translation>
+    </message>
+    <message id="66052">
+        <source>Stopped. The database is as it was.</source>
+        <extracomment>CompactStopped</extracomment>
+        <translation>Abgebrochen. Die Datenbank ist unverändert.</translation>
+    </message>
+    <message id="66053">
+        <source>Another program is using this database. Close it there, and try again.</source>
+        <extracomment>CompactInUse</extracomment>
+        <translation>Ein anderes Programm verwendet diese Datenbank. Schließen Sie sie dort, und versuchen Sie es noch einmal.</translation>
+    </message>
+    <message id="66060">
+        <source>Checking the database …</source>
+        <extracomment>Checking</extracomment>
+        <translation>Die Datenbank wird geprüft …</translation>
+    </message>
+    <message id="66061">
+        <source>Check</source>
+        <extracomment>CheckTitle</extracomment>
+        <translation>Prüfung</translation>
+    </message>
+    <message id="66062">
+        <source>The database is sound, and its forms and queries find all that they refer to.</source>
+        <extracomment>CheckClean</extracomment>
+        <translation>Die Datenbank ist in Ordnung, und ihre Formulare und Abfragen finden alles, worauf sie verweisen.</translation>
+    </message>
+    <message id="66063">
+        <source>1 finding</source>
+        <extracomment>CheckOneFinding</extracomment>
+        <translation>1 Befund</translation>
+    </message>
+    <message id="66064">
+        <source>%1 findings</source>
+        <extracomment>CheckFindings</extracomment>
+        <translation>%1 Befunde</translation>
+    </message>
+    <message id="66065">
+        <source>Stopped before the end.</source>
+        <extracomment>CheckStopped</extracomment>
+        <translation>Vor dem Ende abgebrochen.</translation>
+    </message>
+    <message id="66066">
+        <source>What the check found</source>
+        <extracomment>CheckListName</extracomment>
+        <translation>Was die Prüfung gefunden hat</translation>
+    </message>
+    <message id="66068">
+        <source>&amp;Copy All</source>
+        <extracomment>CheckCopyAll</extracomment>
+        <translation>Alles &amp;kopieren</translation>
+    </message>
+    <message id="66069">
+        <source>… and %1 more</source>
+        <extracomment>CheckEnough</extracomment>
+        <translation>… und %1 weitere</translation>
+    </message>
+    <message id="66070">
+        <source>The file is damaged. Go back to a copy made by Back Up. Without one, export what can still be read, table by table, and import it into a new database.</source>
+        <extracomment>RemedyDamage</extracomment>
+        <translation>Die Datei ist beschädigt. Kehren Sie zu einer Kopie zurück, die mit „Sichern“ entstanden ist. Gibt es keine, exportieren Sie Tabelle für Tabelle, was noch lesbar ist, und importieren Sie es in eine neue Datenbank.</translation>
+    </message>
+    <message id="66071">
+        <source>The file with the forms and queries is damaged. Put back a copy of it, or a copy of the database made by Back Up, which carries them.</source>
+        <extracomment>RemedyStore</extracomment>
+        <translation>Die Datei mit den Formularen und Abfragen ist beschädigt. Setzen Sie eine Kopie davon ein, oder eine mit „Sichern“ entstandene Kopie der Datenbank, die sie mitführt.</translation>
+    </message>
+    <message id="66072">
+        <source>Open the form with Edit and choose what is there, or delete the form.</source>
+        <extracomment>RemedyForm</extracomment>
+        <translation>Öffnen Sie das Formular mit „Bearbeiten“, und wählen Sie, was vorhanden ist, oder löschen Sie das Formular.</translation>
+    </message>
+    <message id="66073">
+        <source>Open the query with Edit and change its statement, or delete the query.</source>
+        <extracomment>RemedyQuery</extracomment>
+        <translation>Öffnen Sie die Abfrage mit „Bearbeiten“, und ändern Sie ihre Anweisung, oder löschen Sie die Abfrage.</translation>
+    </message>
+    <message id="66074">
+        <source>The tables cannot be listed. Try again when no other program uses the database.</source>
+        <extracomment>RemedyTables</extracomment>
+        <translation>Die Tabellen lassen sich nicht auflisten. Versuchen Sie es noch einmal, wenn kein anderes Programm die Datenbank verwendet.</translation>
+    </message>
+    <message id="66100">
+        <source>Only one database can be open here. Drop one of them.</source>
+        <extracomment>DropOneDatabase</extracomment>
+        <translation>Hier kann nur eine Datenbank offen sein. Legen Sie nur eine davon ab.</translation>
+    </message>
+    <message id="66101">
+        <source>"%1" is no database, no CSV file and no form file.</source>
+        <extracomment>DropNotUsable</extracomment>
+        <translation>„%1“ ist weder eine Datenbank noch eine CSV-Datei noch eine Formulardatei.</translation>
+    </message>
+    <message id="66110">
+        <source>Settings and lists cannot be saved: %1 cannot be written.</source>
+        <extracomment>SettingsNotKept</extracomment>
+        <translation>Einstellungen und Listen lassen sich nicht speichern: %1 ist nicht beschreibbar.</translation>
+    </message>
+    <message id="66111">
+        <source>"%1" is not in this database.</source>
+        <extracomment>ViewNotThere</extracomment>
+        <translation>„%1“ ist in dieser Datenbank nicht vorhanden.</translation>
+    </message>
+    <message id="66500">
+        <source>Unsaved Text</source>
+        <extracomment>DraftsTitle</extracomment>
+        <translation>Nicht gespeicherter Text</translation>
+    </message>
+    <message id="66501">
+        <source>Mirel ended while this was being typed:</source>
+        <extracomment>DraftsIntro</extracomment>
+        <translation>Mirel wurde beendet, während dies eingegeben wurde:</translation>
+    </message>
+    <message id="66502">
+        <source>%1: %2</source>
+        <extracomment>DraftEntry</extracomment>
+        <translation>%1: %2</translation>
+    </message>
+    <message id="66503">
+        <source>%1: %2 and %3 more</source>
+        <extracomment>DraftFields</extracomment>
+        <translation>%1: %2 und %3 weitere</translation>
+    </message>
+    <message id="66504">
+        <source>Put Back types it into its record again. It is not saved by that alone.</source>
+        <extracomment>DraftFits</extracomment>
+        <translation>„Zurückholen“ gibt ihn wieder in seinen Datensatz ein. Gespeichert ist er damit noch nicht.</translation>
+    </message>
+    <message id="66505">
+        <source>Its record has been deleted. The text can be copied.</source>
+        <extracomment>DraftGone</extracomment>
+        <translation>Der Datensatz wurde gelöscht. Der Text lässt sich kopieren.</translation>
+    </message>
+    <message id="66506">
+        <source>Its record has been changed meanwhile, so the text is not put back. It can be copied.</source>
+        <extracomment>DraftChanged</extracomment>
+        <translation>Der Datensatz wurde inzwischen geändert, deshalb wird der Text nicht zurückgeholt. Er lässt sich kopieren.</translation>
+    </message>
+    <message id="66507">
+        <source>Another database has this file's name now. The text can be copied.</source>
+        <extracomment>DraftOtherDatabase</extracomment>
+        <translation>Eine andere Datenbank trägt jetzt den Namen dieser Datei. Der Text lässt sich kopieren.</translation>
+    </message>
+    <message id="66508">
+        <source>"%1" cannot be opened any more. The text can be copied.</source>
+        <extracomment>DraftNoView</extracomment>
+        <translation>„%1“ lässt sich nicht mehr öffnen. Der Text lässt sich kopieren.</translation>
+    </message>
+    <message id="66509">
+        <source>"%1" holds other unsaved text. Save that first; this stays here until then.</source>
+        <extracomment>DraftViewBusy</extracomment>
+        <translation>„%1“ enthält anderen nicht gespeicherten Text. Speichern Sie zuerst diesen; dieser hier bleibt so lange erhalten.</translation>
+    </message>
+    <message id="66510">
+        <source>&amp;Put Back</source>
+        <extracomment>DraftPutBack</extracomment>
+        <translation>&amp;Zurückholen</translation>
+    </message>
+    <message id="66511">
+        <source>Opens the record and types the text into it again</source>
+        <extracomment>DraftPutBackTip</extracomment>
+        <translation>Öffnet den Datensatz und gibt den Text wieder ein</translation>
+    </message>
+    <message id="66512">
+        <source>&amp;Copy</source>
+        <extracomment>DraftCopy</extracomment>
+        <translation>&amp;Kopieren</translation>
+    </message>
+    <message id="66513">
+        <source>Copies the text, to be pasted wherever it belongs</source>
+        <extracomment>DraftCopyTip</extracomment>
+        <translation>Kopiert den Text, damit er eingefügt werden kann, wo er hingehört</translation>
+    </message>
+    <message id="66514">
+        <source>&amp;Discard</source>
+        <extracomment>DraftDiscard</extracomment>
+        <translation>&amp;Verwerfen</translation>
+    </message>
+    <message id="66515">
+        <source>Gives this text up for good</source>
+        <extracomment>DraftDiscardTip</extracomment>
+        <translation>Gibt diesen Text endgültig auf</translation>
+    </message>
+    <message id="66516">
+        <source>&amp;Later</source>
+        <extracomment>DraftLater</extracomment>
+        <translation>&amp;Später</translation>
+    </message>
+    <message id="66517">
+        <source>Keeps the text; the next start asks again</source>
+        <extracomment>DraftLaterTip</extracomment>
+        <translation>Behält den Text; der nächste Start fragt wieder</translation>
+    </message>
+    <message id="66518">
+        <source>Records with unsaved text</source>
+        <extracomment>DraftListName</extracomment>
+        <translation>Datensätze mit nicht gespeichertem Text</translation>
+    </message>
+    <message id="66519">
+        <source>The unsaved text</source>
+        <extracomment>DraftTextName</extracomment>
+        <translation>Der nicht gespeicherte Text</translation>
+    </message>
+    <message id="66520">
+        <source>%1: %2</source>
+        <extracomment>DraftTextLine</extracomment>
+        <translation>%1: %2</translation>
+    </message>
+    <message id="66530">
+        <source>What is typed now would be lost in a crash: %1 cannot be written.</source>
+        <extracomment>DraftsNotKept</extracomment>
+        <translation>Was jetzt eingegeben wird, ginge bei einem Absturz verloren: %1 ist nicht beschreibbar.</translation>
+    </message>
+    <message id="66531">
+        <source>The unsaved text of an earlier run cannot be read. Its file is now %1.</source>
+        <extracomment>DraftsDamaged</extracomment>
+        <translation>Der nicht gespeicherte Text eines früheren Laufs lässt sich nicht lesen. Seine Datei heißt jetzt %1.</translation>
     </message>
     <message id="67000">
         <source>Help</source>

@@ -60,7 +60,7 @@ CTableView::CTableView(DbConnection& connection, const DatabaseLocation& databas
     LayOut();
     ConnectParts();
     ShowState();
-    setFocusProxy(grid_);
+    setFocusProxy(grid_); // who focuses the view without having been in it means the records
 }
 
 CTableView::~CTableView() = default;
@@ -169,6 +169,20 @@ void CTableView::TakeUpChanges()
         return;
     browser_.TakeUpChanges();
     ShowState();
+}
+
+std::optional<RecordDraft> CTableView::Draft()
+{
+    return givenUp_ ? std::nullopt : browser_.Draft();
+}
+
+bool CTableView::PutBack(const RecordDraft& draft)
+{
+    const bool done = browser_.PutBack(draft);
+    ShowState();
+    if (done)
+        Edit(nullptr);
+    return done;
 }
 
 void CTableView::SetStore(FormStore& store)
@@ -292,6 +306,8 @@ void CTableView::ShowState()
         !browser_.IsOpen() || browser_.CanUpdate() ? Str::TableViewTitle : Str::TableViewTitleReadOnly;
     setWindowTitle(StringText(title, {title_}));
     setWindowModified(browser_.HasPendingEdit());
+    if (std::exchange(hadEdit_, browser_.HasPendingEdit()) || hadEdit_)
+        Q_EMIT typed();
     grid_->setAccessibleDescription(StringText(
         Str::CellDescription, {browser_.FieldLabel(), browser_.SelectedText(), browser_.CounterText()}));
     if (browser_.IsOpen() && !browser_.KnownCount())

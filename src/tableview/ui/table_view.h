@@ -72,6 +72,8 @@ public:
     bool MayClose() override { return givenUp_ || Settle(browser_.WriteEdit()); }
     void GiveUpEdits() override { givenUp_ = true; }
     void TakeUpChanges() override;
+    std::optional<RecordDraft> Draft() override;
+    bool PutBack(const RecordDraft& draft) override;
 
     static std::optional<TableCommand> CommandOfKey(KeyPlace place, QKeyCombination keys);
 
@@ -136,6 +138,7 @@ private:
     NavigationRow* navigation_ = nullptr;
     QTimer countTimer_;
     bool zoomed_ = false;
+    bool hadEdit_ = false; // when it was shown last
     bool refused_ = false; // the error stands beside the editor, until the edit ends
     struct Refusal {
         QString text;
