@@ -78,7 +78,6 @@ public:
     const ProgramFolder& Folder() const { return folder_; }
     DbConnection& Connection() { return connection_; }
     UserPrompt& Prompt() { return prompt_; }
-    const ProgramFolder& Folder() const { return folder_; }
 
     // Each must be removed before it goes.
     void AddListener(SessionListener& listener) { listeners_.push_back(&listener); }

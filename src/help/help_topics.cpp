@@ -36,6 +36,9 @@ constexpr std::array kTopics = {
     HelpTopic{u"CPropertySheet", u"maker"},
     HelpTopic{u"CExpressionDesk", u"expressions"},
     HelpTopic{u"CFileDialog", u"databases"},
+    HelpTopic{u"CInformationDialog", u"databases"},
+    HelpTopic{u"CFindingsDialog", u"databases"},
+    HelpTopic{u"CDraftsDialog", u"databases"},
     HelpTopic{u"CHelpWindow", u"contents"},
 };
 

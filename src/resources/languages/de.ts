@@ -848,7 +848,7 @@ Für mehr als 255 wählen Sie ein Memofeld.</translation>
     <message id="60575">
         <source>Import &amp;from CSV ...</source>
         <extracomment>CommandImportCsv</extracomment>
-        <translation>Aus CSV im&amp;portieren ...</translation>
+        <translation>Aus CS&amp;V importieren ...</translation>
     </message>
     <message id="60576">
         <source>&amp;Export to CSV ...</source>
@@ -4218,7 +4218,7 @@ Kreuzen Sie Felder an, um sie zu zeigen; ziehen Sie ein Feld auf ein anderes, um
         <translation>Schlägt in Zeile %1 fehl: %2</translation>
     </message>
     <message id="63267">
-        <source>Pas&amp;te as New Table ...</source>
+        <source>Paste as Ne&amp;w Table ...</source>
         <extracomment>CommandPasteTable</extracomment>
         <translation>Als neue &amp;Tabelle einfügen ...</translation>
     </message>
