@@ -268,6 +268,13 @@ void FlatStyle::drawControl(ControlElement element, const QStyleOption* option, 
     TouchTargetStyle::drawControl(element, option, painter, widget);
 }
 
+QRect FlatStyle::subElementRect(SubElement element, const QStyleOption* option, const QWidget* widget) const
+{
+    if (element == SE_ItemViewItemFocusRect) // the entry's, its icon included
+        return option->rect.adjusted(1, 1, -1, -1);
+    return TouchTargetStyle::subElementRect(element, option, widget);
+}
+
 void FlatStyle::DrawMenuBarItem(QStyleOptionMenuItem item, QPainter& painter, const QWidget* widget) const
 {
     // The keys go to the bar until Escape is pressed once more: that must be seen.
