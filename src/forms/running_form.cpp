@@ -313,10 +313,10 @@ bool RunningForm::LeaveRecordCheck()
 RunningForm::Outcome RunningForm::LeaveAndMoveTo(qint64 record)
 {
     OpenResult& result = source_.Result();
-    const std::vector<RecordId> meant = result.IdsFrom(record, 1);
+    // Others go on while a question is asked: the record that was meant is found wherever it is by then.
+    const std::vector<RecordId> meant = IsDirty() ? result.IdsFrom(record, 1) : std::vector<RecordId>();
     if (!LeaveRecordCheck())
         return Outcome::Stopped;
-    // Others go on while a question is asked: the record that was meant is found wherever it is by now.
     const bool isThere = !meant.empty() && result.MoveToRecord(meant.front());
     if (!isThere && !result.MoveTo(record)) {
         result.Close();
