@@ -23,7 +23,7 @@ public:
 
     // A copy with its forms and queries, made while the database stays open; asks before it replaces a file.
     QString BackUp(const QString& file);
-    // What is open on the database must be closed before, because its records are numbered anew.
+    // What is open on the database must be closed first: compacting renumbers the records.
     QString Compact();
     // The findings come in the order in which they matter; none: all is well.
     QString Check(std::vector<CheckFinding>& findings);

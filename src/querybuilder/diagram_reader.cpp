@@ -106,7 +106,7 @@ private:
     bool ReadTotalsConditions(TokenRun run);
     bool ReadOrder(TokenRun run);
     DiagramColumn ColumnOf(TokenRun run) const;
-    // The column of that expression to which `fits`, a hidden new one when there is none.
+    // The column with that expression that `fits`; without one, a new hidden column.
     template <typename Fits>
     DiagramColumn& FindOrAdd(const DiagramColumn& wanted, Fits fits);
 

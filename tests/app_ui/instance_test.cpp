@@ -111,7 +111,7 @@ TEST_F(InstanceTest, TheSecondStartEndsAndAStuckOrDeadFirstDoesNotKeepItFromRunn
     EXPECT_EQ(first.state(), QProcess::Running);
 
     ::kill(pid_t(first.processId()), SIGSTOP);
-    ASSERT_TRUE(QFile::remove(PathOf(u"Mirel.ini"_s))); // written by whoever runs
+    ASSERT_TRUE(QFile::remove(PathOf(u"Mirel.ini"_s))); // each run writes it
     QProcess third;
     StartProgram(third);
     for (int i = 0; i < 3000 && !QFile::exists(PathOf(u"Mirel.ini"_s)); ++i)

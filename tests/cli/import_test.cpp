@@ -131,7 +131,7 @@ TEST_F(Import, ExportsInOtherFormats)
                     .startsWith(QByteArray("\xFF\xFE"
                                            "1\0,\0",
                                            6)));
-    EXPECT_TRUE(exported({u"--bom"_s, u"--encoding"_s, u"ISO-8859-1"_s}).startsWith("1,")) << "there is none";
+    EXPECT_TRUE(exported({u"--bom"_s, u"--encoding"_s, u"ISO-8859-1"_s}).startsWith("1,")) << "Latin-1 has no byte order mark";
     EXPECT_EQ(Run({u"export"_s, u"a.cdb"_s, u"T"_s, u"p.txt"_s, u"--format"_s, u"pdf"_s}).status, 2);
 }
 

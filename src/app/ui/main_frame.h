@@ -80,7 +80,7 @@ public:
     bool IsAlone() const { return aloneWith_.has_value(); }
     // From here on other starts with the same database lead here; the instance must outlive the frame.
     void AnswerOtherStarts(Instance& instance);
-    // What was being typed when an earlier run was killed; asks nothing where there is none.
+    // What was being typed when an earlier run was killed; asks nothing when nothing was.
     void OfferDrafts();
     // A quiet line that goes by itself.
     void Note(const QString& text);

@@ -39,7 +39,7 @@ QString CMainFrame::BackUp()
     return upkeep.BackUp(file);
 }
 
-// The engine numbers the records anew: what is open lets go of them and is opened again.
+// Compacting renumbers the records, so the open views are closed for it and opened again.
 QString CMainFrame::Compact()
 {
     if (!MayCloseViews())

@@ -113,7 +113,7 @@ HostedView* CMainFrame::TableForDraft(const Draft& draft)
     return OpenTable(*request);
 }
 
-// The form as it is open again; or anew, with the records that it showed then.
+// The form, if it is open already; otherwise it opens with the records that it showed then.
 HostedView* CMainFrame::FormForDraft(const Draft& draft)
 {
     if (tabs_->BringForward(draft.view)) {
