@@ -1,5 +1,6 @@
 #include "app/ui/drafts_dialog.h"
 
+#include "app/ui/entry_icon.h"
 #include "platform/ui/entry_list.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -62,19 +63,6 @@ QString StateText(const LeftDraft& left)
         break;
     }
     return StringText(Str::DraftNoView, {left.draft.view.name});
-}
-
-QStringView IconOf(EntryKind kind)
-{
-    switch (kind) {
-    case EntryKind::Table:
-        return u"mirel-table";
-    case EntryKind::Form:
-        return u"mirel-form";
-    case EntryKind::Query:
-        break;
-    }
-    return u"mirel-query";
 }
 
 QLabel* WrappedLabel(QWidget* parent)

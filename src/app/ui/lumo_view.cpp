@@ -1,6 +1,7 @@
 #include "app/ui/lumo_view.h"
 
 #include "app/ui/compact_tab_bar.h"
+#include "app/ui/entry_icon.h"
 #include "app/ui/welcome_page.h"
 #include "platform/ui/elided_label.h"
 #include "platform/ui/entry_list.h"
@@ -23,19 +24,6 @@ namespace {
 
 constexpr std::array kEntryButtons = {ShellCommand::Open, ShellCommand::New, ShellCommand::Edit,
                                       ShellCommand::Delete};
-QStringView IconOf(EntryKind kind)
-{
-    switch (kind) {
-    case EntryKind::Table:
-        return u"mirel-table";
-    case EntryKind::Form:
-        return u"mirel-form";
-    case EntryKind::Query:
-        break;
-    }
-    return u"mirel-query";
-}
-
 // What an entry says of itself under its name. A table among tables says nothing.
 QString DetailOf(const MainEntry& entry, MainTab tab)
 {

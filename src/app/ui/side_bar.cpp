@@ -1,5 +1,6 @@
 #include "app/ui/side_bar.h"
 
+#include "app/ui/entry_icon.h"
 #include "app/ui/side_tree.h"
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
@@ -14,21 +15,6 @@
 
 namespace mirel {
 namespace {
-
-QStringView IconOf(MainTab tab, EntryKind kind)
-{
-    if (tab == MainTab::Favorites)
-        return u"mirel-favorite";
-    switch (kind) {
-    case EntryKind::Table:
-        return u"mirel-table";
-    case EntryKind::Form:
-        return u"mirel-form";
-    case EntryKind::Query:
-        break;
-    }
-    return u"mirel-query";
-}
 
 // At the right of an entry: what it was made for; of a favorite, its kind.
 QString DetailOf(MainTab tab, const MainEntry& entry)
@@ -142,7 +128,8 @@ void SideBar::Fill()
         for (const MainEntry& entry : section) {
             const QString detail = DetailOf(MainTab(tab), entry);
             auto* item = new QTreeWidgetItem({entry.name});
-            item->setIcon(0, ThemeIcon(IconOf(MainTab(tab), entry.kind)));
+            item->setIcon(0, ThemeIcon(MainTab(tab) == MainTab::Favorites ? QStringView(u"mirel-favorite")
+                                                                          : IconOf(entry.kind)));
             item->setToolTip(0, entry.name.toHtmlEscaped());
             item->setData(0, SideTree::DetailRole, detail);
             item->setData(0, Qt::AccessibleDescriptionRole, detail);
