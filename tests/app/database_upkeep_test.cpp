@@ -74,6 +74,24 @@ TEST_F(DatabaseUpkeepTest, ACopyIsWholeAndReplacesAFileOnlyAfterAQuestion)
     EXPECT_FALSE(QFileInfo::exists(folder_.filePath(u"stopped.cdb"_s)));
 }
 
+// Neither a file that only looks like one of ours, nor what a database left behind that was killed there.
+TEST_F(DatabaseUpkeepTest, ACopyTakesNothingFromItsNeighborsAndNothingOver)
+{
+    const QString neighbor = copy_ + u".part"_s;
+    const QString journal = copy_ + u"-journal"_s;
+    for (const QString& path : {neighbor, journal}) {
+        QFile file(path);
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly) && file.write("mine") == 4);
+    }
+    EXPECT_FALSE(upkeep_.BackUp(copy_).isEmpty());
+    EXPECT_FALSE(QFileInfo::exists(journal)) << "it would be played back into the copy";
+    QFile kept(neighbor);
+    ASSERT_TRUE(kept.open(QIODevice::ReadOnly));
+    EXPECT_EQ(kept.readAll(), "mine");
+    EXPECT_FALSE(QFileInfo::exists(neighbor + u'2'));
+    EXPECT_EQ(SqliteFile(copy_).Text("SELECT Name FROM Birds"), u"Wren"_s);
+}
+
 TEST_F(DatabaseUpkeepTest, TheNameOfACopyIsFree)
 {
     const QString first = upkeep_.NameForCopy();

@@ -26,27 +26,38 @@ constexpr unsigned long kBusyPauseMs = 20;
 constexpr int kOperationsPerLook = 10'000;
 constexpr std::chrono::milliseconds kLookPause(15);
 
-// A file that is gone again unless it was kept.
+// What the engine keeps beside a file until its changes are whole.
+void RemoveJournals(const QString& path)
+{
+    for (const auto& ending : {u"-journal"_s, u"-wal"_s, u"-shm"_s})
+        QFile::remove(path + ending);
+}
+
+// A file beside `target`, under a name that was free, which is gone again unless it was moved there.
 class NewFile {
 public:
-    explicit NewFile(QString path)
-        : path_(std::move(path))
+    explicit NewFile(const QString& target)
+        : path_(target + u".part"_s)
     {
-        QFile::remove(path_);
+        for (int number = 2; QFileInfo::exists(path_); ++number)
+            path_ = target + u".part"_s + QString::number(number);
     }
     ~NewFile()
     {
-        for (const auto& ending : {u""_s, u"-journal"_s, u"-wal"_s, u"-shm"_s})
-            QFile::remove(path_ + ending);
+        QFile::remove(path_);
+        RemoveJournals(path_);
     }
     Q_DISABLE_COPY_MOVE(NewFile)
 
     const QString& Path() const { return path_; }
-    // In one step, over what bears that name.
+    // In one step, over what bears that name. The journal of a database that stood there and was not closed well
+    // would be played back into the new one.
     Outcome MoveTo(const QString& target) const
     {
-        if (std::rename(QFile::encodeName(path_).constData(), QFile::encodeName(target).constData()) == 0)
+        if (std::rename(QFile::encodeName(path_).constData(), QFile::encodeName(target).constData()) == 0) {
+            RemoveJournals(target);
             return {};
+        }
         return {Hr::CannotOpen, StringText(Str::DatabaseFailure, {target, qt_error_string()})};
     }
 
@@ -151,7 +162,7 @@ Hr CedbCare::BackUp(const DatabaseLocation& database, const QString& target, con
     return OnFile(database, context, [&](DatabaseFile& file) -> Outcome {
         if (IdentityOfPath(target) == file.Path())
             return {Hr::CannotOpen, StringText(Str::CopyOntoItself, {target})};
-        const NewFile copy(target + u".part"_s);
+        const NewFile copy(target);
         Outcome outcome = CopyPages(file, copy.Path(), progress);
         if (outcome.Ok())
             outcome = PutBelongings(copy.Path(), belongings);
