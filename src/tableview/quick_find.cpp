@@ -10,8 +10,7 @@
 namespace mirel {
 namespace {
 
-constexpr qint64 kRecordsALook = 512; // between two looks at the clock
-constexpr qint64 kRecordsBack = 512;  // read at once on the way back
+constexpr qint64 kRecordsAtOnce = 512; // between two looks at the clock
 constexpr unsigned char kBeyondAscii = 0x80;
 
 char Lower(char letter)
@@ -96,25 +95,27 @@ bool QuickFind::ReadOn(int budgetMs, std::optional<CellPlace>& found)
 {
     QElapsedTimer clock;
     clock.start();
-    bool atEnd = true;
-    qint64 record = next_;
-    const qint64 count = wrapped_ ? start_.record + 1 - next_ : -1;
-    const ReadRange range{.first = next_, .count = count, .fields = fields_};
-    const bool read = browser_.Recordset().Read(range, [&](std::span<const Cell> cells) {
-        if (const std::optional<int> column = MatchIn(cells, record))
-            found = CellPlace{record, *column};
-        ++record;
-        atEnd = !found && (record % kRecordsALook != 0 || clock.elapsed() < budgetMs);
-        return atEnd;
-    });
-    looked_ += record - next_;
-    next_ = record;
-    if (found || !atEnd)
-        return read;
-    if (wrapped_)
-        state_ = State::NotFound;
-    wrapped_ = true;
-    next_ = 0;
+    bool read = true;
+    do {
+        const qint64 left = wrapped_ ? start_.record + 1 - next_ : kRecordsAtOnce;
+        const ReadRange range{.first = next_, .count = std::min(left, kRecordsAtOnce), .fields = fields_};
+        qint64 record = next_;
+        read = browser_.Recordset().Read(range, [&](std::span<const Cell> cells) {
+            if (const std::optional<int> column = MatchIn(cells, record))
+                found = CellPlace{record, *column};
+            ++record;
+            return !found;
+        });
+        const bool isAtEnd = record - next_ < kRecordsAtOnce;
+        looked_ += record - next_;
+        next_ = record;
+        if (found || !isAtEnd)
+            continue;
+        if (wrapped_)
+            state_ = State::NotFound;
+        wrapped_ = true;
+        next_ = 0;
+    } while (read && !found && state_ == State::Searching && clock.elapsed() < budgetMs);
     return read;
 }
 
@@ -125,7 +126,7 @@ bool QuickFind::ReadBack(int budgetMs, std::optional<CellPlace>& found)
     bool read = true;
     do {
         const qint64 end = wrapped_ ? start_.record : 0;
-        const qint64 begin = std::max(next_ - kRecordsBack + 1, end);
+        const qint64 begin = std::max(next_ - kRecordsAtOnce + 1, end);
         qint64 record = begin;
         const ReadRange range{.first = begin, .count = next_ - begin + 1, .fields = fields_};
         read = browser_.Recordset().Read(range, [&](std::span<const Cell> cells) {
