@@ -267,5 +267,43 @@ TEST_F(StaticCursor, FindsARecordByItsNumberInEveryOrder)
     EXPECT_EQ(fixed->MoveToRecord(id), Hr::NoCurrentRecord);
 }
 
+// Numbers of both kinds, dates and nothing, in every file that may come: what we sort stands as the engine would
+// put it, ties by the row id.
+TEST_F(StaticCursor, OrdersNumbersAndDatesAsTheEngineDoes)
+{
+    const char* const values[] = {
+        // more than are sorted in one piece, and many that differ late
+        "WITH RECURSIVE s(n) AS (SELECT 1 UNION ALL SELECT n+1 FROM s WHERE n<20000) "
+        "INSERT INTO X SELECT CASE n%4 WHEN 0 THEN n*7919%10007 WHEN 1 THEN n*0.37 "
+        "WHEN 2 THEN 4611686018427387904+n*7919%10007 ELSE date('1999-01-01','+'||(n*31%9000)||' days') END FROM "
+        "s",
+        "INSERT INTO X VALUES(9007199254740993),(9007199254740992.0),(9007199254740994.0),(-0.0),(0),(NULL),"
+        "(9223372036854775807),(9223372036854775807.0),(-9223372036854775807),(-9223372036854775807.0),(1e308),"
+        "(-1e308),(9e999),(-9e999),(1e-300),(-1e-300),(0.1),(NULL),('1899-12-30 "
+        "10:00:00'),('1899-12-30'),(-1),(1)",
+        "INSERT INTO X VALUES('next Tuesday'),(x'00ff')", // the engine sorts all of it
+    };
+    Outside("CREATE TABLE X(V DATETIME)");
+    for (const char* sql : values) {
+        Outside(sql);
+        for (const bool descending : {false, true}) {
+            SCOPED_TRACE(testing::Message() << sql << descending);
+            const QByteArray order = descending ? " DESC" : "";
+            Outside("DROP TABLE IF EXISTS Right; CREATE TABLE Right AS SELECT rowid AS R FROM X ORDER BY V" +
+                    order + ",rowid");
+            const QStringList right = Rows(u"Right"_s);
+            const auto cursor = Open(u"SELECT V FROM X ORDER BY V"_s + QString::fromLatin1(order));
+            std::vector<RecordId> ids;
+            ASSERT_EQ(cursor->Ids(0, right.size(), ids), Hr::Ok);
+            ASSERT_EQ(qsizetype(ids.size()), right.size());
+            for (qsizetype at = 0; at < right.size(); ++at) {
+                qint64 rowId = 0;
+                memcpy(&rowId, ids[size_t(at)].Key().constData(), sizeof rowId);
+                ASSERT_EQ(QString::number(rowId), right[at]) << "at " << at;
+            }
+        }
+    }
+}
+
 } // namespace
 } // namespace mirel

@@ -1,9 +1,10 @@
 #include "provider/sqlite/forward_cursor.h"
 
+#include "provider/sqlite/record_sort.h"
+#include "provider/sqlite/result_rows.h"
 #include "provider/sqlite/row_reader.h"
 #include "provider/sqlite/select_sql.h"
 #include "provider/sqlite/static_cursor.h"
-#include "provider/sqlite/text_sort.h"
 #include "provider/sqlite/transaction.h"
 
 #include <QElapsedTimer>
@@ -40,9 +41,9 @@ Outcome ForwardCursor::FetchBlock()
 
 Outcome ForwardCursor::FetchFirst()
 {
-    if (plan_.keyed && plan_.order.size() == 1 && plan_.order.front().isText) {
+    if (plan_.keyed && plan_.order.size() == 1) {
         bool sorted = false;
-        Outcome outcome = FetchByText(sorted);
+        Outcome outcome = FetchSorted(sorted);
         if (sorted || !outcome.Ok())
             return outcome;
         block_.Clear();
@@ -66,7 +67,7 @@ Outcome ForwardCursor::FetchFirst()
     return file_->OutcomeOf(result);
 }
 
-Outcome ForwardCursor::FetchByText(bool& sorted)
+Outcome ForwardCursor::FetchSorted(bool& sorted)
 {
     const PlannedOrder& order = plan_.order.front();
     SelectPlan unsorted = plan_;
@@ -77,12 +78,12 @@ Outcome ForwardCursor::FetchByText(bool& sorted)
     Statement statement = file_->Prepare(WholeSelect(unsorted), outcome);
     if (!statement)
         return outcome;
-    const int textColumn = int(plan_.fields.size());
+    const int orderColumn = int(plan_.fields.size());
     RowReader reader(plan_.fields, AllFields(plan_.fields), RowReader::Layout::Whole);
-    TextSort sort;
+    RecordSort sort(order);
     int result = statement.Step();
     for (; result == SQLITE_ROW; result = statement.Step()) {
-        if (!sort.Add(block_.Size(), statement.TextView(textColumn)) || block_.Bytes() > kMostKeptBytes)
+        if (!sort.Add(block_.Size(), statement.Get(), orderColumn) || block_.Bytes() > kMostKeptBytes)
             return {};
         block_.Append(reader.Read(statement.Get()));
     }
@@ -90,7 +91,7 @@ Outcome ForwardCursor::FetchByText(bool& sorted)
         return file_->OutcomeOf(result);
     std::vector<qint64> places;
     places.reserve(size_t(block_.Size()));
-    sort.Finish(order.descending, [&places](qint64 place) { places.push_back(place); });
+    sort.HandOver(kNoHurry, [&places](qint64 place) { places.push_back(place); });
     block_.Arrange(places);
     sorted = true;
     return {};

@@ -35,8 +35,8 @@ public:
 private:
     Outcome FetchBlock();
     Outcome FetchFirst();
-    // In the order of one text, by an own sort. `sorted` stays false when it is too much for memory.
-    Outcome FetchByText(bool& sorted);
+    // In the order of one term, by an own sort. `sorted` stays false when it is too much for memory.
+    Outcome FetchSorted(bool& sorted);
     Outcome FetchFurther(const CellSink& keep);
     Outcome Walk(const std::vector<int>& fields, const CellSink& sink);
     Outcome ReadOn(const ReadRange& range, const std::vector<int>& fields, const CellSink& sink);

@@ -3,7 +3,6 @@
 #include "provider/sqlite/row_reader.h"
 #include "provider/sqlite/select_sql.h"
 #include "provider/sqlite/sql_writer.h"
-#include "provider/sqlite/text_sort.h"
 
 #include <QElapsedTimer>
 
@@ -32,11 +31,8 @@ void KeyedRows::Restart()
     keys_.Clear();
     isComplete_ = false;
     gathering_ = Gathering::Unknown;
-}
-
-QByteArray KeyedRows::KeySelect() const
-{
-    return "SELECT " + RowIdList(plan_) + " FROM " + plan_.from + WhereClause(plan_) + KeyedOrder(plan_);
+    sort_.reset();
+    isSorted_ = false;
 }
 
 Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
@@ -46,10 +42,11 @@ Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
         changesBefore_ = sqlite3_total_changes64(file_.Handle());
         outcome = ChooseGathering();
     }
-    if (outcome.Ok() && !isComplete_ && gathering_ == Gathering::Whole)
-        outcome = GatherAll();
     while (outcome.Ok() && !isComplete_ && Known() < wanted) {
-        outcome = GatherSlice();
+        if (gathering_ == Gathering::Sorting)
+            outcome = HandOverSorted(until);
+        else
+            outcome = gathering_ == Gathering::Whole ? GatherAll() : GatherSlice();
         if (until.hasExpired())
             break;
     }
@@ -61,7 +58,9 @@ Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
 Outcome KeyedRows::ChooseGathering()
 {
     gathering_ = Gathering::Whole;
-    if (plan_.sources.size() != 1 || !plan_.order.empty())
+    if (CanSort())
+        sort_ = std::make_unique<RecordSort>(plan_.order.front());
+    else if (plan_.sources.size() != 1 || !plan_.order.empty())
         return {};
     const QByteArray& rowId = plan_.sources.front().rowId;
     Outcome outcome;
@@ -73,7 +72,7 @@ Outcome KeyedRows::ChooseGathering()
         if (!explain || explain.Step() != SQLITE_ROW)
             return outcome;
         const QString detail = explain.Text(kDetail);
-        isScan = detail.startsWith(QStringLiteral("SCAN")) && !detail.contains(QStringLiteral("INDEX"));
+        isScan = detail.startsWith(QStringLiteral("SCAN")) && (sort_ || !detail.contains(QStringLiteral("INDEX")));
     }
     if (!isScan)
         return {};
@@ -93,49 +92,36 @@ Outcome KeyedRows::ChooseGathering()
     return {};
 }
 
+// The columns of a statement that gathers: the row ids, and what is sorted by.
+QByteArray KeyedRows::GatheredColumns() const
+{
+    return RowIdList(plan_) + (sort_ ? ',' + plan_.order.front().expression : QByteArray());
+}
+
 Outcome KeyedRows::GatherAll()
 {
     Outcome outcome;
-    bool sorted = false;
-    if (plan_.sources.size() == 1 && plan_.order.size() == 1 && plan_.order.front().isText)
-        outcome = GatherByText(sorted);
-    if (outcome.Ok() && !sorted) {
-        Statement statement = file_.Prepare(KeySelect(), outcome);
-        if (statement)
-            outcome = Gather(statement);
-    }
-    isComplete_ = outcome.Ok();
-    return outcome;
-}
-
-Outcome KeyedRows::GatherByText(bool& sorted)
-{
-    const PlannedOrder& order = plan_.order.front();
-    Outcome outcome;
-    Statement statement = file_.Prepare("SELECT " + RowIdList(plan_) + ',' + order.expression + " FROM " +
-                                            plan_.from + WhereClause(plan_),
+    Statement statement = file_.Prepare("SELECT " + GatheredColumns() + " FROM " + plan_.from +
+                                            WhereClause(plan_) + (sort_ ? QByteArray() : KeyedOrder(plan_)),
                                         outcome);
     if (!statement)
         return outcome;
-    TextSort sort;
-    int result = statement.Step();
-    for (; result == SQLITE_ROW; result = statement.Step()) {
-        if (!sort.Add(statement.Integer(0), statement.TextView(1)))
-            return {};
+    if (!sort_) {
+        outcome = Gather(statement);
+        isComplete_ = outcome.Ok();
+        return outcome;
     }
-    if (result != SQLITE_DONE)
-        return file_.OutcomeOf(result);
-    sorted = true;
-    bool fit = true;
-    sort.Finish(order.descending, [&](qint64 rowId) { fit = fit && keys_.Append({&rowId, 1}); });
-    return fit ? Outcome() : Outcome{Hr::OutOfMemory, {}};
+    outcome = GatherToSort(statement);
+    if (sort_)
+        gathering_ = Gathering::Sorting;
+    return outcome;
 }
 
 Outcome KeyedRows::GatherSlice()
 {
     const QByteArray& rowId = plan_.sources.front().rowId;
     Outcome outcome;
-    Statement slice = file_.Prepare("SELECT " + rowId + " FROM " + plan_.from +
+    Statement slice = file_.Prepare("SELECT " + GatheredColumns() + " FROM " + plan_.from +
                                         WhereClause(plan_, rowId + " BETWEEN ?1 AND ?2") + " ORDER BY " + rowId,
                                     outcome);
     if (!slice)
@@ -147,16 +133,43 @@ Outcome KeyedRows::GatherSlice()
     slice.Bind(2, end);
     QElapsedTimer timer;
     timer.start();
-    outcome = Gather(slice);
-    if (!outcome.Ok())
+    outcome = sort_ ? GatherToSort(slice) : Gather(slice);
+    if (!outcome.Ok() || gathering_ == Gathering::Whole)
         return outcome;
-    isComplete_ = isLast;
+    isSorted_ = sort_ != nullptr;
+    if (isLast && isSorted_)
+        gathering_ = Gathering::Sorting;
+    else
+        isComplete_ = isLast;
     nextRowId_ = isLast ? end : end + 1;
     if (timer.elapsed() < kSliceMs) // wide gaps between row ids are crossed soon
         sliceWidth_ = std::min(sliceWidth_ * 2, quint64(1) << 62);
     else if (timer.elapsed() > 2 * kSliceMs)
         sliceWidth_ = std::max(sliceWidth_ / 2, kFirstSliceWidth);
     return {};
+}
+
+// What cannot be sorted here is left to the engine, all of it at once.
+Outcome KeyedRows::GatherToSort(Statement& statement)
+{
+    int result = statement.Step();
+    for (; result == SQLITE_ROW; result = statement.Step()) {
+        if (!sort_->Add(statement.Integer(0), statement.Get(), 1)) {
+            sort_.reset();
+            gathering_ = Gathering::Whole;
+            return {};
+        }
+    }
+    return file_.OutcomeOf(result);
+}
+
+Outcome KeyedRows::HandOverSorted(const QDeadlineTimer& until)
+{
+    bool fit = true;
+    isComplete_ = sort_->HandOver(until, [&](qint64 rowId) { fit = fit && keys_.Append({&rowId, 1}); });
+    if (isComplete_)
+        sort_.reset();
+    return fit ? Outcome() : Outcome{Hr::OutOfMemory, {}};
 }
 
 Outcome KeyedRows::Gather(Statement& statement)
@@ -193,11 +206,11 @@ Outcome KeyedRows::Read(const ReadRange& range, const CellSink& sink)
     const CellSink stopping = [&](std::span<const Cell> cells) { return goOn = sink(cells); };
     if (!ShouldRunAgain(range)) {
         const qint64 end = range.count < 0 ? kAllRecords : range.first + range.count;
-        Outcome outcome = Extend(end, QDeadlineTimer(QDeadlineTimer::Forever));
+        Outcome outcome = Extend(end, kNoHurry);
         return outcome.Ok() ? ReadByKeys(range.first, std::min(end, Known()), fields, stopping) : outcome;
     }
     // What slices have found so far is not searched for again.
-    const qint64 known = gathering_ == Gathering::Slices && !isComplete_ ? Known() : 0;
+    const qint64 known = IsPartial() ? Known() : 0;
     Outcome outcome = ReadByKeys(0, known, fields, stopping);
     return outcome.Ok() && goOn ? ReadRest(range, fields, sink) : outcome;
 }
@@ -219,7 +232,7 @@ bool KeyedRows::ShouldRunAgain(const ReadRange& range) const
 
 Outcome KeyedRows::ReadRest(const ReadRange& range, std::span<const int> fields, const CellSink& sink)
 {
-    const bool inSlices = gathering_ == Gathering::Slices && !isComplete_;
+    const bool inSlices = IsPartial();
     const QByteArray& rowId = plan_.sources.front().rowId;
     QByteArray sql = "SELECT " + ColumnList(plan_, fields) + " FROM " + plan_.from +
                      WhereClause(plan_, inSlices ? rowId + ">=?1" : QByteArray());

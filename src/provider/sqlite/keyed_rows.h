@@ -2,6 +2,7 @@
 
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/plan.h"
+#include "provider/sqlite/record_sort.h"
 #include "provider/sqlite/result_rows.h"
 
 namespace mirel::sqlite {
@@ -17,6 +18,7 @@ public:
     Outcome Extend(qint64 wanted, const QDeadlineTimer& until) override;
     qint64 Known() const override { return keys_.Size(); }
     bool IsComplete() const override { return isComplete_; }
+    bool CanBeMadeInSteps() const override { return isComplete_ && isSorted_; }
 
     Outcome KeyAt(qint64 position, RecordKey& key) override;
     Outcome PositionOf(const RecordKey& key, qint64& position) override;
@@ -31,19 +33,23 @@ public:
     BulkRanges RangesFor(int source) const override;
 
 private:
-    // One table without an order, read by row ids from the first to the last: keys can be gathered in slices.
+    // One table in no order or that of one term, read by row ids from the first to the last: keys can be gathered
+    // in slices.
     Outcome ChooseGathering();
+    bool CanSort() const { return plan_.sources.size() == 1 && plan_.order.size() == 1; }
     Outcome GatherAll();
     Outcome GatherSlice();
-    // One table in the order of one text: sorted here. `sorted` stays false when it is too much for memory.
-    Outcome GatherByText(bool& sorted);
     Outcome Gather(Statement& statement);
+    Outcome GatherToSort(Statement& statement);
+    Outcome HandOverSorted(const QDeadlineTimer& until);
     bool ShouldRunAgain(const ReadRange& range) const;
     Outcome ReadRest(const ReadRange& range, std::span<const int> fields, const CellSink& sink);
     Outcome ReadByKeys(qint64 first, qint64 end, std::span<const int> fields, const CellSink& sink);
     // Nothing has changed since: the SELECT would give these very records in this order.
     bool IsFresh() const { return sqlite3_total_changes64(file_.Handle()) == changesBefore_; }
-    QByteArray KeySelect() const;
+    // The first records are known, in the order of their row ids, and the others are not.
+    bool IsPartial() const { return gathering_ == Gathering::Slices && !sort_ && !isComplete_; }
+    QByteArray GatheredColumns() const;
     QByteArray RecordSelect(std::span<const int> fields) const;
 
     DatabaseFile& file_;
@@ -53,9 +59,11 @@ private:
     bool isComplete_ = false;
     qint64 changesBefore_ = 0; // the handle's count of changes when gathering began
 
-    enum class Gathering { Unknown, Whole, Slices };
+    enum class Gathering { Unknown, Whole, Slices, Sorting };
     Gathering gathering_ = Gathering::Unknown;
-    qint64 firstRowId_ = 0; // of a table that is gathered in slices
+    std::unique_ptr<RecordSort> sort_; // while an order is made here; the engine makes the others
+    bool isSorted_ = false;            // here, from a table that was read in slices
+    qint64 firstRowId_ = 0;            // of a table that is gathered in slices
     qint64 nextRowId_ = 0;
     qint64 lastRowId_ = 0;
     quint64 sliceWidth_ = 0;

@@ -34,6 +34,8 @@ public:
     virtual Outcome Extend(qint64 wanted, const QDeadlineTimer& until) = 0;
     virtual qint64 Known() const = 0;
     virtual bool IsComplete() const = 0;
+    // Complete, in an order that Extend makes in short steps.
+    virtual bool CanBeMadeInSteps() const { return false; }
 
     virtual Outcome KeyAt(qint64 position, RecordKey& key) = 0;
     // The keys of the records from `first` to `end`, which is not among them.
@@ -61,5 +63,6 @@ public:
 
 // Everything at once, for callers that cannot do with less.
 inline constexpr qint64 kAllRecords = std::numeric_limits<qint64>::max();
+inline constexpr QDeadlineTimer kNoHurry(QDeadlineTimer::Forever);
 
 } // namespace mirel::sqlite

@@ -13,8 +13,6 @@
 namespace mirel::sqlite {
 namespace {
 
-const QDeadlineTimer kNoHurry(QDeadlineTimer::Forever);
-
 RecordId IdOf(const RecordKey& key)
 {
     return RecordId(

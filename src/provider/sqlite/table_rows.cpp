@@ -135,7 +135,7 @@ Outcome TableRows::PositionOf(const RecordKey& key, qint64& position)
 
 Outcome TableRows::Read(const ReadRange& range, const CellSink& sink)
 {
-    Outcome outcome = Extend(range.first + 1, QDeadlineTimer(QDeadlineTimer::Forever));
+    Outcome outcome = Extend(range.first + 1, kNoHurry);
     if (!outcome.Ok() || range.first >= Known())
         return outcome;
     const std::vector<int> fields = range.fields.empty() ? AllFields(plan_.fields) : range.fields;

@@ -1,0 +1,220 @@
+#include "provider/sqlite/record_sort.h"
+
+#include <QtEndian>
+
+#include <algorithm>
+#include <array>
+#include <bit>
+#include <numeric>
+
+namespace mirel::sqlite {
+namespace {
+
+constexpr size_t kMostBytes = size_t(192) << 20;
+constexpr size_t kMostRecords = size_t(12) << 20;
+constexpr size_t kRecent = 1 << 15;
+
+constexpr size_t kPieceBytes = 8;
+constexpr size_t kMostKeyBytes = 256; // then keys are compared as a whole
+constexpr size_t kFewEntries = 6;
+constexpr size_t kManyEntries = 8192; // more are distributed among buckets first
+constexpr int kBucketBits = 16;
+constexpr size_t kSomeValues = 4096; // in one step
+
+// Eight bytes as a number, zeros behind the key's end.
+quint64 PieceOf(std::string_view key, size_t at)
+{
+    const std::string_view bytes = key.substr(std::min(key.size(), at), kPieceBytes);
+    std::array<char, kPieceBytes> padded{};
+    std::ranges::copy(bytes, padded.begin());
+    return qFromBigEndian<quint64>(padded.data());
+}
+
+} // namespace
+
+bool RecordSort::Store(const OrderKeys::Key& key, quint32& index)
+{
+    if (recent_.empty())
+        recent_.resize(kRecent);
+    const std::string_view whole = key.text.empty() ? key.bytes : key.text;
+    const size_t hash = std::hash<std::string_view>()(whole);
+    Recent& recent = recent_[hash % kRecent];
+    if (recent.index >= 0 && recent.hash == hash) {
+        const Stored& stored = stored_[size_t(recent.index)];
+        if ((key.text.empty() ? KeyOf(stored) : TextOf(stored)) == whole) {
+            index = quint32(recent.index);
+            return true;
+        }
+    }
+    if (arena_.size() + key.bytes.size() + key.text.size() > kMostBytes)
+        return false;
+    index = quint32(stored_.size());
+    stored_.push_back({quint32(arena_.size()), quint32(key.bytes.size()), quint32(key.text.size())});
+    arena_.append(key.bytes).append(key.text);
+    recent = {hash, qint64(index)};
+    return true;
+}
+
+bool RecordSort::Add(qint64 rowId, sqlite3_stmt* row, int column)
+{
+    if (rowIds_.size() + nulls_.size() >= kMostRecords)
+        return false;
+    if (sqlite3_column_type(row, column) == SQLITE_NULL) {
+        nulls_.push_back(rowId);
+        return true;
+    }
+    const std::optional<OrderKeys::Key> key = keys_.KeyOf(row, column);
+    quint32 index = 0;
+    if (!key || !Store(*key, index))
+        return false;
+    rowIds_.push_back(rowId);
+    values_.push_back(index);
+    return true;
+}
+
+void RecordSort::Begin()
+{
+    begun_ = true;
+    entries_.resize(stored_.size());
+    for (size_t i = 0; i < entries_.size(); ++i)
+        entries_[i].stored = quint32(i);
+    ranks_.resize(stored_.size());
+    tasks_.push_back({0, entries_.size(), 0});
+}
+
+void RecordSort::SortWhole(std::span<Entry> entries) const
+{
+    std::ranges::sort(entries, [this](const Entry& a, const Entry& b) {
+        const Stored& left = stored_[a.stored];
+        const Stored& right = stored_[b.stored];
+        const int keys = KeyOf(left).compare(KeyOf(right));
+        return keys != 0 ? keys < 0 : TextOf(left) < TextOf(right);
+    });
+}
+
+void RecordSort::Sort(const Task& task)
+{
+    const std::span<Entry> entries = std::span(entries_).subspan(task.first, task.count);
+    if (task.count <= kFewEntries || task.at >= kMostKeyBytes)
+        return SortWhole(entries);
+    size_t longest = 0;
+    quint64 least = ~quint64(0);
+    quint64 greatest = 0;
+    for (Entry& entry : entries) {
+        const std::string_view key = KeyOf(stored_[entry.stored]);
+        longest = std::max(longest, key.size());
+        entry.piece = PieceOf(key, task.at);
+        least = std::min(least, entry.piece);
+        greatest = std::max(greatest, entry.piece);
+    }
+    if (task.count > kManyEntries && least != greatest)
+        return Distribute(task, least, greatest);
+    if (least != greatest)
+        std::ranges::sort(entries, {}, &Entry::piece);
+    SortEqualPieces(task, longest <= task.at + kPieceBytes);
+}
+
+// By the first sixteen bits in which they differ, into buckets that are sorted later, each by itself.
+void RecordSort::Distribute(const Task& task, quint64 least, quint64 greatest)
+{
+    const int shift = std::max(0, int(std::bit_width(least ^ greatest)) - kBucketBits);
+    const auto bucketOf = [shift](const Entry& entry) {
+        return size_t((entry.piece >> shift) & ((quint64(1) << kBucketBits) - 1));
+    };
+    const std::span<Entry> entries = std::span(entries_).subspan(task.first, task.count);
+    std::vector<size_t> starts((size_t(1) << kBucketBits) + 1);
+    for (const Entry& entry : entries)
+        ++starts[bucketOf(entry) + 1];
+    std::partial_sum(starts.begin(), starts.end(), starts.begin());
+    for (size_t bucket = 0; bucket + 1 < starts.size(); ++bucket) {
+        const size_t count = starts[bucket + 1] - starts[bucket];
+        if (count > 1)
+            tasks_.push_back({task.first + starts[bucket], count, task.at});
+    }
+    scratch_.resize(task.count);
+    for (const Entry& entry : entries)
+        scratch_[starts[bucketOf(entry)]++] = entry;
+    std::ranges::copy(scratch_, entries.begin());
+}
+
+void RecordSort::SortEqualPieces(const Task& task, bool isLast)
+{
+    const std::span<Entry> entries = std::span(entries_).subspan(task.first, task.count);
+    for (size_t from = 0, to = 0; from < entries.size(); from = to) {
+        while (to < entries.size() && entries[to].piece == entries[from].piece)
+            ++to;
+        if (isLast || to - from <= kFewEntries)
+            SortWhole(entries.subspan(from, to - from));
+        else
+            tasks_.push_back({task.first + from, to - from, task.at + kPieceBytes});
+    }
+}
+
+void RecordSort::RankSome()
+{
+    const size_t end = std::min(ranked_ + kSomeValues, entries_.size());
+    for (; ranked_ < end; ++ranked_) {
+        const quint32 stored = entries_[ranked_].stored;
+        if (ranked_ == 0 || !IsSame(stored_[stored], stored_[entries_[ranked_ - 1].stored]))
+            ++different_;
+        ranks_[stored] = quint32(different_ - 1);
+    }
+}
+
+void RecordSort::Place()
+{
+    starts_.resize(different_ + 1);
+    for (const quint32 value : values_)
+        ++starts_[ranks_[value] + 1];
+    std::partial_sum(starts_.begin(), starts_.end(), starts_.begin());
+    std::vector<quint32> next = starts_;
+    sorted_.resize(rowIds_.size());
+    for (size_t i = 0; i < rowIds_.size(); ++i)
+        sorted_[next[ranks_[values_[i]]]++] = rowIds_[i];
+}
+
+void RecordSort::HandSome(const std::function<void(qint64)>& take)
+{
+    const size_t total = different_ + 1;
+    const size_t end = std::min(handed_ + kSomeValues, total);
+    for (; handed_ < end; ++handed_) {
+        const size_t place = descending_ ? total - 1 - handed_ : handed_; // NULL has the first one
+        const std::span<qint64> rowIds =
+            place == 0 ? std::span(nulls_)
+                       : std::span(sorted_).subspan(starts_[place - 1], starts_[place] - starts_[place - 1]);
+        if (!std::ranges::is_sorted(rowIds)) // an index led to them
+            std::ranges::sort(rowIds);
+        std::ranges::for_each(rowIds, take);
+    }
+}
+
+bool RecordSort::HandOver(const QDeadlineTimer& until, const std::function<void(qint64)>& take)
+{
+    if (!begun_)
+        Begin();
+    while (!tasks_.empty()) {
+        const Task task = tasks_.back();
+        tasks_.pop_back();
+        Sort(task);
+        if (until.hasExpired())
+            return false;
+    }
+    while (ranked_ < entries_.size()) {
+        RankSome();
+        if (until.hasExpired())
+            return false;
+    }
+    if (starts_.empty()) {
+        Place();
+        if (until.hasExpired())
+            return false;
+    }
+    while (handed_ <= different_) {
+        HandSome(take);
+        if (until.hasExpired())
+            return handed_ > different_;
+    }
+    return true;
+}
+
+} // namespace mirel::sqlite
