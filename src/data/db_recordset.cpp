@@ -193,6 +193,22 @@ bool DbRecordset::CountStep(int budgetMs)
     return !open_ || cursor_->CountStep(budgetMs);
 }
 
+void DbRecordset::AllowOldOrder(qint64 fromRecords)
+{
+    if (open_)
+        cursor_->AllowOldOrder(fromRecords);
+}
+
+bool DbRecordset::IsBehind() const
+{
+    return open_ && cursor_->IsBehind();
+}
+
+bool DbRecordset::CatchUp(int budgetMs)
+{
+    return !open_ || cursor_->CatchUp(budgetMs);
+}
+
 quint64 DbRecordset::Generation() const
 {
     return open_ ? cursor_->Generation() : 0;

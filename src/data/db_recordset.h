@@ -62,6 +62,10 @@ public:
     qint64 Position() const; // -1 at either end
     bool IsGone() const;     // the current record has been deleted by others
     [[nodiscard]] bool TakeUpChanges(ProviderRecordset::Values values = ProviderRecordset::Values::ReadAgain);
+    // See ProviderRecordset: an order that takes long to make stays the old one for a while.
+    void AllowOldOrder(qint64 fromRecords);
+    bool IsBehind() const;
+    bool CatchUp(int budgetMs);
 
     // See ProviderRecordset: a record's identity in this result and in its table, and the way back to it. False
     // when it is not there.

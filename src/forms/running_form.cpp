@@ -344,6 +344,14 @@ void RunningForm::TakeUpChanges()
     controls_.TouchLists();
 }
 
+bool RunningForm::CatchUp(int budgetMs)
+{
+    if (IsBehind() && !source_.Result().CatchUp(budgetMs))
+        return false;
+    TakeUpChanges();
+    return true;
+}
+
 RunningForm::Outcome RunningForm::GoToFirst()
 {
     return GoToRecord(0);

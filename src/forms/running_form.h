@@ -86,6 +86,10 @@ public:
     // where that is gone, the one behind it is shown. Once something is typed, the record stays as it was shown:
     // its save tells what happened to it.
     void TakeUpChanges();
+    // After a change of a long order it is the old one for a while; CatchUp works on the new one for about
+    // `budgetMs`. True once it is shown.
+    bool IsBehind() const { return HasResult() && source_.Result().IsBehind(); }
+    bool CatchUp(int budgetMs);
 
     // The texts of a list's rows, a QStringList a row, uncut. Fewer than asked for at the end.
     std::vector<QStringList> ListRows(int control, qint64 first, int count);

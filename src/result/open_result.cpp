@@ -76,6 +76,7 @@ bool OpenResult::Execute(const QString& statement)
         Close();
         return false;
     }
+    records_.AllowOldOrder(longOrder_);
     Recount();
     position_ = records_.Position();
     return true;

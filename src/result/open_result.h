@@ -118,6 +118,15 @@ public:
     // is, and its values unless they are kept for an edit that has begun. True when anything may look different.
     bool TakeUpChanges(ProviderRecordset::Values values = ProviderRecordset::Values::ReadAgain);
 
+    // After a change of a long order it is the old one for a while: values are those of now, and records that are
+    // gone leave as soon as they are looked at. CatchUp works on the new order for about `budgetMs`; true once it
+    // is there, to be taken up like others' changes.
+    bool IsBehind() const { return records_.IsBehind(); }
+    bool CatchUp(int budgetMs) { return !isAsking_ && records_.CatchUp(budgetMs); }
+    // How many records make an order long, for results that are opened from now on.
+    static void SetLongOrder(qint64 records) { longOrder_ = records; }
+    static constexpr qint64 kLongOrder = 20'000; // they are sorted in some 50 ms
+
     // The current record as it is shown now.
     SeenRecord Seen();
     QByteArray Fingerprint(); // of that; empty without a record
@@ -224,6 +233,8 @@ private:
     bool UpdateAllNoted(int field, const Value& value, qint64 confirmed, const BulkProgress& progress,
                         ChangeLog::Step& step);
     ChangeLog::Outcome Turn(TurnOfLog turn);
+
+    static inline qint64 longOrder_ = kLongOrder;
 
     DbConnection& connection_;
     DbRecordset records_;

@@ -172,9 +172,21 @@ void RecordBrowser::ChangeSettings(const TableViewSettings& settings)
     FillPage();
 }
 
-bool RecordBrowser::CountOn(int budgetMs)
+bool RecordBrowser::IsSettled() const
 {
-    return working_ ? KnownCount().has_value() : result_.CountOn(budgetMs);
+    return !IsOpen() || (KnownCount() && !result_.IsBehind());
+}
+
+bool RecordBrowser::SettleOn(int budgetMs)
+{
+    if (working_)
+        return IsSettled();
+    if (!result_.IsBehind())
+        return result_.CountOn(budgetMs);
+    if (!result_.CatchUp(budgetMs))
+        return false;
+    TakeUpChanges();
+    return true;
 }
 
 // --- the editor ---------------------------------------------------------------------------------------------

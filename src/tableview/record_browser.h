@@ -86,9 +86,11 @@ public:
         RecordBrowser& browser_;
     };
 
-    // The count, where it is known; CountOn counts on for a while and returns true once it is.
     std::optional<qint64> KnownCount() const { return result_.KnownCount(); }
-    bool CountOn(int budgetMs);
+    // The count is known, and the order is that of now. SettleOn works at it for a while and returns true once
+    // there may be something new to show.
+    bool IsSettled() const;
+    bool SettleOn(int budgetMs);
     bool IsEmpty() const { return result_.KnownCount() == 0; }
 
     // --- the page ---------------------------------------------------------------------------------------

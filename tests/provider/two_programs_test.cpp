@@ -3,6 +3,8 @@
 
 #include <QElapsedTimer>
 
+#include <functional>
+
 namespace mirel {
 namespace {
 
@@ -183,6 +185,145 @@ TEST_F(TwoPrograms, AResultOutlivesItsTableAndColumns)
     for (int i = 0; i < 3000 && !Failed(hr); ++i)
         hr = forward->MoveNext();
     EXPECT_EQ(hr, Hr::NoSuchTable) << "where its first block ends";
+}
+
+// A result in a long order, which is let stand while the new one is made.
+class OldOrder : public TwoPrograms {
+protected:
+    using Values = ProviderRecordset::Values;
+
+    OldOrder() { cursor->AllowOldOrder(1000); }
+
+    void TakeUp(bool isBehind)
+    {
+        ASSERT_EQ(cursor->TakeUpChanges(Values::ReadAgain), Hr::Ok);
+        ASSERT_EQ(cursor->IsBehind(), isBehind);
+    }
+    QStringList Page(qint64 first, qint64 count)
+    {
+        return Read(*cursor, {.first = first, .count = count, .fields = {1}});
+    }
+    // The result is what a new one would be, and the current record has its place in it.
+    void ExpectTheNewOrder()
+    {
+        EXPECT_FALSE(cursor->IsBehind());
+        const QStringList names = Rows(u"SELECT Name FROM T ORDER BY Name"_s);
+        EXPECT_EQ(cursor->RecordCount(), names.size());
+        EXPECT_EQ(Page(0, names.size()), names);
+        if (cursor->Position() >= 0) {
+            EXPECT_EQ(names[cursor->Position()], FieldOf(*cursor, 1).ToText());
+        }
+    }
+
+    std::unique_ptr<ProviderRecordset> cursor = Open(u"SELECT N,Name FROM T ORDER BY Name"_s);
+};
+
+TEST_F(OldOrder, StandsUntilTheNewOneIsMade)
+{
+    const QStringList before = Page(0, 3000);
+    ASSERT_EQ(cursor->MoveTo(10), Hr::Ok);
+    const RecordId current = cursor->Id();
+    other.Run("INSERT INTO T VALUES(0,'a new first');"
+              "UPDATE T SET Name='zz' WHERE Name='" +
+              before[5].toUtf8() +
+              "';"
+              "DELETE FROM T WHERE Name IN('" +
+              before[3].toUtf8() + "','" + before[11].toUtf8() + "')");
+    TakeUp(true);
+    QStringList page = before.first(13);
+    page[5] = u"zz"_s; // its value is that of now, its place the old one
+    page.remove(11);
+    page.remove(3);
+    EXPECT_EQ(Page(0, 11), page);
+    EXPECT_EQ(cursor->Position(), 9);
+    EXPECT_EQ(cursor->Id(), current);
+    ASSERT_EQ(cursor->MoveNext(), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), before[12]);
+    const quint64 generation = cursor->Generation();
+    while (!cursor->CatchUp(1)) {
+    }
+    EXPECT_GT(cursor->Generation(), generation);
+    ExpectTheNewOrder();
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), before[12]);
+}
+
+TEST_F(OldOrder, IsLeftWhereItWouldNotDo)
+{
+    const struct {
+        const char* what;
+        const char* sql;
+        std::function<void()> step;
+    } rows[] = {
+        {"all of it is read", "DELETE FROM T WHERE N%3=0",
+         [this] { EXPECT_EQ(Read(*cursor, {.fields = {1}}), Rows(u"SELECT Name FROM T ORDER BY Name"_s)); }},
+        {"a record that is new is gone to", "INSERT INTO T(rowid,N,Name) VALUES(5000,-1,'name 17b')",
+         [this] {
+             const auto added = Open(u"SELECT N,Name FROM T WHERE N=-1"_s);
+             ASSERT_EQ(cursor->MoveToRecord(added->Id()), Hr::Ok);
+             EXPECT_EQ(FieldOf(*cursor, 1).ToText(), u"name 17b");
+         }},
+        {"many are to be written", "INSERT INTO T VALUES(-2,'name 17c')",
+         [this] {
+             Hr hr = Hr::Ok;
+             const auto transaction = provider->BeginTransaction(path, hr, context);
+             ASSERT_EQ(cursor->TakeUpChanges(Values::Keep), Hr::Ok);
+             std::vector<RecordId> ids;
+             EXPECT_EQ(cursor->Ids(0, 5000, ids), Hr::Ok);
+             EXPECT_EQ(qint64(ids.size()), cursor->RecordCount());
+         }},
+        {"a page of it has been deleted", "DELETE FROM T WHERE Name<'name 2'", [this] { Page(0, 20); }},
+        {"row ids are others", "INSERT INTO T VALUES(-3,'b'); VACUUM",
+         [this] { EXPECT_EQ(cursor->TakeUpChanges(Values::ReadAgain), Hr::Ok); }},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.what);
+        ASSERT_EQ(cursor->MoveTo(7), Hr::Ok);
+        other.Run("INSERT INTO T VALUES(9,'another')");
+        TakeUp(true);
+        other.Run(row.sql);
+        row.step();
+        ExpectTheNewOrder();
+    }
+}
+
+// Writes compare by the record's key, and need no new order.
+TEST_F(OldOrder, TakesOwnChanges)
+{
+    const FieldChange mine{1, Value::Text(u"mine"_s)};
+    const QStringList before = Page(0, 30);
+    other.Run("INSERT INTO T VALUES(0,'a new first'); DELETE FROM T WHERE Name='" + before[25].toUtf8() + '\'');
+    TakeUp(true);
+    ASSERT_EQ(cursor->MoveTo(4), Hr::Ok);
+    EXPECT_EQ(cursor->Update({&mine, 1}), Hr::Ok);
+    ASSERT_EQ(cursor->MoveTo(20), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), before[20]);
+    EXPECT_EQ(cursor->Delete(), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), before[21]);
+    ASSERT_EQ(cursor->MoveTo(24), Hr::Ok) << "the one that is gone is passed over";
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), before[26]);
+    other.Run("UPDATE T SET Name='theirs' WHERE Name='" + before[26].toUtf8() + '\'');
+    EXPECT_EQ(cursor->Update({&mine, 1}), Hr::RecordChanged);
+    EXPECT_EQ(cursor->AddNew({&mine, 1}, {}), Hr::Ok);
+    EXPECT_EQ(FieldOf(*cursor, 1).ToText(), u"mine");
+    EXPECT_TRUE(cursor->IsBehind());
+    const RecordId added = cursor->Id();
+    while (!cursor->CatchUp(1)) {
+    }
+    EXPECT_EQ(cursor->Id(), added);
+    ExpectTheNewOrder();
+}
+
+TEST_F(OldOrder, ComesOnUnderASteadyWriter)
+{
+    for (int i = 0; i < 400 && Page(0, 2).back() != u"a 1"; ++i) {
+        other.Run("INSERT INTO T VALUES(0,'a " + QByteArray::number(i) + "')");
+        TakeUp(true);
+        (void)cursor->CatchUp(1);
+    }
+    EXPECT_EQ(Page(0, 2), (QStringList{u"a 0"_s, u"a 1"_s}));
+    while (!cursor->CatchUp(1)) {
+    }
+    ExpectTheNewOrder();
 }
 
 } // namespace

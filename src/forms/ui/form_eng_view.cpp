@@ -26,6 +26,8 @@ namespace mirel {
 namespace {
 
 constexpr int kClockMs = 1000;
+constexpr int kCatchUpSliceMs = 8;
+constexpr int kCatchUpPauseMs = 2;     // others want to write meanwhile
 constexpr qreal kPreferredScale = 1.4; // forms are laid out for a handheld's pixels
 
 } // namespace
@@ -226,6 +228,10 @@ void CFormEngView::ShowState()
         ShowList();
     ShowActions();
     ShowReason();
+    if (!form_.IsBehind())
+        catchUp_.stop();
+    else if (!catchUp_.isActive())
+        catchUp_.start(kCatchUpPauseMs, this);
 }
 
 void CFormEngView::ShowReason()
@@ -368,12 +374,15 @@ void CFormEngView::changeEvent(QEvent* event)
 
 void CFormEngView::timerEvent(QTimerEvent* event)
 {
-    if (event->timerId() != clock_.timerId()) {
+    if (event->timerId() == clock_.timerId()) {
+        form_.Tick();
+        surface_->ShowState();
+    } else if (event->timerId() == catchUp_.timerId()) {
+        if (form_.CatchUp(kCatchUpSliceMs))
+            ShowState();
+    } else {
         HostedView::timerEvent(event);
-        return;
     }
-    form_.Tick();
-    surface_->ShowState();
 }
 
 } // namespace mirel

@@ -119,6 +119,7 @@ private:
     ErrorLine* error_;
     int refusedControl_ = -1; // that the error is about
     QBasicTimer clock_;
+    QBasicTimer catchUp_;
     int sortedField_ = -1; // of the list, by its header; -1: none
     bool sortedDescending_ = false;
     int lastFocused_ = -1;  // outlives the focus's way through a menu

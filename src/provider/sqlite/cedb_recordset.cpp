@@ -174,6 +174,22 @@ Hr CedbRecordset::TakeUpChanges(Values values)
     return OnCursor([values](ResultCursor& cursor) { return cursor.TakeUpChanges(values); });
 }
 
+void CedbRecordset::AllowOldOrder(qint64 fromRecords)
+{
+    if (HasCursor())
+        cursor_->AllowOldOrder(fromRecords);
+}
+
+bool CedbRecordset::IsBehind() const
+{
+    return HasCursor() && cursor_->IsBehind();
+}
+
+bool CedbRecordset::CatchUp(int budgetMs)
+{
+    return !HasCursor() || cursor_->CatchUp(budgetMs);
+}
+
 qint64 CedbRecordset::Position() const
 {
     return HasCursor() ? cursor_->Position() : -1;

@@ -37,6 +37,9 @@ public:
 
     bool IsGone() const override;
     Hr TakeUpChanges(Values values) override;
+    void AllowOldOrder(qint64 fromRecords) override;
+    bool IsBehind() const override;
+    bool CatchUp(int budgetMs) override;
     Hr MoveFirst() override;
     Hr MoveLast() override;
     Hr MoveNext() override;

@@ -67,6 +67,7 @@ public:
     Outcome CommitTransaction();
     void RollBackTransaction();
     bool IsOutermostTransaction() const { return depth_ == 1; }
+    bool IsWriting() const { return depth_ > 0; }
     // A full disk or a failing device has taken it back already: what is written now would be on its own.
     bool IsTransactionLost() const { return depth_ > 0 && !InTransaction(); }
     // Grows with every change of the file's structure, by anybody.

@@ -28,6 +28,9 @@ public:
     virtual bool IsGone() const { return false; }
     virtual qint64 Position() const = 0;
     virtual Outcome TakeUpChanges(ProviderRecordset::Values) { return {}; }
+    virtual void AllowOldOrder(qint64 /*fromRecords*/) {}
+    virtual bool IsBehind() const { return false; }
+    virtual bool CatchUp(int /*budgetMs*/) { return true; }
     virtual Outcome MoveFirst() = 0;
     virtual Outcome MoveLast() = 0;
     virtual Outcome MoveNext() = 0;

@@ -1,42 +1,26 @@
 #include "provider/sqlite/static_cursor.h"
 
-#include "provider/sqlite/bulk_change.h"
-#include "provider/sqlite/keyed_rows.h"
 #include "provider/sqlite/row_reader.h"
-#include "provider/sqlite/table_rows.h"
-#include "provider/sqlite/transaction.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
-#include <cstring>
+
+// Positions and reading; what is written is in static_cursor_writes.cpp.
 
 namespace mirel::sqlite {
 namespace {
 
-RecordId IdOf(const RecordKey& key)
-{
-    return RecordId(
-        QByteArray(reinterpret_cast<const char*>(key.constData()), key.size() * qsizetype(sizeof(qint64))));
-}
+// In an old order: so many records are looked up one by one, and so many that are gone leave it one by one.
+constexpr qint64 kMostOnPage = 1024;
+constexpr int kMostDropped = 256;
 
-// None: it is not the key of a record of so many tables.
-std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables)
-{
-    const QByteArray& bytes = id.Key();
-    if (bytes.isEmpty() || size_t(bytes.size()) != tables * sizeof(qint64))
-        return {};
-    RecordKey key(qsizetype(tables), kNoRow);
-    memcpy(key.data(), bytes.constData(), size_t(bytes.size()));
-    return key;
-}
+} // namespace
 
-const Outcome& Gone()
+const Outcome& StaticCursor::GoneOutcome()
 {
     static const Outcome kGone{Hr::NoCurrentRecord, StringText(Str::RecordIsGone)};
     return kGone;
 }
-
-} // namespace
 
 StaticCursor::StaticCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan)
     : file_(std::move(file))
@@ -47,36 +31,6 @@ StaticCursor::StaticCursor(std::shared_ptr<DatabaseFile> file, SelectPlan plan)
     const QString& name = plan_.sources[size_t(plan_.updatableSource)].table;
     if (const dialect::Table* table = file_->Schema().FindTable(name))
         writer_.emplace(*file_, *table, plan_.fields);
-}
-
-template <typename Work>
-Outcome StaticCursor::InRead(Work work)
-{
-    ReadTransaction transaction(*file_);
-    Outcome outcome = transaction.Begin();
-    if (outcome.Ok())
-        outcome = work();
-    const Outcome ended = transaction.End();
-    return outcome.Ok() ? ended : outcome;
-}
-
-// What is compared within cannot change before it is written. Inside a transaction of the caller's, that one
-// serves.
-template <typename Work>
-Outcome StaticCursor::InWrite(Work work)
-{
-    if (file_->IsTransactionLost())
-        return {Hr::Unexpected, StringText(Str::BulkRunUndone, {file_->Path()})};
-    Outcome outcome = file_->BeginTransaction();
-    if (!outcome.Ok())
-        return outcome;
-    outcome = work();
-    if (!outcome.Ok() && file_->IsOutermostTransaction()) {
-        file_->RollBackTransaction();
-        return outcome;
-    }
-    const Outcome committed = file_->CommitTransaction();
-    return outcome.Ok() ? committed : outcome;
 }
 
 Outcome StaticCursor::Open()
@@ -90,11 +44,8 @@ Outcome StaticCursor::Open()
         } else if (!HasTables()) {
             return {Hr::NoSuchTable, {}};
         }
-        if (plan_.sources.size() == 1 && plan_.where.isEmpty() && plan_.order.empty())
-            rows_ = std::make_unique<TableRows>(*file_, plan_);
-        else
-            rows_ = std::make_unique<KeyedRows>(*file_, plan_);
-        if (Outcome outcome = ReadVersion(version_); !outcome.Ok())
+        positions_.emplace(*file_, plan_);
+        if (Outcome outcome = positions_->Begin(!kept_); !outcome.Ok())
             return outcome;
         return Settle(0);
     });
@@ -108,44 +59,26 @@ bool StaticCursor::HasTables() const
     });
 }
 
-quint64 StaticCursor::OwnVersion() const
-{
-    quint64 version = 0;
-    for (const PlannedSource& source : plan_.sources)
-        version += file_->TableVersion(source.table);
-    return version;
-}
-
-Outcome StaticCursor::ReadVersion(Version& version)
-{
-    version = {};
-    if (kept_) // rows of their own, which nobody changes
-        return {};
-    version.own = OwnVersion();
-    version.values = file_->ValuesVersion();
-    Outcome outcome;
-    Statement statement = file_->Prepare("PRAGMA data_version", outcome);
-    if (!statement)
-        return outcome;
-    const int result = statement.Step();
-    if (result == SQLITE_ROW)
-        version.data = statement.Integer(0);
-    return file_->OutcomeOf(result);
-}
-
+// Positions are made again, and the current record is looked for among them. Its values stay what they were when
+// they were asked for: a write compares them.
 Outcome StaticCursor::TakeUpChanges()
 {
-    Version now;
-    Outcome outcome = ReadVersion(now);
-    if (!outcome.Ok() || now == version_)
+    using Change = RecordPositions::Change;
+    Change change = Change::None;
+    Outcome outcome = positions_->Look(change);
+    if (!outcome.Ok() || change == Change::None)
         return outcome;
-    valuesAged_ = !values_.empty();
-    const bool haveRecordsMoved = now.data != version_.data || now.own != version_.own;
-    if (haveRecordsMoved)
-        return Restart();
-    version_ = now;
     ++generation_;
-    return {};
+    valuesAged_ = !values_.empty();
+    if (change == Change::Values)
+        return {};
+    return positions_->IsBehind() ? KeepPlace() : FindCurrent();
+}
+
+// An old order will do for what is compared by its key.
+Outcome StaticCursor::TakeUpForOneRecord()
+{
+    return positions_->IsBehind() ? Outcome() : TakeUpChanges();
 }
 
 Outcome StaticCursor::TakeUpChanges(ProviderRecordset::Values values)
@@ -159,14 +92,30 @@ Outcome StaticCursor::TakeUpChanges(ProviderRecordset::Values values)
     return outcome;
 }
 
-// Positions are made again, and the current record is looked for among them. Its values stay what they were when
-// they were asked for: a write compares them.
-Outcome StaticCursor::Restart()
+Outcome StaticCursor::TakeUpEverything()
 {
-    rows_->Restart();
     ++generation_;
-    Outcome outcome = ReadVersion(version_);
-    return outcome.Ok() && (place_ == Place::On || place_ == Place::Gone) ? FindCurrent() : outcome;
+    Outcome outcome = positions_->Renew();
+    return outcome.Ok() ? FindCurrent() : outcome;
+}
+
+bool StaticCursor::CatchUp(int budgetMs)
+{
+    if (!positions_->IsBehind())
+        return true;
+    const Outcome outcome = InRead([this, budgetMs] {
+        bool isNew = false;
+        Outcome step = TakeUpChanges();
+        if (step.Ok() && positions_->IsBehind())
+            step = positions_->CatchUp(QDeadlineTimer(budgetMs), isNew);
+        if (!step.Ok() || !isNew)
+            return step;
+        ++generation_;
+        return FindCurrent();
+    });
+    if (!outcome.Ok())
+        positions_->GiveUp();
+    return !positions_->IsBehind();
 }
 
 // Row ids are given again when a file is compacted: where the structure is another, a record with the same one but
@@ -182,22 +131,66 @@ bool StaticCursor::IsAnotherRecord()
 // A record that is gone keeps the place where it was, and may come back there: by an undo elsewhere.
 Outcome StaticCursor::FindCurrent()
 {
+    if (place_ != Place::On && place_ != Place::Gone)
+        return {};
     qint64 position = -1;
     Outcome outcome = CountAll();
     if (outcome.Ok())
-        outcome = rows_->PositionOf(key_, position);
+        outcome = Rows().PositionOf(key_, position);
     if (!outcome.Ok())
         return outcome;
     if (position >= 0 && IsAnotherRecord())
         position = -1;
     place_ = position >= 0 ? Place::On : Place::Gone;
-    position_ = position >= 0 ? position : std::min(position_, rows_->Known());
+    position_ = position >= 0 ? position : std::min(position_, Rows().Known());
+    return {};
+}
+
+// In an old order the current record has its place, as long as it is there.
+Outcome StaticCursor::KeepPlace()
+{
+    if (place_ != Place::On)
+        return {};
+    bool isThere = false;
+    Outcome outcome = positions_->Holds(key_, isThere);
+    if (!outcome.Ok() || isThere)
+        return outcome;
+    Rows().Remove(position_, key_);
+    place_ = Place::Gone;
+    return {};
+}
+
+// In an old order: what is at these positions afterwards is there.
+Outcome StaticCursor::DropDeleted(qint64 first, qint64 count)
+{
+    int dropped = 0;
+    for (qint64 position = first; position < std::min(first + count, Rows().Known());) {
+        RecordKey key;
+        bool isThere = false;
+        Outcome outcome = Rows().KeyAt(position, key);
+        if (outcome.Ok())
+            outcome = positions_->Holds(key, isThere);
+        if (!outcome.Ok())
+            return outcome;
+        if (isThere) {
+            ++position;
+            continue;
+        }
+        if (++dropped > kMostDropped)
+            return TakeUpEverything();
+        ++generation_;
+        Rows().Remove(position, key);
+        if (position == position_ && place_ == Place::On)
+            place_ = Place::Gone;
+        else if (position < position_)
+            --position_;
+    }
     return {};
 }
 
 Outcome StaticCursor::CountAll()
 {
-    return rows_->Extend(kAllRecords, kNoHurry);
+    return Rows().Extend(kAllRecords, kNoHurry);
 }
 
 Outcome StaticCursor::Recount()
@@ -215,15 +208,17 @@ Outcome StaticCursor::Settle(qint64 position)
         place_ = Place::Before;
         return {};
     }
-    Outcome outcome = rows_->Extend(position + 1, kNoHurry);
+    Outcome outcome = Rows().Extend(position + 1, kNoHurry);
+    if (outcome.Ok() && positions_->IsBehind())
+        outcome = DropDeleted(position, 1);
     if (!outcome.Ok())
         return outcome;
-    if (position >= rows_->Known()) {
+    if (position >= Rows().Known()) {
         place_ = Place::Behind;
         return {};
     }
     RecordKey key;
-    outcome = rows_->KeyAt(position, key);
+    outcome = Rows().KeyAt(position, key);
     if (!outcome.Ok())
         return outcome;
     place_ = Place::On;
@@ -235,18 +230,18 @@ Outcome StaticCursor::Settle(qint64 position)
 qint64 StaticCursor::RecordCount()
 {
     (void)Recount();
-    return rows_->Known();
+    return Rows().Known();
 }
 
 bool StaticCursor::CountStep(int budgetMs)
 {
     if (budgetMs < 0)
-        return rows_->IsComplete();
+        return Rows().IsComplete();
     const Outcome outcome = InRead([this, budgetMs] {
         Outcome taken = TakeUpChanges();
-        return taken.Ok() ? rows_->Extend(kAllRecords, QDeadlineTimer(budgetMs)) : taken;
+        return taken.Ok() ? Rows().Extend(kAllRecords, QDeadlineTimer(budgetMs)) : taken;
     });
-    return !outcome.Ok() || rows_->IsComplete(); // a file that fails is not asked for ever
+    return !outcome.Ok() || Rows().IsComplete(); // a file that fails is not asked for ever
 }
 
 Outcome StaticCursor::MoveTo(qint64 position)
@@ -265,7 +260,7 @@ Outcome StaticCursor::MoveLast()
             outcome = CountAll();
         if (!outcome.Ok())
             return outcome;
-        return Settle(rows_->Known() > 0 ? rows_->Known() - 1 : 0);
+        return Settle(Rows().Known() > 0 ? Rows().Known() - 1 : 0);
     });
 }
 
@@ -289,7 +284,7 @@ Outcome StaticCursor::MovePrevious()
             outcome = CountAll();
         if (!outcome.Ok() || place_ == Place::Before)
             return outcome;
-        return Settle((place_ == Place::Behind ? rows_->Known() : position_) - 1);
+        return Settle((place_ == Place::Behind ? Rows().Known() : position_) - 1);
     });
 }
 
@@ -311,10 +306,10 @@ Outcome StaticCursor::Ids(qint64 first, qint64 count, std::vector<RecordId>& ids
     if (kept_)
         return {Hr::NotImplemented, {}};
     return InRead([&] {
-        Outcome outcome = rows_->Extend(first + count, kNoHurry);
+        Outcome outcome = Rows().Extend(first + count, kNoHurry);
         std::vector<RecordKey> keys;
-        if (outcome.Ok() && first < rows_->Known())
-            outcome = rows_->KeysBetween(first, std::min(first + count, rows_->Known()), keys);
+        if (outcome.Ok() && first < Rows().Known())
+            outcome = Rows().KeysBetween(first, std::min(first + count, Rows().Known()), keys);
         std::ranges::transform(keys, std::back_inserter(ids), IdOf);
         return outcome;
     });
@@ -328,8 +323,8 @@ Outcome StaticCursor::ReadRecords(std::span<const RecordId> ids, const RecordSin
         for (size_t i = 0; i < ids.size() && outcome.Ok(); ++i) {
             const std::optional<RecordKey> key = kept_ ? std::nullopt : KeyOf(ids[i], plan_.sources.size());
             if (!key)
-                return Gone();
-            outcome = rows_->ReadRecord(*key, fields, [&](std::span<const Cell> cells) {
+                return GoneOutcome();
+            outcome = Rows().ReadRecord(*key, fields, [&](std::span<const Cell> cells) {
                 sink(i, cells);
                 return false;
             });
@@ -338,32 +333,51 @@ Outcome StaticCursor::ReadRecords(std::span<const RecordId> ids, const RecordSin
     });
 }
 
+// A record that is gone still has its position there, and one that is new has none.
+Outcome StaticCursor::FindInOldOrder(const RecordKey& key, qint64& position)
+{
+    bool isThere = false;
+    Outcome outcome = positions_->Holds(key, isThere);
+    if (outcome.Ok() && isThere && position < 0) {
+        outcome = TakeUpEverything();
+        if (outcome.Ok())
+            outcome = CountAll();
+        if (outcome.Ok())
+            outcome = Rows().PositionOf(key, position);
+    }
+    if (!isThere)
+        position = -1;
+    return outcome;
+}
+
 Outcome StaticCursor::MoveToRecord(const RecordId& id)
 {
     const std::optional<RecordKey> key = KeyOf(id, plan_.sources.size());
     if (kept_ || !key)
-        return Gone();
+        return GoneOutcome();
     return InRead([this, &key] {
         qint64 position = -1;
         Outcome outcome = TakeUpChanges();
         if (outcome.Ok())
             outcome = CountAll();
         if (outcome.Ok())
-            outcome = rows_->PositionOf(*key, position);
+            outcome = Rows().PositionOf(*key, position);
+        if (outcome.Ok() && positions_->IsBehind())
+            outcome = FindInOldOrder(*key, position);
         if (!outcome.Ok() || position < 0)
-            return outcome.Ok() ? Gone() : outcome;
+            return outcome.Ok() ? GoneOutcome() : outcome;
         return Settle(position);
     });
 }
 
 Outcome StaticCursor::ReadCurrent(std::span<const int> fields, std::vector<Value>& values)
 {
-    Outcome outcome = rows_->ReadRecord(key_, fields, [&](std::span<const Cell> cells) {
+    Outcome outcome = Rows().ReadRecord(key_, fields, [&](std::span<const Cell> cells) {
         for (size_t i = 0; i < cells.size(); ++i)
             values.push_back(ValueOfCell(cells[i], plan_.fields[size_t(fields[i])].type));
         return false;
     });
-    return outcome.Ok() && values.empty() ? Gone() : outcome;
+    return outcome.Ok() && values.empty() ? GoneOutcome() : outcome;
 }
 
 Outcome StaticCursor::LoadRecord()
@@ -376,33 +390,12 @@ Outcome StaticCursor::LoadRecord()
     });
 }
 
-// Inside a write transaction: the current record is there, and `fields` of it hold what GetValue gave. Once the
-// file's structure is another, row ids may be others too: then all fields are compared.
-Outcome StaticCursor::CheckCurrent(std::span<const int> fields)
-{
-    if (place_ != Place::On)
-        return Gone();
-    if (values_.empty())
-        return {};
-    const std::vector<int> all = AllFields(plan_.fields);
-    if (structureOfValues_ != file_->SchemaVersion())
-        fields = all;
-    std::vector<Value> now;
-    if (Outcome outcome = ReadCurrent(fields, now); !outcome.Ok())
-        return outcome;
-    for (size_t i = 0; i < fields.size(); ++i) {
-        if (now[i] != values_[size_t(fields[i])])
-            return {Hr::RecordChanged, StringText(Str::RecordIsChanged)};
-    }
-    return {};
-}
-
 Outcome StaticCursor::GetValue(int field, Value& value)
 {
     if (place_ != Place::On && place_ != Place::Gone)
         return {Hr::NoCurrentRecord, {}};
     if (values_.empty()) {
-        if (Outcome outcome = place_ == Place::On ? LoadRecord() : Gone(); !outcome.Ok())
+        if (Outcome outcome = place_ == Place::On ? LoadRecord() : GoneOutcome(); !outcome.Ok())
             return outcome;
     }
     value = values_[size_t(field)];
@@ -415,150 +408,12 @@ Outcome StaticCursor::Read(const ReadRange& range, const CellSink& sink)
         return {};
     return InRead([&] {
         Outcome outcome = TakeUpChanges();
-        return outcome.Ok() ? rows_->Read(range, sink) : outcome;
+        if (outcome.Ok() && positions_->IsBehind()) {
+            const bool isPage = range.count >= 0 && range.count <= kMostOnPage;
+            outcome = isPage ? DropDeleted(range.first, range.count) : TakeUpEverything();
+        }
+        return outcome.Ok() ? Rows().Read(range, sink) : outcome;
     });
-}
-
-// After a change of ours that the rows already know of. What another program has committed since is still to come.
-void StaticCursor::AdoptOwnChange()
-{
-    version_.own = OwnVersion();
-    version_.values = file_->ValuesVersion();
-    ++generation_;
-    values_.clear();
-}
-
-Outcome StaticCursor::AddNew(std::span<const FieldChange> values, const RecordId& preferred)
-{
-    const std::optional<RecordKey> wanted = KeyOf(preferred, 1);
-    RecordKey key(plan_.sources.size(), kNoRow);
-    Outcome outcome = Recount(); // before the lock is taken: it can take its time
-    if (outcome.Ok()) {
-        outcome = InWrite([&] {
-            Outcome taken = TakeUpChanges();
-            if (taken.Ok())
-                taken = CountAll();
-            const std::optional<qint64> rowId = wanted ? std::optional((*wanted)[0]) : std::nullopt;
-            return taken.Ok() ? writer_->Add(values, rowId, key[plan_.updatableSource]) : taken;
-        });
-    }
-    if (!outcome.Ok())
-        return outcome;
-    place_ = Place::On;
-    key_ = key;
-    values_.clear();
-    if (!rows_->Append(key))
-        return InRead([this] { return Restart(); });
-    position_ = rows_->Known() - 1;
-    AdoptOwnChange();
-    return {};
-}
-
-Outcome StaticCursor::Update(std::span<const FieldChange> values)
-{
-    if (place_ != Place::On && place_ != Place::Gone)
-        return {Hr::NoCurrentRecord, {}};
-    qint64 rowId = RowIdOfCurrent();
-    std::vector<int> fields;
-    for (const FieldChange& change : values)
-        fields.push_back(change.field);
-    const Outcome outcome = InWrite([&] {
-        Outcome checked = TakeUpChanges();
-        if (checked.Ok())
-            checked = CheckCurrent(fields);
-        return checked.Ok() ? writer_->Update(values, rowId) : checked;
-    });
-    if (!outcome.Ok())
-        return outcome;
-    values_.clear();
-    ++generation_;
-    version_.values = file_->ValuesVersion();
-    if (rowId == RowIdOfCurrent())
-        return {};
-    RowIdOfCurrent() = rowId;
-    return InRead([this] { return Restart(); });
-}
-
-Outcome StaticCursor::Delete()
-{
-    if (place_ != Place::On && place_ != Place::Gone)
-        return {Hr::NoCurrentRecord, {}};
-    Outcome outcome = Recount();
-    if (!outcome.Ok())
-        return outcome;
-    outcome = InWrite([&] {
-        Outcome checked = TakeUpChanges();
-        if (checked.Ok())
-            checked = CountAll();
-        if (checked.Ok())
-            checked = CheckCurrent(AllFields(plan_.fields));
-        return checked.Ok() ? writer_->Delete(RowIdOfCurrent()) : checked;
-    });
-    if (!outcome.Ok())
-        return outcome;
-    rows_->Remove(position_, key_);
-    AdoptOwnChange();
-    return InRead([this] { return Settle(position_); });
-}
-
-// Inside the transaction that is to change them: no more records than were asked about.
-Outcome StaticCursor::CheckCount(qint64 confirmed)
-{
-    Outcome outcome = TakeUpChanges();
-    if (outcome.Ok())
-        outcome = CountAll();
-    if (outcome.Ok() && confirmed >= 0 && rows_->Known() > confirmed)
-        return {Hr::RecordChanged, StringText(Str::ResultHasGrown)};
-    return outcome;
-}
-
-// A refused record leaves those before it written: the change keeps them itself, and says so by its outcome.
-Outcome StaticCursor::UpdateAll(int field, const Value& value, qint64 confirmed, const BulkProgress& progress)
-{
-    Outcome changed;
-    const Outcome outcome = InWrite([&] {
-        Outcome checked = CheckCount(confirmed);
-        if (!checked.Ok())
-            return checked;
-        const BulkRanges ranges = rows_->RangesFor(plan_.updatableSource);
-        BulkChange change(*file_, *writer_, plan_.sources[size_t(plan_.updatableSource)].alias);
-        changed = change.Update(ranges, {field, value}, progress);
-        return Outcome();
-    });
-    if (!outcome.Ok())
-        return changed.Ok() ? outcome : changed;
-    AdoptOwnChange();
-    if (writer_->MovesRecords(field)) {
-        file_->NoteChange(writer_->TableName());
-        const Outcome restarted = InRead([this] { return Restart(); });
-        if (changed.Ok())
-            return restarted;
-    }
-    return changed;
-}
-
-Outcome StaticCursor::DeleteAll(qint64 confirmed, const BulkProgress& progress)
-{
-    Outcome changed;
-    const PlannedSource& source = plan_.sources[size_t(plan_.updatableSource)];
-    const Outcome outcome = InWrite([&] {
-        Outcome checked = CheckCount(confirmed);
-        if (!checked.Ok())
-            return checked;
-        BulkChange change(*file_, *writer_, source.alias);
-        changed = change.Delete(rows_->RangesFor(plan_.updatableSource), progress);
-        return Outcome();
-    });
-    if (!outcome.Ok())
-        return changed.Ok() ? outcome : changed;
-    file_->NoteChange(source.table);
-    place_ = Place::Before;
-    values_.clear();
-    const Outcome restarted = InRead([this] {
-        Outcome begun = Restart();
-        return begun.Ok() ? Settle(0) : begun;
-    });
-    return changed.Ok() ? restarted : changed;
 }
 
 } // namespace mirel::sqlite

@@ -3,9 +3,10 @@
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/kept_result.h"
 #include "provider/sqlite/plan.h"
+#include "provider/sqlite/record_positions.h"
 #include "provider/sqlite/record_writer.h"
 #include "provider/sqlite/result_cursor.h"
-#include "provider/sqlite/result_rows.h"
+#include "provider/sqlite/transaction.h"
 
 #include <memory>
 #include <optional>
@@ -31,6 +32,9 @@ public:
     bool IsGone() const override { return place_ == Place::Gone; }
     qint64 Position() const override { return place_ == Place::On ? position_ : -1; }
     Outcome TakeUpChanges(ProviderRecordset::Values values) override;
+    void AllowOldOrder(qint64 fromRecords) override { positions_->AllowOldOrder(fromRecords); }
+    bool IsBehind() const override { return positions_->IsBehind(); }
+    bool CatchUp(int budgetMs) override;
     Outcome MoveFirst() override { return MoveTo(0); }
     Outcome MoveLast() override;
     Outcome MoveNext() override;
@@ -55,25 +59,29 @@ public:
 private:
     enum class Place { Before, On, Gone, Behind };
 
-    // What the records looked like when positions were last made.
-    struct Version {
-        qint64 data = 0;    // other programs
-        quint64 own = 0;    // this one, through anybody: records that came or went
-        quint64 values = 0; // and values
-        friend bool operator==(const Version&, const Version&) = default;
-    };
-
+    static const Outcome& GoneOutcome();
     template <typename Work>
-    Outcome InRead(Work work);
+    Outcome InRead(Work work)
+    {
+        ReadTransaction transaction(*file_);
+        Outcome outcome = transaction.Begin();
+        if (outcome.Ok())
+            outcome = work();
+        const Outcome ended = transaction.End();
+        return outcome.Ok() ? ended : outcome;
+    }
     template <typename Work>
     Outcome InWrite(Work work);
     bool HasTables() const;
-    quint64 OwnVersion() const;
-    Outcome ReadVersion(Version& version);
+    ResultRows& Rows() const { return positions_->Rows(); }
     Outcome TakeUpChanges();
-    Outcome Restart();
+    Outcome TakeUpForOneRecord();
+    Outcome TakeUpEverything();
     bool IsAnotherRecord();
     Outcome FindCurrent();
+    Outcome KeepPlace();
+    Outcome DropDeleted(qint64 first, qint64 count);
+    Outcome FindInOldOrder(const RecordKey& key, qint64& position);
     Outcome Settle(qint64 position);
     Outcome CountAll();
     Outcome Recount(); // all, as they are now
@@ -87,9 +95,8 @@ private:
     std::shared_ptr<DatabaseFile> file_;
     SelectPlan plan_;
     std::optional<KeptResult> kept_;
-    std::unique_ptr<ResultRows> rows_;
+    std::optional<RecordPositions> positions_;
     std::optional<RecordWriter> writer_;
-    Version version_;
     quint64 generation_ = 0;
 
     Place place_ = Place::Before;

@@ -24,7 +24,8 @@
 namespace mirel {
 namespace {
 
-constexpr int kCountSliceMs = 8;
+constexpr int kSettleSliceMs = 8;
+constexpr int kSettlePauseMs = 2; // others want to write meanwhile
 constexpr int kWriteErrorDelayMs = 1;
 
 } // namespace
@@ -145,8 +146,8 @@ void CTableView::ConnectParts()
     });
     connect(strip_, &CellStrip::typedOverResult, this, [this](const QString& text) { Edit(&text); });
     connect(error_, &ErrorLine::restoreRequested, this, [this] { Do(Command::RevertEdit); });
-    connect(&countTimer_, &QTimer::timeout, this, [this] {
-        if (browser_.CountOn(kCountSliceMs))
+    connect(&settleTimer_, &QTimer::timeout, this, [this] {
+        if (browser_.SettleOn(kSettleSliceMs))
             ShowState();
     });
     // Other programs may have changed the records while the user was there.
@@ -310,10 +311,10 @@ void CTableView::ShowState()
         Q_EMIT typed();
     grid_->setAccessibleDescription(StringText(
         Str::CellDescription, {browser_.FieldLabel(), browser_.SelectedText(), browser_.CounterText()}));
-    if (browser_.IsOpen() && !browser_.KnownCount())
-        countTimer_.start(0);
+    if (browser_.IsSettled())
+        settleTimer_.stop();
     else
-        countTimer_.stop();
+        settleTimer_.start(kSettlePauseMs);
 }
 
 // The words of what was typed; else, where the store has refused it, those of the store.

@@ -136,7 +136,7 @@ private:
     FindLine* findLine_ = nullptr;
     FilterBar* filters_ = nullptr;
     NavigationRow* navigation_ = nullptr;
-    QTimer countTimer_;
+    QTimer settleTimer_;
     bool zoomed_ = false;
     bool hadEdit_ = false; // when it was shown last
     bool refused_ = false; // the error stands beside the editor, until the edit ends
