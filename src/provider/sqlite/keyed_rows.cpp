@@ -50,6 +50,8 @@ Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
         if (until.hasExpired())
             break;
     }
+    if (!outcome.Ok()) // a slice may have been taken in part
+        Restart();
     return outcome;
 }
 

@@ -37,37 +37,36 @@ std::string_view TextOf(sqlite3_stmt* row, int column)
 
 } // namespace
 
-OrderKeys::Key OrderKeys::NumberKey(double rounded, quint16 rest)
+std::string_view OrderKeys::NumberKey(double rounded, quint16 rest)
 {
     number_[0] = kNumberMark;
     qToBigEndian(OrderedBits(rounded), &number_[1]);
     qToBigEndian(rest, &number_[1 + sizeof(quint64)]);
-    return {.bytes = {number_.data(), number_.size()}};
+    return {number_.data(), number_.size()};
 }
 
-std::optional<OrderKeys::Key> OrderKeys::KeyOf(sqlite3_stmt* row, int column)
+std::optional<std::string_view> OrderKeys::BytesOf(sqlite3_stmt* row, int column)
 {
-    if (isText_) {
-        const std::string_view text = TextOf(row, column);
-        const std::span<const uint8_t> key = texts_.KeyOf(text);
-        return Key{{reinterpret_cast<const char*>(key.data()), key.size()}, text};
-    }
-    switch (sqlite3_column_type(row, column)) {
-    case SQLITE_INTEGER: {
+    if (isText_)
+        return TextOf(row, column);
+    const int type = sqlite3_column_type(row, column);
+    if (type == SQLITE_INTEGER) {
         const qint64 number = sqlite3_column_int64(row, column);
         const double rounded = RoundedDown(number);
         return NumberKey(rounded, quint16(number - qint64(rounded)));
     }
-    case SQLITE_FLOAT:
+    if (type == SQLITE_FLOAT)
         return NumberKey(sqlite3_column_double(row, column), 0);
-    case SQLITE_TEXT: {
-        // Digits and marks, which every collation orders by their bytes; all of them are behind kNumberMark.
-        const std::string_view text = TextOf(row, column);
-        return HasStoredDateForm(text) ? std::optional(Key{text}) : std::nullopt;
-    }
-    default:
-        return {};
-    }
+    // Digits and marks, which every collation orders by their bytes; all of them are behind kNumberMark.
+    if (type == SQLITE_TEXT && HasStoredDateForm(TextOf(row, column)))
+        return TextOf(row, column);
+    return {};
+}
+
+std::string_view OrderKeys::KeyOf(std::string_view text)
+{
+    const std::span<const uint8_t> key = texts_.KeyOf(text);
+    return {reinterpret_cast<const char*>(key.data()), key.size()};
 }
 
 } // namespace mirel::sqlite

@@ -10,28 +10,27 @@
 
 namespace mirel::sqlite {
 
-// The values of one term of an order as bytes that compare as the values do. Texts stand as the user's language
-// orders them, ties by the exact text; numbers and stored dates as the engine orders them.
+// The values of one term of an order, as bytes by which they are told apart, and as keys that compare byte by byte
+// as the values do. Texts stand as the user's language orders them, and keys of different texts may be the same;
+// numbers and stored dates stand as the engine orders them, and their bytes are their keys.
 class OrderKeys {
 public:
-    struct Key {
-        std::string_view bytes;
-        std::string_view text{}; // decides where the bytes are the same
-    };
-
     explicit OrderKeys(bool isText)
         : isText_(isText)
     {
     }
 
+    bool IsText() const { return isText_; }
     // Of a value that is not NULL; borrowed until the next call or step. None: only the engine knows its place.
-    std::optional<Key> KeyOf(sqlite3_stmt* row, int column);
+    std::optional<std::string_view> BytesOf(sqlite3_stmt* row, int column);
+    // Of a text; borrowed until the next call.
+    std::string_view KeyOf(std::string_view text);
 
 private:
     // A mark of the kind, the number rounded down, and what was cut off.
     static constexpr size_t kNumberSize = 1 + sizeof(quint64) + sizeof(quint16);
 
-    Key NumberKey(double rounded, quint16 rest);
+    std::string_view NumberKey(double rounded, quint16 rest);
 
     bool isText_;
     SortKeys texts_;

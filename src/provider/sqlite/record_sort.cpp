@@ -32,25 +32,23 @@ quint64 PieceOf(std::string_view key, size_t at)
 
 } // namespace
 
-bool RecordSort::Store(const OrderKeys::Key& key, quint32& index)
+bool RecordSort::Store(std::string_view bytes, quint32& index)
 {
     if (recent_.empty())
         recent_.resize(kRecent);
-    const std::string_view whole = key.text.empty() ? key.bytes : key.text;
-    const size_t hash = std::hash<std::string_view>()(whole);
+    const size_t hash = std::hash<std::string_view>()(bytes);
     Recent& recent = recent_[hash % kRecent];
-    if (recent.index >= 0 && recent.hash == hash) {
-        const Stored& stored = stored_[size_t(recent.index)];
-        if ((key.text.empty() ? KeyOf(stored) : TextOf(stored)) == whole) {
-            index = quint32(recent.index);
-            return true;
-        }
+    if (recent.index >= 0 && recent.hash == hash && BytesOf(stored_[size_t(recent.index)]) == bytes) {
+        index = quint32(recent.index);
+        return true;
     }
-    if (arena_.size() + key.bytes.size() + key.text.size() > kMostBytes)
+    const std::string_view text = keys_.IsText() ? bytes : std::string_view();
+    const std::string_view key = keys_.IsText() ? keys_.KeyOf(text) : bytes;
+    if (arena_.size() + key.size() + text.size() > kMostBytes)
         return false;
     index = quint32(stored_.size());
-    stored_.push_back({quint32(arena_.size()), quint32(key.bytes.size()), quint32(key.text.size())});
-    arena_.append(key.bytes).append(key.text);
+    stored_.push_back({quint32(arena_.size()), quint32(key.size()), quint32(text.size())});
+    arena_.append(key).append(text);
     recent = {hash, qint64(index)};
     return true;
 }
@@ -63,9 +61,9 @@ bool RecordSort::Add(qint64 rowId, sqlite3_stmt* row, int column)
         nulls_.push_back(rowId);
         return true;
     }
-    const std::optional<OrderKeys::Key> key = keys_.KeyOf(row, column);
+    const std::optional<std::string_view> bytes = keys_.BytesOf(row, column);
     quint32 index = 0;
-    if (!key || !Store(*key, index))
+    if (!bytes || !Store(*bytes, index))
         return false;
     rowIds_.push_back(rowId);
     values_.push_back(index);
@@ -155,7 +153,7 @@ void RecordSort::RankSome()
     const size_t end = std::min(ranked_ + kSomeValues, entries_.size());
     for (; ranked_ < end; ++ranked_) {
         const quint32 stored = entries_[ranked_].stored;
-        if (ranked_ == 0 || !IsSame(stored_[stored], stored_[entries_[ranked_ - 1].stored]))
+        if (ranked_ == 0 || BytesOf(stored_[stored]) != BytesOf(stored_[entries_[ranked_ - 1].stored]))
             ++different_;
         ranks_[stored] = quint32(different_ - 1);
     }

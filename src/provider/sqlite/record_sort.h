@@ -35,7 +35,7 @@ public:
     bool HandOver(const QDeadlineTimer& until, const std::function<void(qint64 rowId)>& take);
 
 private:
-    // A value in the arena: its key, then its text.
+    // A value in the arena: its key, then, of a text, itself.
     struct Stored {
         quint32 at = 0;
         quint32 keySize = 0;
@@ -51,26 +51,25 @@ private:
         size_t count;
         size_t at;
     };
-    // By a hash of the key. The hash is kept, so that a key is looked at only where it is likely the same. Of
+    // By a hash of the value. The hash is kept, so that a value is looked at only where it is likely the same. Of
     // many different values some are stored twice.
     struct Recent {
         size_t hash = 0;
         qint64 index = -1; // in stored_; -1: none
     };
 
-    bool Store(const OrderKeys::Key& key, quint32& index);
+    bool Store(std::string_view bytes, quint32& index);
+    std::string_view BytesOf(const Stored& stored) const
+    {
+        return keys_.IsText() ? TextOf(stored) : KeyOf(stored);
+    }
     std::string_view KeyOf(const Stored& stored) const
     {
         return std::string_view(arena_).substr(stored.at, stored.keySize);
     }
-    // Empty unless texts are sorted; then equal texts have equal keys.
     std::string_view TextOf(const Stored& stored) const
     {
         return std::string_view(arena_).substr(stored.at + stored.keySize, stored.textSize);
-    }
-    bool IsSame(const Stored& a, const Stored& b) const
-    {
-        return TextOf(a) == TextOf(b) && (a.textSize > 0 || KeyOf(a) == KeyOf(b));
     }
 
     void Begin();

@@ -72,7 +72,10 @@ Outcome StaticCursor::TakeUpChanges()
     valuesAged_ = !values_.empty();
     if (change == Change::Values)
         return {};
-    return positions_->IsBehind() ? KeepPlace() : FindCurrent();
+    outcome = positions_->IsBehind() ? KeepPlace() : FindCurrent();
+    if (!outcome.Ok())
+        positions_->GiveUp();
+    return outcome;
 }
 
 // An old order will do for what is compared by its key.
