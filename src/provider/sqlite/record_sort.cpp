@@ -18,8 +18,9 @@ constexpr size_t kPieceBytes = 8;
 constexpr size_t kMostKeyBytes = 256; // then keys are compared as a whole
 constexpr size_t kFewEntries = 6;
 constexpr size_t kManyEntries = 8192; // more are distributed among buckets first
-constexpr int kBucketBits = 16;
+constexpr int kBucketBits = 12;
 constexpr size_t kSomeValues = 4096; // in one step
+constexpr size_t kSomeRecords = 65'536;
 
 // Eight bytes as a number, zeros behind the key's end.
 quint64 PieceOf(std::string_view key, size_t at)
@@ -44,11 +45,14 @@ bool RecordSort::Store(std::string_view bytes, quint32& index)
     }
     const std::string_view text = keys_.IsText() ? bytes : std::string_view();
     const std::string_view key = keys_.IsText() ? keys_.KeyOf(text) : bytes;
-    if (arena_.size() + key.size() + text.size() > kMostBytes)
+    bytes_ += key.size() + text.size();
+    if (bytes_ > kMostBytes)
         return false;
+    char* const place = static_cast<char*>(arena_.allocate(key.size() + text.size(), 1));
+    std::ranges::copy(text, std::ranges::copy(key, place).out);
     index = quint32(stored_.size());
-    stored_.push_back({quint32(arena_.size()), quint32(key.size()), quint32(text.size())});
-    arena_.append(key).append(text);
+    stored_.push_back({place, quint32(key.size()), quint32(text.size())});
+    entries_.push_back({PieceOf(key, 0), index});
     recent = {hash, qint64(index)};
     return true;
 }
@@ -70,16 +74,6 @@ bool RecordSort::Add(qint64 rowId, sqlite3_stmt* row, int column)
     return true;
 }
 
-void RecordSort::Begin()
-{
-    begun_ = true;
-    entries_.resize(stored_.size());
-    for (size_t i = 0; i < entries_.size(); ++i)
-        entries_[i].stored = quint32(i);
-    ranks_.resize(stored_.size());
-    tasks_.push_back({0, entries_.size(), 0});
-}
-
 void RecordSort::SortWhole(std::span<Entry> entries) const
 {
     std::ranges::sort(entries, [this](const Entry& a, const Entry& b) {
@@ -88,6 +82,13 @@ void RecordSort::SortWhole(std::span<Entry> entries) const
         const int keys = KeyOf(left).compare(KeyOf(right));
         return keys != 0 ? keys < 0 : TextOf(left) < TextOf(right);
     });
+}
+
+void RecordSort::SortNext()
+{
+    const Task task = tasks_.back();
+    tasks_.pop_back();
+    Sort(task);
 }
 
 void RecordSort::Sort(const Task& task)
@@ -99,9 +100,10 @@ void RecordSort::Sort(const Task& task)
     quint64 least = ~quint64(0);
     quint64 greatest = 0;
     for (Entry& entry : entries) {
-        const std::string_view key = KeyOf(stored_[entry.stored]);
-        longest = std::max(longest, key.size());
-        entry.piece = PieceOf(key, task.at);
+        const Stored& stored = stored_[entry.stored];
+        longest = std::max(longest, size_t(stored.keySize));
+        if (task.at > 0)
+            entry.piece = PieceOf(KeyOf(stored), task.at);
         least = std::min(least, entry.piece);
         greatest = std::max(greatest, entry.piece);
     }
@@ -112,7 +114,7 @@ void RecordSort::Sort(const Task& task)
     SortEqualPieces(task, longest <= task.at + kPieceBytes);
 }
 
-// By the first sixteen bits in which they differ, into buckets that are sorted later, each by itself.
+// By the first bits in which they differ, into buckets that are sorted later, each by itself.
 void RecordSort::Distribute(const Task& task, quint64 least, quint64 greatest)
 {
     const int shift = std::max(0, int(std::bit_width(least ^ greatest)) - kBucketBits);
@@ -129,10 +131,14 @@ void RecordSort::Distribute(const Task& task, quint64 least, quint64 greatest)
         if (count > 1)
             tasks_.push_back({task.first + starts[bucket], count, task.at});
     }
-    scratch_.resize(task.count);
+    if (scratch_.size() < task.count)
+        scratch_.resize(task.count);
     for (const Entry& entry : entries)
         scratch_[starts[bucketOf(entry)]++] = entry;
-    std::ranges::copy(scratch_, entries.begin());
+    if (task.count == entries_.size())
+        entries_.swap(scratch_);
+    else
+        std::ranges::copy(std::span(scratch_).first(task.count), entries.begin());
 }
 
 void RecordSort::SortEqualPieces(const Task& task, bool isLast)
@@ -159,16 +165,23 @@ void RecordSort::RankSome()
     }
 }
 
-void RecordSort::Place()
+// From here on the values are not needed any more.
+void RecordSort::CountRanks()
 {
+    arena_.release();
     starts_.resize(different_ + 1);
     for (const quint32 value : values_)
         ++starts_[ranks_[value] + 1];
     std::partial_sum(starts_.begin(), starts_.end(), starts_.begin());
-    std::vector<quint32> next = starts_;
+    next_ = starts_;
     sorted_.resize(rowIds_.size());
-    for (size_t i = 0; i < rowIds_.size(); ++i)
-        sorted_[next[ranks_[values_[i]]]++] = rowIds_[i];
+}
+
+void RecordSort::PlaceSome()
+{
+    const size_t end = std::min(placed_ + kSomeRecords, rowIds_.size());
+    for (; placed_ < end; ++placed_)
+        sorted_[next_[ranks_[values_[placed_]]]++] = rowIds_[placed_];
 }
 
 void RecordSort::HandSome(const std::function<void(qint64)>& take)
@@ -186,33 +199,43 @@ void RecordSort::HandSome(const std::function<void(qint64)>& take)
     }
 }
 
+// Each turn is a step; a stage begins with a step of its own.
 bool RecordSort::HandOver(const QDeadlineTimer& until, const std::function<void(qint64)>& take)
 {
-    if (!begun_)
-        Begin();
-    while (!tasks_.empty()) {
-        const Task task = tasks_.back();
-        tasks_.pop_back();
-        Sort(task);
-        if (until.hasExpired())
-            return false;
-    }
-    while (ranked_ < entries_.size()) {
-        RankSome();
-        if (until.hasExpired())
-            return false;
-    }
-    if (starts_.empty()) {
-        Place();
-        if (until.hasExpired())
-            return false;
-    }
-    while (handed_ <= different_) {
-        HandSome(take);
-        if (until.hasExpired())
-            return handed_ > different_;
-    }
-    return true;
+    do {
+        switch (stage_) {
+        case Stage::Adding:
+            ranks_.resize(stored_.size());
+            tasks_.push_back({0, entries_.size(), 0});
+            stage_ = Stage::Sorting;
+            break;
+        case Stage::Sorting:
+            SortNext();
+            if (tasks_.empty())
+                stage_ = Stage::Ranking;
+            break;
+        case Stage::Ranking:
+            RankSome();
+            if (ranked_ == entries_.size())
+                stage_ = Stage::Counting;
+            break;
+        case Stage::Counting:
+            CountRanks();
+            stage_ = Stage::Placing;
+            break;
+        case Stage::Placing:
+            PlaceSome();
+            if (placed_ == rowIds_.size())
+                stage_ = Stage::Handing;
+            break;
+        case Stage::Handing:
+            HandSome(take);
+            if (handed_ > different_)
+                return true;
+            break;
+        }
+    } while (!until.hasExpired());
+    return false;
 }
 
 } // namespace mirel::sqlite

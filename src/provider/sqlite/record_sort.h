@@ -7,8 +7,8 @@
 #include <QtGlobal>
 
 #include <functional>
+#include <memory_resource>
 #include <span>
-#include <string>
 #include <string_view>
 #include <vector>
 
@@ -31,13 +31,13 @@ public:
     [[nodiscard]] bool Add(qint64 rowId, sqlite3_stmt* row, int column);
 
     // Once all are added: sorts them, then hands over all row ids in their order, each once. False when the time
-    // was over before; a step takes some ten milliseconds for a million records at most.
+    // was over before. The longest of its steps go through all different values once, without a look at them.
     bool HandOver(const QDeadlineTimer& until, const std::function<void(qint64 rowId)>& take);
 
 private:
     // A value in the arena: its key, then, of a text, itself.
     struct Stored {
-        quint32 at = 0;
+        const char* key = nullptr;
         quint32 keySize = 0;
         quint32 textSize = 0;
     };
@@ -59,46 +59,46 @@ private:
     };
 
     bool Store(std::string_view bytes, quint32& index);
+    static std::string_view KeyOf(const Stored& stored) { return {stored.key, stored.keySize}; }
+    static std::string_view TextOf(const Stored& stored) { return {stored.key + stored.keySize, stored.textSize}; }
     std::string_view BytesOf(const Stored& stored) const
     {
         return keys_.IsText() ? TextOf(stored) : KeyOf(stored);
     }
-    std::string_view KeyOf(const Stored& stored) const
-    {
-        return std::string_view(arena_).substr(stored.at, stored.keySize);
-    }
-    std::string_view TextOf(const Stored& stored) const
-    {
-        return std::string_view(arena_).substr(stored.at + stored.keySize, stored.textSize);
-    }
 
-    void Begin();
+    void SortNext();
     void Sort(const Task& task);
     void Distribute(const Task& task, quint64 least, quint64 greatest);
     void SortEqualPieces(const Task& task, bool isLast);
     void SortWhole(std::span<Entry> entries) const;
     void RankSome();
-    void Place();
+    void CountRanks();
+    void PlaceSome();
     void HandSome(const std::function<void(qint64)>& take);
 
     OrderKeys keys_;
     bool descending_;
-    std::string arena_;
+    std::pmr::monotonic_buffer_resource arena_;
+    size_t bytes_ = 0; // in the arena
     std::vector<Stored> stored_;
     std::vector<Recent> recent_;
     std::vector<qint64> rowIds_;
     std::vector<quint32> values_; // of each row id: index in stored_
     std::vector<qint64> nulls_;
 
-    // Where the sorting is: all entries, what is still to be sorted, and how many of them have their rank.
-    bool begun_ = false;
-    std::vector<Entry> entries_;
+    // How far it is: the entries, what of them is still to be sorted, how many have their rank, how many records
+    // their place, and how much has been handed over.
+    enum class Stage { Adding, Sorting, Ranking, Counting, Placing, Handing };
+    Stage stage_ = Stage::Adding;
+    std::vector<Entry> entries_; // at first with the first piece of their keys
     std::vector<Entry> scratch_;
     std::vector<Task> tasks_;
     size_t ranked_ = 0;
     std::vector<quint32> ranks_; // of each stored value: its place among the different ones
     size_t different_ = 0;
     std::vector<quint32> starts_; // of each different value: where its records begin in sorted_
+    std::vector<quint32> next_;   // where the next one of them goes
+    size_t placed_ = 0;
     std::vector<qint64> sorted_;
     size_t handed_ = 0; // of the different values and the NULLs, which count as one
 };
