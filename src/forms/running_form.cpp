@@ -125,6 +125,7 @@ void RunningForm::ShowRecord(FormControls::Edits edits)
 {
     fingerprint_.clear();
     controls_.ShowRecord(source_, edits);
+    source_.Result().Hold(); // also where no control had to read it again
 }
 
 void RunningForm::ShowResult(FormControls::Edits edits)

@@ -116,10 +116,10 @@ public:
     enum class Values { Keep, ReadAgain };
     [[nodiscard]] virtual Hr TakeUpChanges(Values values) = 0;
 
-    // For a window, until the result is closed: where others' changes ask for a sort of at least so many records,
-    // the order stays the old one for now, and the recordset is behind. Values are those of now, and records that
-    // are gone leave as soon as they are looked at; new ones, and new places, are still to come. Within a
-    // transaction, and to read a whole result, a recordset that is behind takes up everything first.
+    // For a window, until the result is closed: where others' changes ask for a new search or sort among so many
+    // records, the order stays the old one for now, and the recordset is behind. Values are those of now, and
+    // records that are gone leave as soon as they are looked at; new ones, and new places, are still to come.
+    // Within a transaction, and to read a whole result, a recordset that is behind takes up everything first.
     virtual void AllowOldOrder(qint64 fromRecords) = 0;
     virtual bool IsBehind() const = 0;
     // Works on the new order for about `budgetMs`. True once the recordset is not behind any more; all positions

@@ -342,6 +342,12 @@ bool OpenResult::TakeUpChanges(ProviderRecordset::Values values)
     return true;
 }
 
+void OpenResult::Hold()
+{
+    if (IsOpen() && position_ >= 0 && !IsGone())
+        (void)records_.FieldValue(0);
+}
+
 SeenRecord OpenResult::Seen()
 {
     SeenRecord seen{records_.Id(), {}};

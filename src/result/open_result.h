@@ -127,6 +127,8 @@ public:
     static void SetLongOrder(qint64 records) { longOrder_ = records; }
     static constexpr qint64 kLongOrder = 20'000; // they are sorted in some 50 ms
 
+    // Reads the current record's values, so that later writes and questions are about those.
+    void Hold();
     // The current record as it is shown now.
     SeenRecord Seen();
     QByteArray Fingerprint(); // of that; empty without a record

@@ -187,6 +187,19 @@ TEST_F(TwoPrograms, AResultOutlivesItsTableAndColumns)
     EXPECT_EQ(hr, Hr::NoSuchTable) << "where its first block ends";
 }
 
+// The other compacts the file, and the key of the record that is shown goes to its neighbor.
+TEST_F(TwoPrograms, AMoveToTheSameRecordKeepsWhatWasShown)
+{
+    const auto cursor = Open(u"T"_s);
+    other.Run("DELETE FROM T WHERE N<3");
+    ASSERT_EQ(cursor->MoveTo(1), Hr::Ok);
+    ASSERT_EQ(FieldOf(*cursor, 0).ToInt(), 4);
+    ASSERT_EQ(cursor->MoveTo(1), Hr::Ok);
+    other.Run("VACUUM");
+    EXPECT_EQ(FieldOf(*cursor, 0).ToInt(), 4);
+    EXPECT_EQ(cursor->Delete(), Hr::NoCurrentRecord);
+}
+
 // A result in a long order, which is let stand while the new one is made.
 class OldOrder : public TwoPrograms {
 protected:
@@ -311,6 +324,21 @@ TEST_F(OldOrder, TakesOwnChanges)
     }
     EXPECT_EQ(cursor->Id(), added);
     ExpectTheNewOrder();
+}
+
+TEST_F(OldOrder, OfASearchStandsAsWell)
+{
+    cursor = Open(u"SELECT N,Name FROM T WHERE Name LIKE '%1%'"_s);
+    cursor->AllowOldOrder(1000);
+    const qint64 before = cursor->RecordCount();
+    other.Run(
+        "DELETE FROM T WHERE N=10; INSERT INTO T(rowid,N,Name) VALUES(-5,0,'a 1'); DELETE FROM T WHERE N=13");
+    TakeUp(true);
+    EXPECT_EQ(Page(0, 4), (QStringList{u"name 1"_s, u"name 11"_s, u"name 12"_s, u"name 14"_s}));
+    while (!cursor->CatchUp(1)) {
+    }
+    EXPECT_EQ(Page(0, 2), (QStringList{u"a 1"_s, u"name 1"_s}));
+    EXPECT_EQ(cursor->RecordCount(), before - 1);
 }
 
 TEST_F(OldOrder, ComesOnUnderASteadyWriter)

@@ -32,7 +32,12 @@ void KeyedRows::Restart()
     isComplete_ = false;
     gathering_ = Gathering::Unknown;
     sort_.reset();
-    isSorted_ = false;
+    isInSlices_ = false;
+}
+
+bool KeyedRows::IsMadeInSteps(qint64 fromRowIds) const
+{
+    return isComplete_ && isInSlices_ && quint64(lastRowId_) - quint64(firstRowId_) >= quint64(fromRowIds);
 }
 
 Outcome KeyedRows::Extend(qint64 wanted, const QDeadlineTimer& until)
@@ -138,8 +143,8 @@ Outcome KeyedRows::GatherSlice()
     outcome = sort_ ? GatherToSort(slice) : Gather(slice);
     if (!outcome.Ok() || gathering_ == Gathering::Whole)
         return outcome;
-    isSorted_ = sort_ != nullptr;
-    if (isLast && isSorted_)
+    isInSlices_ = true;
+    if (isLast && sort_)
         gathering_ = Gathering::Sorting;
     else
         isComplete_ = isLast;
@@ -159,6 +164,7 @@ Outcome KeyedRows::GatherToSort(Statement& statement)
         if (!sort_->Add(statement.Integer(0), statement.Get(), 1)) {
             sort_.reset();
             gathering_ = Gathering::Whole;
+            isInSlices_ = false;
             return {};
         }
     }

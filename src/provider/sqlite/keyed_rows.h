@@ -18,7 +18,7 @@ public:
     Outcome Extend(qint64 wanted, const QDeadlineTimer& until) override;
     qint64 Known() const override { return keys_.Size(); }
     bool IsComplete() const override { return isComplete_; }
-    bool CanBeMadeInSteps() const override { return isComplete_ && isSorted_; }
+    bool IsMadeInSteps(qint64 fromRowIds) const override;
 
     Outcome KeyAt(qint64 position, RecordKey& key) override;
     Outcome PositionOf(const RecordKey& key, qint64& position) override;
@@ -62,7 +62,7 @@ private:
     enum class Gathering { Unknown, Whole, Slices, Sorting };
     Gathering gathering_ = Gathering::Unknown;
     std::unique_ptr<RecordSort> sort_; // while an order is made here; the engine makes the others
-    bool isSorted_ = false;            // here, from a table that was read in slices
+    bool isInSlices_ = false;          // the table was read
     qint64 firstRowId_ = 0;            // of a table that is gathered in slices
     qint64 nextRowId_ = 0;
     qint64 lastRowId_ = 0;

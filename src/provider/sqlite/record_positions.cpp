@@ -52,8 +52,7 @@ Outcome RecordPositions::ReadVersion(Version& version) const
 
 bool RecordPositions::MayStayOld() const
 {
-    return rows_->Known() >= oldFrom_ && rows_->CanBeMadeInSteps() && !file_.IsWriting() &&
-           file_.SchemaVersion() == structure_;
+    return rows_->IsMadeInSteps(oldFrom_) && !file_.IsWriting() && file_.SchemaVersion() == structure_;
 }
 
 Outcome RecordPositions::Look(Change& change)

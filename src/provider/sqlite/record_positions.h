@@ -11,7 +11,8 @@ namespace mirel::sqlite {
 // Which record of a result stands where, and for which state of the file that was found out. The caller holds the
 // read transaction.
 //
-// Where it is allowed, a long order stays the old one after a change, while the new one is made in steps.
+// Where it is allowed, a result that takes a long search or sort stays the old one after a change, while the new
+// one is made in steps.
 class RecordPositions {
 public:
     // What somebody has changed since the last look: values alone, or which records there are and where.
@@ -65,7 +66,7 @@ private:
     std::unique_ptr<ResultRows> rows_;
     Version version_; // at the last look
 
-    qint64 oldFrom_ = std::numeric_limits<qint64>::max(); // so many records may stay in an old order
+    qint64 oldFrom_ = std::numeric_limits<qint64>::max(); // among so many row ids
     qint64 structure_ =
         -1; // of the file, where an old order is allowed: row ids mean the same as long as it is that
     std::unique_ptr<ResultRows> coming_; // what the rows will be

@@ -34,8 +34,8 @@ public:
     virtual Outcome Extend(qint64 wanted, const QDeadlineTimer& until) = 0;
     virtual qint64 Known() const = 0;
     virtual bool IsComplete() const = 0;
-    // Complete, in an order that Extend makes in short steps.
-    virtual bool CanBeMadeInSteps() const { return false; }
+    // Complete, after a search or a sort among so many row ids that can be made again in short steps.
+    virtual bool IsMadeInSteps(qint64 /*fromRowIds*/) const { return false; }
 
     virtual Outcome KeyAt(qint64 position, RecordKey& key) = 0;
     // The keys of the records from `first` to `end`, which is not among them.

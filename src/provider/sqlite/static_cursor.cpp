@@ -204,26 +204,26 @@ Outcome StaticCursor::Recount()
     });
 }
 
+// To the same record once more is no move: its values stay those that were shown, unless others changed it.
 Outcome StaticCursor::Settle(qint64 position)
 {
-    values_.clear();
-    if (position < 0) {
-        place_ = Place::Before;
-        return {};
-    }
     Outcome outcome = Rows().Extend(position + 1, kNoHurry);
-    if (outcome.Ok() && positions_->IsBehind())
+    if (outcome.Ok() && position >= 0 && positions_->IsBehind())
         outcome = DropDeleted(position, 1);
+    const bool isOnRecord = position >= 0 && position < Rows().Known();
+    RecordKey key;
+    if (outcome.Ok() && isOnRecord)
+        outcome = Rows().KeyAt(position, key);
     if (!outcome.Ok())
         return outcome;
-    if (position >= Rows().Known()) {
-        place_ = Place::Behind;
+    if (!isOnRecord || place_ != Place::On || key != key_ || valuesAged_) {
+        values_.clear();
+        valuesAged_ = false;
+    }
+    if (!isOnRecord) {
+        place_ = position < 0 ? Place::Before : Place::Behind;
         return {};
     }
-    RecordKey key;
-    outcome = Rows().KeyAt(position, key);
-    if (!outcome.Ok())
-        return outcome;
     place_ = Place::On;
     position_ = position;
     key_ = std::move(key);
