@@ -143,6 +143,36 @@ TEST_F(BulkWrites, ChangeExactlyTheRecordsOfTheResult)
     EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount - 300);
 }
 
+// The records are those that were asked about, whatever meets the condition by now.
+TEST_F(BulkWrites, TouchNothingThatTheResultDoesNotHold)
+{
+    for (const bool deletes : {false, true}) {
+        Run(u"UPDATE T SET Small=0"_s);
+        Run(u"UPDATE T SET Small=1 WHERE Whole<=10"_s);
+        const auto change = [&](ProviderRecordset& cursor, qint64 confirmed) {
+            return deletes ? cursor.DeleteAll(confirmed, {})
+                           : cursor.UpdateAll(0, Value::Text(u"all"_s), confirmed, {});
+        };
+        const QString source = u"SELECT Name FROM T WHERE Small=1"_s;
+        EXPECT_EQ(change(*Open(source), 9), Hr::RecordChanged) << "more than were asked about";
+        EXPECT_EQ(Count(u"Name='all'"_s), u"0"_s);
+        EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount);
+
+        const auto cursor = Open(source);
+        ASSERT_EQ(cursor->RecordCount(), 10);
+        const auto other = Open(u"T"_s);
+        for (const auto& [position, small] : {std::pair(0, 0), std::pair(100, 1)}) {
+            ASSERT_EQ(other->MoveTo(position), Hr::Ok);
+            const FieldChange value{Small, Value::SmallInt(qint16(small))};
+            ASSERT_EQ(other->Update({&value, 1}), Hr::Ok);
+        }
+        EXPECT_EQ(change(*cursor, 10), Hr::Ok);
+        EXPECT_EQ(Count(u"Whole=101 AND Name='x1'"_s), u"1"_s) << "it came to meet the condition since";
+        EXPECT_EQ(Count(deletes ? u"Whole<=10"_s : u"Whole<=10 AND Name<>'all'"_s), u"0"_s);
+        Run(u"UPDATE T SET Name='x' WHERE Name='all'"_s);
+    }
+}
+
 TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
 {
     const auto cursor = Open(u"T"_s);

@@ -205,6 +205,19 @@ TEST_F(OpenResultTest, UndoGoesOnWhereARefusalStoppedIt)
     EXPECT_EQ(Stored(), u"x1 y2 z3 d4"_s);
 }
 
+TEST_F(OpenResultTest, UndoLeavesAloneWhatOthersChangedSince)
+{
+    ASSERT_TRUE(result.Open(u"T"_s));
+    ASSERT_EQ(RenameMany(result.SeenFrom(0, 3), {u"x"_s, u"y"_s, u"z"_s}).records, 3);
+    Do(u"UPDATE T SET Name='theirs' WHERE N=1"_s);
+    Do(u"UPDATE T SET N=20 WHERE N=2"_s);
+    Do(u"DELETE FROM T WHERE N=3"_s);
+    EXPECT_TRUE(result.Undo().done);
+    EXPECT_EQ(Stored(), u"theirs1 d4 b20"_s) << "the name alone was changed here";
+    EXPECT_EQ(prompt.shown.size(), 1);
+    EXPECT_FALSE(result.CanUndo());
+}
+
 TEST_F(OpenResultTest, UndoBringsBackNoRecordThatIsStillThere)
 {
     Outside("WITH RECURSIVE s(n) AS (SELECT 5 UNION ALL SELECT n+1 FROM s WHERE n<3000) "
