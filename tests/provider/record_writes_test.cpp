@@ -101,6 +101,27 @@ TEST_F(RecordWrites, NeedAResultThatCanBeUpdated)
     EXPECT_EQ(Open(u"SELECT Whole+1,Name FROM T"_s)->Update({&computed, 1}), Hr::ReadOnly) << "an expression";
 }
 
+// A full disk takes back all that the transaction wrote. What is written behind that must not stay alone.
+TEST_F(RecordWrites, EndWhereTheirTransactionWasTakenBack)
+{
+    provider->CloseDatabase(path);
+    const SmallDisk disk(16);
+    const auto cursor = Open(u"T"_s);
+    Hr result = Hr::Ok;
+    auto whole = provider->BeginTransaction(path, result, context);
+    ASSERT_TRUE(whole);
+    const FieldChange large{Memo, Value::Text(QString(20'000, u'x'))};
+    Hr written = Hr::Ok;
+    for (int i = 0; i < 20 && written == Hr::Ok; ++i)
+        written = cursor->AddNew({&large, 1}, {});
+    ASSERT_EQ(written, Hr::DiskFull);
+    EXPECT_TRUE(Failed(cursor->AddNew({}, {})));
+    EXPECT_TRUE(Failed(whole->Commit()));
+    EXPECT_TRUE(Rows(u"SELECT Name FROM T"_s).isEmpty());
+    Add(*cursor, {});
+    EXPECT_EQ(Rows(u"SELECT Name FROM T"_s).size(), 1) << "the next one is another matter";
+}
+
 class BulkWrites : public RecordWrites {
 protected:
     static constexpr int kCount = 3000;
