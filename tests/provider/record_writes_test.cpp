@@ -409,6 +409,17 @@ TEST_F(Appending, LeavesNothingWithoutCommit)
         ASSERT_EQ(appender->Append(cells), Hr::Ok);
     }
     EXPECT_TRUE(Rows(u"SELECT Name FROM T"_s).isEmpty());
+    {
+        Hr result = Hr::Ok;
+        const auto whole = provider->BeginTransaction(path, result, context);
+        {
+            const auto appender = Appender({u"Name"_s});
+            ASSERT_EQ(appender->Append(cells), Hr::Ok);
+        }
+        Run(u"INSERT INTO T (Name) VALUES ('b')"_s);
+        ASSERT_EQ(whole->Commit(), Hr::Ok);
+    }
+    EXPECT_EQ(Rows(u"SELECT Name FROM T"_s), QStringList{u"b"_s}) << "nor within another change";
     Appender({u"Nobody"_s}, Hr::NoSuchColumn);
     Appender({u"Name"_s, u"NAME"_s}, Hr::DuplicateColumn);
     EXPECT_EQ(Appender({})->Fields().size(), 8U);
