@@ -414,7 +414,8 @@ TEST_F(Appending, LeavesNothingWithoutCommit)
         const auto whole = provider->BeginTransaction(path, result, context);
         {
             const auto appender = Appender({u"Name"_s});
-            ASSERT_EQ(appender->Append(cells), Hr::Ok);
+            for (int i = 0; i < 200; ++i)
+                ASSERT_EQ(appender->Append(cells), Hr::Ok);
         }
         Run(u"INSERT INTO T (Name) VALUES ('b')"_s);
         ASSERT_EQ(whole->Commit(), Hr::Ok);
