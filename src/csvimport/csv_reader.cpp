@@ -10,8 +10,17 @@
 namespace mirel {
 namespace {
 
-constexpr size_t kFirstBufferBytes = 256 * 1024;
+constexpr qint64 kMostFirstBufferBytes = 256 * 1024;
 constexpr size_t kNone = std::string_view::npos;
+
+// Detect makes a reader for every mark that a file might have: filling 256 KB for a file of some bytes would be
+// most of its work.
+size_t FirstBufferBytes(const QIODevice& device)
+{
+    constexpr qint64 kLeastBytes = 1024;
+    const qint64 size = device.isSequential() ? 0 : device.size();
+    return size > 0 ? size_t(std::clamp(size + 1, kLeastBytes, kMostFirstBufferBytes)) : kMostFirstBufferBytes;
+}
 
 bool HasNul(std::string_view bytes)
 {
@@ -69,7 +78,7 @@ CsvReader::CsvReader(QIODevice& device, const CsvFormat& format)
     , doubledQuotes_(format.doubledQuotes && format.quote != 0)
     , spansLines_(doubledQuotes_)
     , dropNuls_(format.dropNuls)
-    , buffer_(kFirstBufferBytes)
+    , buffer_(FirstBufferBytes(device))
 {
     if (format.quote != 0)
         enclosing_.push_back({quote_, false});

@@ -144,6 +144,8 @@ TEST(CellReader, CountsWhatItLeavesOut)
     EXPECT_EQ(texts.CutTexts(), 0);
     EXPECT_EQ(Read(texts, "x" + fits), "x" + std::string(8190, 'x'));
     EXPECT_EQ(texts.CutTexts(), 1);
+    EXPECT_EQ(Read(texts, std::string(8193, 'x')), std::string(8192, 'x'));
+    EXPECT_EQ(texts.CutTexts(), 2);
 
     CellReader whole(FieldType::Memo, {}, LongTexts::KeepWhole);
     EXPECT_EQ(Read(whole, "x" + fits), "x" + fits);

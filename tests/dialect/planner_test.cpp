@@ -118,6 +118,10 @@ TEST(Comparisons, ThatCannotBeMade)
         {"a Yes/No is one", u"SELECT * FROM Items WHERE Sold AND NOT Qty"_s, Hr::Ok},
         {"a date is not true", u"SELECT * FROM Items WHERE Made IS TRUE"_s, Hr::BadComparison},
         {"sum of texts", u"SELECT SUM(Name) FROM Items"_s, Hr::BadComparison},
+        {"the days between dates", u"SELECT Made - Made FROM Items"_s, Hr::Ok},
+        {"dates do not add up", u"SELECT Made + Made FROM Items"_s, Hr::BadComparison},
+        {"days after a date", u"SELECT 2 + Made FROM Items"_s, Hr::Ok},
+        {"a date taken from days", u"SELECT 2 - Made FROM Items"_s, Hr::BadComparison},
         {"dates do not multiply", u"SELECT Made * 2 FROM Items"_s, Hr::BadComparison},
     });
 }
@@ -178,7 +182,9 @@ TEST(Structure, IsHeldAgainstTheSchema)
              }() +
              u')',
          Hr::TooManyColumns},
-        {"too many in a result", u"SELECT *"_s + u",*"_s.repeated(300) + u" FROM Items"_s, Hr::TooManyColumns},
+        {"as many as a result can have", u"SELECT Qty"_s + u",Qty"_s.repeated(1999) + u" FROM Items"_s, Hr::Ok},
+        {"one more", u"SELECT Qty"_s + u",Qty"_s.repeated(2000) + u" FROM Items"_s, Hr::TooManyColumns},
+        {"too many by the star", u"SELECT *"_s + u",*"_s.repeated(300) + u" FROM Items"_s, Hr::TooManyColumns},
         {"no such table", u"DROP TABLE Nothing"_s, Hr::NoSuchTable},
         {"add an old column", u"ALTER TABLE Items ADD name Bit"_s, Hr::DuplicateColumn},
         {"drop no column", u"ALTER TABLE Items DROP Nothing"_s, Hr::NoSuchColumn},

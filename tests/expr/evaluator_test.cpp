@@ -373,6 +373,8 @@ TEST_F(Expressions, EndWhereTextsWouldUseUpTheMemory)
     record.SetColumns({{u"Long"_s, FieldType::Memo, Value::Text(QString((1 << 25) + 1, u'a'))}});
     EXPECT_EQ(Evaluated(u"LENGTH(UPPER([Long]))"_s, ExprMode::Value), u"33554433"_s);
     EXPECT_EQ(Evaluated(u"LENGTH(UPPER([Long]))+LENGTH(UPPER([Long]))"_s, ExprMode::Value), u"null"_s);
+    EXPECT_EQ(Evaluated(u"LENGTH([Long]+'b')"_s, ExprMode::Value), u"33554434"_s);
+    EXPECT_EQ(Evaluated(u"LENGTH([Long]+'b')+LENGTH([Long]+'b')"_s, ExprMode::Value), u"null"_s);
     const QString a(200000, u'a');
     EXPECT_EQ(Evaluated(u"INSTR('"_s + a + u"', '"_s + a.first(100000) + u"b')"_s, ExprMode::Value), u"0"_s);
 }

@@ -128,6 +128,15 @@ TEST(FormDesign, DragsAllThatIsSelectedAndPutsItBack)
     design.CancelDrag();
     EXPECT_EQ(PlacesOf(design), before);
     EXPECT_FALSE(design.IsModified());
+
+    design.MoveBy(1, 0);
+    design.BeginDrag(HitZone::Move, {5, 5});
+    design.DragTo({15, 25});
+    design.Undo(); // a key, while the stylus is down
+    design.DragTo({35, 25});
+    design.EndDrag();
+    EXPECT_EQ(PlacesOf(design), before);
+    EXPECT_TRUE(design.CanRedo());
 }
 
 TEST(FormDesign, BearsRectanglesOutsideAnyScreen)
@@ -256,7 +265,7 @@ TEST(FormDesign, PastesOnAnotherFormAndRefusesForeignBytes)
     form.controls[1].SetSource(u"T.F");
     form.controls[1].type = ControlType(777);
     FormDesign from(form);
-    from.SelectAll();
+    from.Select({1, 0}); // they keep the form's order
     const QByteArray copied = from.CopySelected();
     FormDesign to{FormDef()};
     ASSERT_TRUE(to.Paste(copied));
@@ -271,6 +280,20 @@ TEST(FormDesign, PastesOnAnotherFormAndRefusesForeignBytes)
     for (const QByteArray& bytes : {QByteArray(), QByteArray("x"), copied.left(300), QByteArray(5000, '\xff')})
         EXPECT_FALSE(to.Paste(bytes));
     EXPECT_EQ(BytesOf(to.Form()), before);
+}
+
+TEST(FormDesign, DeletesTheSelectedInWhateverOrderTheyWereSelected)
+{
+    for (const std::vector<int>& selected : {std::vector{0, 2}, std::vector{2, 0}}) {
+        FormDesign design(FormOf({{0, 0, 20, 10}, {0, 20, 20, 10}, {0, 40, 20, 10}, {0, 60, 20, 10}}));
+        const QByteArray before = BytesOf(design.Form());
+        design.Select(selected);
+        design.DeleteSelected();
+        EXPECT_EQ(PlacesOf(design), (Rects{{0, 20, 20, 10}, {0, 60, 20, 10}}));
+        design.Undo();
+        EXPECT_EQ(BytesOf(design.Form()), before);
+        EXPECT_EQ(design.Selection(), selected);
+    }
 }
 
 // --- the way back -------------------------------------------------------------------------------------------

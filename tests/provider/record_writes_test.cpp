@@ -101,6 +101,27 @@ TEST_F(RecordWrites, NeedAResultThatCanBeUpdated)
     EXPECT_EQ(Open(u"SELECT Whole+1,Name FROM T"_s)->Update({&computed, 1}), Hr::ReadOnly) << "an expression";
 }
 
+// A full disk takes back all that the transaction wrote. What is written behind that must not stay alone.
+TEST_F(RecordWrites, EndWhereTheirTransactionWasTakenBack)
+{
+    provider->CloseDatabase(path);
+    const SmallDisk disk(16);
+    const auto cursor = Open(u"T"_s);
+    Hr result = Hr::Ok;
+    auto whole = provider->BeginTransaction(path, result, context);
+    ASSERT_TRUE(whole);
+    const FieldChange large{Memo, Value::Text(QString(20'000, u'x'))};
+    Hr written = Hr::Ok;
+    for (int i = 0; i < 20 && written == Hr::Ok; ++i)
+        written = cursor->AddNew({&large, 1}, {});
+    ASSERT_EQ(written, Hr::DiskFull);
+    EXPECT_TRUE(Failed(cursor->AddNew({}, {})));
+    EXPECT_TRUE(Failed(whole->Commit()));
+    EXPECT_TRUE(Rows(u"SELECT Name FROM T"_s).isEmpty());
+    Add(*cursor, {});
+    EXPECT_EQ(Rows(u"SELECT Name FROM T"_s).size(), 1) << "the next one is another matter";
+}
+
 class BulkWrites : public RecordWrites {
 protected:
     static constexpr int kCount = 3000;
@@ -141,6 +162,36 @@ TEST_F(BulkWrites, ChangeExactlyTheRecordsOfTheResult)
     EXPECT_TRUE(cursor->AtEnd());
     EXPECT_EQ(cursor->RecordCount(), 0);
     EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount - 300);
+}
+
+// The records are those that were asked about, whatever meets the condition by now.
+TEST_F(BulkWrites, TouchNothingThatTheResultDoesNotHold)
+{
+    for (const bool deletes : {false, true}) {
+        Run(u"UPDATE T SET Small=0"_s);
+        Run(u"UPDATE T SET Small=1 WHERE Whole<=10"_s);
+        const auto change = [&](ProviderRecordset& cursor, qint64 confirmed) {
+            return deletes ? cursor.DeleteAll(confirmed, {})
+                           : cursor.UpdateAll(0, Value::Text(u"all"_s), confirmed, {});
+        };
+        const QString source = u"SELECT Name FROM T WHERE Small=1"_s;
+        EXPECT_EQ(change(*Open(source), 9), Hr::RecordChanged) << "more than were asked about";
+        EXPECT_EQ(Count(u"Name='all'"_s), u"0"_s);
+        EXPECT_EQ(Count(u"Whole>0"_s).toInt(), kCount);
+
+        const auto cursor = Open(source);
+        ASSERT_EQ(cursor->RecordCount(), 10);
+        const auto other = Open(u"T"_s);
+        for (const auto& [position, small] : {std::pair(0, 0), std::pair(100, 1)}) {
+            ASSERT_EQ(other->MoveTo(position), Hr::Ok);
+            const FieldChange value{Small, Value::SmallInt(qint16(small))};
+            ASSERT_EQ(other->Update({&value, 1}), Hr::Ok);
+        }
+        EXPECT_EQ(change(*cursor, 10), Hr::Ok);
+        EXPECT_EQ(Count(u"Whole=101 AND Name='x1'"_s), u"1"_s) << "it came to meet the condition since";
+        EXPECT_EQ(Count(deletes ? u"Whole<=10"_s : u"Whole<=10 AND Name<>'all'"_s), u"0"_s);
+        Run(u"UPDATE T SET Name='x' WHERE Name='all'"_s);
+    }
 }
 
 TEST_F(BulkWrites, KeepWhatCameBeforeAStopOrARefusal)
@@ -358,6 +409,18 @@ TEST_F(Appending, LeavesNothingWithoutCommit)
         ASSERT_EQ(appender->Append(cells), Hr::Ok);
     }
     EXPECT_TRUE(Rows(u"SELECT Name FROM T"_s).isEmpty());
+    {
+        Hr result = Hr::Ok;
+        const auto whole = provider->BeginTransaction(path, result, context);
+        {
+            const auto appender = Appender({u"Name"_s});
+            for (int i = 0; i < 200; ++i)
+                ASSERT_EQ(appender->Append(cells), Hr::Ok);
+        }
+        Run(u"INSERT INTO T (Name) VALUES ('b')"_s);
+        ASSERT_EQ(whole->Commit(), Hr::Ok);
+    }
+    EXPECT_EQ(Rows(u"SELECT Name FROM T"_s), QStringList{u"b"_s}) << "nor within another change";
     Appender({u"Nobody"_s}, Hr::NoSuchColumn);
     Appender({u"Name"_s, u"NAME"_s}, Hr::DuplicateColumn);
     EXPECT_EQ(Appender({})->Fields().size(), 8U);

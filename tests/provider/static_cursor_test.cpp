@@ -137,6 +137,55 @@ TEST_F(StaticCursor, OwnAdditionsGoToTheEndAndOwnDeletionsLeave)
     }
 }
 
+// What an undo needs: a deleted record is again the one it was, if nobody has its number by now.
+TEST_F(StaticCursor, ARecordComesBackUnderItsNumberWhileThatIsFree)
+{
+    Fill(2100);
+    for (const bool gaps : {false, true}) {
+        if (gaps)
+            Outside("DELETE FROM T WHERE N%5=0");
+        for (const qint64 position : {0LL, 1023LL, 1500LL}) {
+            SCOPED_TRACE(QString::number(position).toStdString() + (gaps ? ", gaps" : ", dense"));
+            const auto cursor = Open(u"SELECT N FROM T"_s);
+            const QStringList before = Read(*cursor);
+            ASSERT_EQ(cursor->MoveTo(position), Hr::Ok);
+            const RecordId id = cursor->IdInTable();
+            const FieldChange value{0, FieldOf(*cursor)};
+            ASSERT_EQ(cursor->Delete(), Hr::Ok);
+            ASSERT_EQ(cursor->AddNew({&value, 1}, id), Hr::Ok);
+            EXPECT_EQ(cursor->IdInTable(), id);
+            EXPECT_EQ(cursor->Position(), position);
+            EXPECT_EQ(Read(*cursor), before);
+            EXPECT_EQ(Read(*cursor, {.first = position, .count = 2, .fields = {}}), before.mid(position, 2));
+            ASSERT_EQ(cursor->AddNew({&value, 1}, id), Hr::Ok);
+            EXPECT_NE(cursor->IdInTable(), id) << "it is taken";
+            ASSERT_EQ(cursor->Delete(), Hr::Ok);
+            EXPECT_EQ(Read(*cursor), before);
+        }
+    }
+}
+
+TEST_F(StaticCursor, KnowsRowIdsOfAnySize)
+{
+    for (const QStringList& all :
+         {QStringList{u"1"_s, u"4294967294"_s, u"4294967295"_s}, QStringList{u"0"_s, u"4294967296"_s},
+          QStringList{u"-9223372036854775808"_s, u"-1"_s, u"0"_s, u"9223372036854775807"_s}}) {
+        Outside("DELETE FROM T");
+        for (const QString& rowId : all)
+            Outside("INSERT INTO T(rowid,N,Name) VALUES(" + rowId.toLatin1() + ",1,'" + rowId.toLatin1() + "')");
+        for (const QString& source :
+             {u"SELECT Name FROM T"_s, u"SELECT Name FROM T WHERE N=1"_s, u"SELECT Name FROM T ORDER BY N"_s}) {
+            SCOPED_TRACE(source.toStdString() + ": " + all.join(u' ').toStdString());
+            const auto cursor = Open(source);
+            for (int position = 0; position < all.size(); ++position) {
+                ASSERT_EQ(cursor->MoveTo(position), Hr::Ok);
+                EXPECT_EQ(FieldOf(*cursor), Value::Text(all[position]));
+                EXPECT_EQ(Read(*cursor, {.first = position, .count = 1, .fields = {}}), all.mid(position, 1));
+            }
+        }
+    }
+}
+
 TEST_F(StaticCursor, TakesUpWhatOthersChanged)
 {
     Fill(2000);

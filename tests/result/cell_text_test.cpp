@@ -99,16 +99,20 @@ TEST(TypedValue, ReadsTheTextByTheFieldsType)
         {"double with groups", u"1,234.50"_s, FieldType::Double, Value::Double(1234.5), true},
         {"no double", u"price"_s, FieldType::Double, Value::Text(u"price"_s), false},
         {"beyond doubles, passed on", u"1e999"_s, FieldType::Double, Value::Text(u"1e999"_s), false},
+        {"a word for a double that is none", u"inf"_s, FieldType::Double, Value::Text(u"inf"_s), false},
+        {"another", u"nan"_s, FieldType::Double, Value::Text(u"nan"_s), false},
         {"the user's date", u"7/4/2001"_s, FieldType::Date, Value::Date(date), true},
         {"ISO date", u"2001-07-04"_s, FieldType::Date, Value::Date(date), true},
         {"no date, passed on", u"soon"_s, FieldType::Date, Value::Text(u"soon"_s), false},
         {"text", u" O'Brien "_s, FieldType::Text, Value::Text(u" O'Brien "_s), true},
+        {"text as long as its field", u"1234567890"_s, FieldType::Text, Value::Text(u"1234567890"_s), true},
         {"text longer than its field", u"12345678901"_s, FieldType::Text, Value::Text(u"12345678901"_s), false},
     };
     for (const auto& row : rows) {
         EXPECT_EQ(TypedValue(row.text, row.type), row.value) << row.what;
         EXPECT_EQ(IsKeptWhole(row.text, row.type, 10), row.keptWhole) << row.what;
     }
+    EXPECT_TRUE(IsKeptWhole(u"3000000000"_s, FieldType::Integer, kWideIntegerSize)) << "another program's field";
 }
 
 } // namespace

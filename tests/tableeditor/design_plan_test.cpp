@@ -212,6 +212,9 @@ TEST(ValuesAtStake, AreToldByWhatComesBack)
         {text(u"someday"_s), Text, Date, -1, ValueFate::Unfit},
         {Value::Binary("x"), VarBinary, Memo, -1, ValueFate::Unfit},
         {Value::Binary("x"), VarBinary, LongBinary, -1, ValueFate::Same},
+        // Other programs put texts into columns of bytes, and bytes into columns of texts.
+        {text(u"x"_s), VarBinary, Memo, -1, ValueFate::Unfit},
+        {Value::Binary("x"), Memo, LongBinary, -1, ValueFate::Unfit},
     };
     for (const Row& row : rows) {
         Hr fault = Hr::Ok;
