@@ -9,10 +9,8 @@
 #include "resources/ui/theme_icon.h"
 
 #include <QDir>
-#include <QGestureEvent>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMenu>
 #include <QResizeEvent>
 #include <QStackedWidget>
 #include <QStyle>
@@ -146,11 +144,8 @@ void CLumoView::Connect()
             actions_.Of(ShellCommand::Open)->trigger();
     });
     connect(list_, &EntryList::EnterPressed, this, [this] { actions_.Of(ShellCommand::Open)->trigger(); });
-    connect(list_, &QWidget::customContextMenuRequested, this,
-            [this](const QPoint& position) { PopUpMenu(list_->viewport()->mapToGlobal(position)); });
     connect(welcome_, &WelcomePage::RecentChosen, this, &CLumoView::RecentChosen);
-    list_->viewport()->grabGesture(Qt::TapAndHoldGesture);
-    list_->viewport()->installEventFilter(this);
+    actions_.OfferEntryMenu(*list_, state_);
     for (QAction* action : actions_.OfEntries())
         addAction(action); // their keys work while the view has the focus
 }
@@ -241,30 +236,10 @@ void CLumoView::FitButtons()
     }
 }
 
-void CLumoView::PopUpMenu(QPoint globalPosition)
-{
-    QMenu menu(this);
-    actions_.FillMenu(menu, state_.Tab() == MainTab::Favorites ? ShellFavoritePopup : ShellEntryPopup);
-    menu.exec(globalPosition);
-}
-
 void CLumoView::resizeEvent(QResizeEvent* event)
 {
     QWidget::resizeEvent(event);
     FitButtons();
-}
-
-bool CLumoView::eventFilter(QObject* watched, QEvent* event)
-{
-    if (watched == list_->viewport() && event->type() == QEvent::Gesture) {
-        const auto* hold =
-            static_cast<QTapAndHoldGesture*>(static_cast<QGestureEvent*>(event)->gesture(Qt::TapAndHoldGesture));
-        if (hold && hold->state() == Qt::GestureFinished) {
-            PopUpMenu(hold->position().toPoint());
-            return true;
-        }
-    }
-    return QWidget::eventFilter(watched, event);
 }
 
 } // namespace mirel

@@ -37,7 +37,6 @@ Q_SIGNALS:
 
 protected:
     void resizeEvent(QResizeEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     QWidget* MakeHeader();
@@ -45,7 +44,6 @@ private:
     void Connect();
     void ShowList();
     void FitButtons();
-    void PopUpMenu(QPoint globalPosition);
     std::vector<EntryLine> Lines() const;
 
     MainViewState& state_;
