@@ -123,7 +123,7 @@ protected:
         QCoreApplication::processEvents();
         auto* entries = Frame().findChild<EntryList*>(u"entries"_s);
         auto* tree = Frame().findChild<SideTree*>();
-        if (entries->isVisible())
+        if (entries && entries->isVisible()) // of a narrow window
             hand.Open(*entries, 0);
         else
             OpenInTree(*tree, u"Birds"_s);

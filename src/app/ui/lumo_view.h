@@ -45,6 +45,7 @@ private:
     void ShowList();
     void FitButtons();
     std::vector<EntryLine> Lines() const;
+    WelcomePage& Welcome();
 
     MainViewState& state_;
     ShellActions& actions_;
@@ -55,7 +56,8 @@ private:
     QStackedWidget* pages_;
     EntryList* list_;
     QLabel* emptyText_;
-    WelcomePage* welcome_;
+    WelcomePage* welcome_ = nullptr; // until no database is open
+    QStringList recent_;
     QWidget* header_;
     QWidget* buttonRow_;
     std::vector<QToolButton*> buttons_;
