@@ -16,6 +16,8 @@ QString ColorRecordText(const ColorRecord& record)
 
 std::optional<ColorRecord> ReadColorRecord(const QString& text)
 {
+    if (text.isEmpty())
+        return {};
     static const QRegularExpression pattern(
         uR"(^\s*\(\s*(\d+)\s*\),\(\s*(\d+)\s*\),\(\s*(\d+)\s*\),\(\s*(\d+)\s*\),\(\s*(\d+)\s*\))"_s);
     const QRegularExpressionMatch match = pattern.match(text);

@@ -3,6 +3,7 @@
 #include "app/sample_forms.h"
 #include "csvimport/csv_import.h"
 #include "data/table_statements.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 #include <QDir>
@@ -105,7 +106,7 @@ private:
     {
         QFile file(QDir(source_).filePath(fileName.toString()));
         if (!file.open(QIODevice::ReadOnly)) {
-            session_.Prompt().Show({Str::SampleFailed, {file.errorString()}});
+            session_.Prompt().Show({Str::SampleFailed, {SystemReason(file)}});
             return false;
         }
         ImportReport report;

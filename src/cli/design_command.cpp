@@ -1,6 +1,7 @@
 #include "app/renaming.h"
 #include "cli/commands.h"
 #include "cli/run.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 #include "tableeditor/design_run.h"
 #include "tableeditor/field_list.h"
@@ -74,7 +75,7 @@ private:
     {
         QFile file(run_.PathArgument(2));
         if (!file.open(QIODevice::ReadOnly))
-            return Tell({Str::DesignFileUnreadable, {run_.Argument(2), file.errorString()}});
+            return Tell({Str::DesignFileUnreadable, {run_.Argument(2), SystemReason(file)}});
         UserMessage fault;
         std::optional<std::vector<ListedField>> read = ReadFieldList(file.readAll(), fault);
         if (!read)

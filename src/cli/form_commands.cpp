@@ -6,6 +6,7 @@
 #include "forms/default_form.h"
 #include "forms/form_file.h"
 #include "platform/shared_file.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 #include <QFile>
@@ -175,7 +176,7 @@ ExitStatus RunFormsEdit(Run& run)
         return ExitStatus::Failed;
     QFile file(run.PathArgument(2));
     if (!file.open(QIODevice::ReadOnly)) {
-        run.Prompt().Show({Str::CliFormFileUnreadable, {run.Argument(2), file.errorString()}});
+        run.Prompt().Show({Str::CliFormFileUnreadable, {run.Argument(2), SystemReason(file)}});
         return ExitStatus::Failed;
     }
     UserMessage fault;

@@ -7,6 +7,7 @@
 #include "csvimport/utf8_source.h"
 #include "data/provider_error.h"
 #include "platform/shared_file.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 #include <QFile>
@@ -126,7 +127,7 @@ private:
         file.setFileName(path_);
         if (file.open(QIODevice::ReadOnly | QIODevice::Unbuffered))
             return true;
-        return Tell({Str::ImportCannotOpen, {run_.Argument(1), file.errorString()}});
+        return Tell({Str::ImportCannotOpen, {run_.Argument(1), SystemReason(file)}});
     }
 
     bool FirstLine(QStringList& texts)

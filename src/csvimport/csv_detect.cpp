@@ -7,6 +7,7 @@
 #include "csvimport/text_encoding.h"
 #include "csvimport/type_guess.h"
 #include "csvimport/utf8_source.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
@@ -75,7 +76,7 @@ private:
         return false;
     }
 
-    bool Rewind() { return file_.seek(0) || Tell(Str::ImportCannotRead, {file_.errorString()}); }
+    bool Rewind() { return file_.seek(0) || Tell(Str::ImportCannotRead, {SystemReason(file_)}); }
 
     bool FindEncoding()
     {
@@ -88,7 +89,7 @@ private:
         TextLook look;
         switch (LookAtText(file_, *progress, look)) {
         case LookResult::CannotRead:
-            return Tell(Str::ImportCannotRead, {file_.errorString()});
+            return Tell(Str::ImportCannotRead, {SystemReason(file_)});
         case LookResult::Stopped:
             return false;
         case LookResult::Done:
@@ -112,7 +113,7 @@ private:
             filled += count;
         if (count < 0)
             return source.IsMalformed() ? Tell(Str::ImportNotText, {found_.format.encoding})
-                                        : Tell(Str::ImportCannotRead, {file_.errorString()});
+                                        : Tell(Str::ImportCannotRead, {SystemReason(file_)});
         sample.truncate(filled);
         if (sample.trimmed().isEmpty())
             return Tell(Str::ImportNoText);

@@ -7,6 +7,7 @@
 #include "csvimport/reader_fault.h"
 #include "csvimport/skipped_lines.h"
 #include "csvimport/type_guess.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 #include <algorithm>
@@ -169,7 +170,7 @@ bool CountKeys(KeyedTarget& target, QIODevice& file, const ImportPlan& plan, Use
         return false;
     if (file.seek(0))
         return true;
-    prompt.Show({Str::ImportCannotRead, {file.errorString()}});
+    prompt.Show({Str::ImportCannotRead, {SystemReason(file)}});
     return false;
 }
 

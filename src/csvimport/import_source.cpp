@@ -1,4 +1,5 @@
 #include "csvimport/import_source.h"
+#include "platform/system_reason.h"
 
 #include <QBuffer>
 #include <QFile>
@@ -35,7 +36,7 @@ std::unique_ptr<QIODevice> ImportSource::Open(QString& fault) const
     auto file = std::make_unique<QFile>(path_);
     if (file->open(QIODevice::ReadOnly | QIODevice::Unbuffered))
         return file;
-    fault = file->errorString();
+    fault = SystemReason(*file);
     return {};
 }
 

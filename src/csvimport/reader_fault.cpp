@@ -1,5 +1,6 @@
 #include "csvimport/reader_fault.h"
 
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 
 namespace mirel {
@@ -17,7 +18,7 @@ UserMessage MessageOfFault(const CsvReader& reader, const QIODevice& file)
     case CsvReader::Fault::QuoteNeverClosed:
         return {Str::ImportQuoteNeverClosed, {}};
     }
-    return {Str::ImportCannotRead, {file.errorString()}};
+    return {Str::ImportCannotRead, {SystemReason(file)}};
 }
 
 QStringList TextsOf(std::span<const std::string_view> utf8)

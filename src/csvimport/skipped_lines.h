@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/system_reason.h"
+
 #include <QByteArray>
 #include <QSaveFile>
 
@@ -21,7 +23,7 @@ public:
     [[nodiscard]] bool Add(const QByteArray& line);
     [[nodiscard]] bool Commit();
 
-    QString ErrorText() const { return file_ ? file_->errorString() : QString(); }
+    QString ErrorText() const { return file_ ? SystemReason(*file_) : QString(); }
     qint64 Count() const { return count_; }
 
 private:

@@ -63,7 +63,7 @@ bool BulkCommands::UpdateAll()
         return false;
     const int field = browser_.SelectedField();
     const Value value = browser_.EditedValue();
-    if (!run.AskUpdateAll(field, browser_.SelectedText()))
+    if (!run.AskUpdateAll(field, browser_.EditedText()))
         return false;
     bool done = false;
     {

@@ -2,6 +2,7 @@
 
 #include "data/provider_error.h"
 #include "platform/shared_file.h"
+#include "platform/system_reason.h"
 #include "resources/string_table.h"
 #include "tableview/html_records.h"
 #include "tableview/json_records.h"
@@ -189,7 +190,7 @@ std::optional<qint64> ExportCsvFile(DbRecordset& source, const CsvExportOptions&
     if (result.ending == Ending::Stopped && target.onStop == OnStop::Discard)
         return {};
     if (result.ending == Ending::WriteFailed || !file.Commit()) {
-        prompt.Show({Str::FileWriteFail, {path, file.Device().errorString()}});
+        prompt.Show({Str::FileWriteFail, {path, SystemReason(file.Device())}});
         return {};
     }
     prompt.Show({Str::RecordsExported, {QString::number(result.records)}});

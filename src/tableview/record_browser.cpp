@@ -283,8 +283,11 @@ void RecordBrowser::RevertEdit()
 
 QString RecordBrowser::SelectedText() const
 {
-    if (edit_.IsUnset())
-        return {};
+    return edit_.IsUnset() ? QString() : EditedText();
+}
+
+QString RecordBrowser::EditedText() const
+{
     return edit_.Kind() == EditorKind::Check ? settings_.words.Of(edit_.IsChecked()) : edit_.Text();
 }
 

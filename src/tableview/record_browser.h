@@ -217,6 +217,7 @@ public:
     QString SelectedText() const; // what the cell holds, or would with the pending edit; whole
     // What is pending as a value of the field's type.
     Value EditedValue() const { return edit_.Stored(); }
+    QString EditedText() const; // the same as the user writes it: a Yes/No without a value is stored as No
     // Shows the result of a command in the editor's place. It is not the cell's text: nothing edits it, and any
     // edit, revert or move ends it.
     void ShowInEditor(const QString& label, const QString& text);

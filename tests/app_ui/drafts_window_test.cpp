@@ -7,6 +7,7 @@
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/sqlite_file.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/ui/table_view.h"
 
 #include <QClipboard>
@@ -24,8 +25,6 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kPatienceMs = 20'000;
-constexpr QSize kDesktop(1100, 700);
-constexpr QSize kHandheld(240, 320);
 
 class DraftsWindowTest : public ProgramFixture {
 protected:

@@ -18,6 +18,7 @@
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/scripted_prompt.h"
+#include "support/ui/window_sizes.h"
 
 #include <gtest/gtest.h>
 
@@ -43,9 +44,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kHandheld(240, 320);
-constexpr QSize kDesktop(1100, 700);
 
 class FormMakerWindow : public ::testing::TestWithParam<QSize> {
 protected:

@@ -8,6 +8,7 @@
 #include "support/printing.h"
 #include "support/ui/screen_checks.h"
 #include "support/ui/spoken_in_windows.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/ui/table_view.h"
 
 #include "app_ui/program_fixture.h"
@@ -28,9 +29,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kHandheld(240, 320);
-constexpr QSize kDesktop(1100, 700);
 
 // A window of that size on a screen that may be smaller.
 void ResizeTo(QSize size, CMainFrame& frame)

@@ -9,8 +9,10 @@
 
 #include <QApplication>
 #include <QLineEdit>
+#include <QMenu>
 #include <QSignalSpy>
 #include <QTest>
+#include <QTimer>
 #include <QToolButton>
 
 namespace mirel {
@@ -86,6 +88,25 @@ TEST_F(LumoViewTest, OpensByTheTapThatTheUserChose)
     EXPECT_EQ(TimesGiven(ShellCommand::Open), 2);
     Tap(2, true); // its first half opens, its second does not again
     EXPECT_EQ(TimesGiven(ShellCommand::Open), 3);
+}
+
+TEST_F(LumoViewTest, AHoldOpensTheMenuAndNotTheEntry)
+{
+    state_.SetOpensByDoubleTap(false);
+    bool sawMenu = false;
+    QTimer look;
+    QObject::connect(&look, &QTimer::timeout, &view_, [&sawMenu] {
+        if (auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget())) {
+            sawMenu = !menu->actions().isEmpty();
+            menu->close();
+        }
+    });
+    look.start(20);
+    const QRect place = List()->visualRect(List()->model()->index(1, 0));
+    QTest::mousePress(List()->viewport(), Qt::LeftButton, {}, place.center());
+    EXPECT_TRUE(QTest::qWaitFor([&sawMenu] { return sawMenu; }));
+    EXPECT_EQ(state_.Selected(), Table(u"Birds"_s));
+    EXPECT_EQ(TimesGiven(ShellCommand::Open), 0);
 }
 
 TEST_F(LumoViewTest, EnterOpensWhateverTheTapDoes)

@@ -11,6 +11,7 @@
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/sqlite_file.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/ui/table_view.h"
 
 #include <QAbstractButton>
@@ -30,8 +31,6 @@ namespace {
 using namespace Qt::StringLiterals;
 
 constexpr int kPatienceMs = 20'000;
-constexpr QSize kDesktop(1100, 700);
-constexpr QSize kHandheld(240, 320);
 
 QString Plain(const QString& text)
 {
@@ -124,7 +123,7 @@ protected:
         QCoreApplication::processEvents();
         auto* entries = Frame().findChild<EntryList*>(u"entries"_s);
         auto* tree = Frame().findChild<SideTree*>();
-        if (entries->isVisible())
+        if (entries && entries->isVisible()) // of a narrow window
             hand.Open(*entries, 0);
         else
             OpenInTree(*tree, u"Birds"_s);

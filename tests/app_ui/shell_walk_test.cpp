@@ -10,6 +10,7 @@
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/ui/screen_checks.h"
+#include "support/ui/window_sizes.h"
 
 #include <QDialog>
 #include <QTest>
@@ -18,10 +19,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kUpright(240, 320);
-constexpr QSize kFlat(320, 240);
-constexpr QSize kDesktop(1100, 700);
 
 class ShellWalk : public ProgramFixture {
 protected:
@@ -44,7 +41,7 @@ protected:
     {
         for (const QString& palette : {u"light"_s, u"dark"_s}) {
             ASSERT_TRUE(UsePalette(palette));
-            for (const QSize size : {kUpright, kFlat, kDesktop}) {
+            for (const QSize size : kWindowSizes) {
                 QWidget window;
                 window.resize(size);
                 window.show();
@@ -103,11 +100,11 @@ TEST_F(ShellWalk, GoesThroughTheFileDialogOfASmallScreen)
         ASSERT_TRUE(UsePalette(palette));
         for (const FileUse use : {FileUse::Open, FileUse::Create}) {
             QWidget window;
-            window.resize(kUpright);
+            window.resize(kHandheld);
             window.show();
             Script script;
             script.On<QDialog>([&](QDialog& dialog) {
-                ExpectFits(dialog, (use == FileUse::Open ? u"file-open-"_s : u"file-new-"_s) + palette, kUpright);
+                ExpectFits(dialog, (use == FileUse::Open ? u"file-open-"_s : u"file-new-"_s) + palette, kHandheld);
                 dialog.reject();
             });
             FileRequest request{.title = Str::CommandOpenDatabase,
@@ -126,7 +123,7 @@ TEST_F(ShellWalk, GoesThroughTheMenuAndTheQuietLine)
 {
     for (const QString& palette : {u"light"_s, u"dark"_s}) {
         ASSERT_TRUE(UsePalette(palette));
-        for (const QSize size : {kUpright, kDesktop}) {
+        for (const QSize size : {kHandheld, kDesktop}) {
             Show(size);
             Frame().Note(StringText(Str::DraftsNotKept, {u"/home/ann/.local/share/Mirel/Drafts"_s}));
             QCoreApplication::processEvents();
@@ -137,8 +134,8 @@ TEST_F(ShellWalk, GoesThroughTheMenuAndTheQuietLine)
                     continue;
                 menu->popup({});
                 Paint(*menu, u"database-menu-%1-%2"_s.arg(palette, QString::number(size.width())));
-                EXPECT_TRUE(size != kUpright || menu->sizeHint().width() <= kUpright.width());
-                EXPECT_LE(menu->sizeHint().height(), kUpright.height());
+                EXPECT_TRUE(size != kHandheld || menu->sizeHint().width() <= kHandheld.width());
+                EXPECT_LE(menu->sizeHint().height(), kHandheld.height());
                 menu->close();
             }
             program_->frame.reset();

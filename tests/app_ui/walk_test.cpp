@@ -25,6 +25,7 @@
 #include "resources/string_table.h"
 #include "support/ui/screen_checks.h"
 #include "support/ui/spoken_in_windows.h"
+#include "support/ui/window_sizes.h"
 #include "tableeditor/ui/field_dialog.h"
 #include "tableview/export_draft.h"
 #include "tableview/people_fixture.h"
@@ -52,10 +53,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kUpright(240, 320);
-constexpr QSize kFlat(320, 240);
-constexpr QSize kDesktop(1100, 700);
 
 class Walk : public PeopleFixture {
 protected:
@@ -112,7 +109,7 @@ protected:
 
     HelpDesk desk_{*qobject_cast<QApplication*>(QCoreApplication::instance())}; // its button is in the dialogs
     QPalette before_;
-    QList<QSize> sizes_ = {kUpright, kFlat, kDesktop};
+    QList<QSize> sizes_{kWindowSizes.begin(), kWindowSizes.end()};
     QString prefix_; // of the pictures
     QSet<QString> said_;
 };
@@ -122,7 +119,7 @@ class WalkInGerman : public Walk {
 protected:
     WalkInGerman()
     {
-        sizes_ = {kUpright, kDesktop};
+        sizes_ = {kHandheld, kDesktop};
         prefix_ = u"de-"_s;
     }
 
@@ -281,7 +278,7 @@ TEST_F(Walk, BearsOddFontsDirectionsAndTables)
             QApplication::setLayoutDirection(direction);
             for (const QString& table : {u"Wide"_s, u"People"_s}) {
                 CTableView view(connection, path, prompt, {.maxColumnChars = TableViewSettings::kNoColumnLimit});
-                view.resize(kUpright);
+                view.resize(kHandheld);
                 ASSERT_TRUE(view.OpenTable(table));
                 view.show();
                 auto* grid = view.findChild<RecordGrid*>();
@@ -304,7 +301,7 @@ TEST_F(Walk, BearsOddFontsDirectionsAndTables)
 TEST_F(Walk, GoesThroughTheMessageBoxes)
 {
     MessageBoxPrompt boxes;
-    for (const QSize size : {kUpright, kFlat, kDesktop}) {
+    for (const QSize size : kWindowSizes) {
         QWidget window;
         window.resize(size);
         window.show();
@@ -338,14 +335,14 @@ TEST_F(Walk, GoesThroughTheMessageBoxes)
 TEST_F(Walk, SeesTheWholeCalendarOnAHandheld)
 {
     QWidget window;
-    window.resize(kUpright);
+    window.resize(kHandheld);
     window.show();
     QTimer::singleShot(0, &window, [] {
         QWidget* popup = QApplication::activePopupWidget();
         ASSERT_TRUE(popup);
         Paint(*popup, u"calendar"_s);
-        EXPECT_LE(popup->sizeHint().width(), kUpright.width());
-        EXPECT_LE(popup->sizeHint().height(), kUpright.height());
+        EXPECT_LE(popup->sizeHint().width(), kHandheld.width());
+        EXPECT_LE(popup->sizeHint().height(), kHandheld.height());
         popup->close();
     });
     EXPECT_FALSE(ChooseDay(u"2/3/1499"_s, window.pos(), window));

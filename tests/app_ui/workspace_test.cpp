@@ -13,6 +13,7 @@
 #include "resources/string_table.h"
 #include "support/printing.h"
 #include "support/sqlite_file.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/ui/record_grid.h"
 #include "tableview/ui/table_view.h"
 
@@ -37,9 +38,6 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
-constexpr QSize kWide(1100, 700);
-constexpr QSize kNarrow(240, 320);
-
 const ViewKey kBirds{EntryKind::Table, u"Birds"_s};
 const ViewKey kBees{EntryKind::Table, u"Bees"_s};
 const ViewKey kBirdForm{EntryKind::Form, u"Bird form"_s};
@@ -57,7 +55,7 @@ protected:
             EXPECT_TRUE(Execute(u"INSERT INTO Birds (Name,Wings) VALUES ('%1',2)"_s.arg(name)));
         AddForm();
         Commands().Refill();
-        Show(kWide);
+        Show(kDesktop);
     }
 
     // As another program does it.
@@ -115,7 +113,7 @@ TEST_F(WorkspaceTest, CrossingTheWidthClosesNothingAndKeepsWhatIsInFront)
     QTest::keyClick(birds->findChild<RecordGrid*>(), Qt::Key_M);
     ASSERT_TRUE(birds->isWindowModified());
     for (const QSize& size :
-         {kNarrow, kWide, QSize(200, 200), QSize(4000, 3000), QSize(639, 700), QSize(640, 480)}) {
+         {kHandheld, kDesktop, QSize(200, 200), QSize(4000, 3000), QSize(639, 700), QSize(640, 480)}) {
         Frame().resize(size);
         QCoreApplication::processEvents();
         const bool wide = size.width() >= CMainFrame::kLeastWideWidth;
@@ -126,7 +124,7 @@ TEST_F(WorkspaceTest, CrossingTheWidthClosesNothingAndKeepsWhatIsInFront)
         EXPECT_EQ(Frame().findChild<SideBar*>()->isVisible(), wide) << size.width();
         EXPECT_EQ(Bar().isVisible(), wide) << size.width();
     }
-    Frame().resize(kNarrow);
+    Frame().resize(kHandheld);
     Command(ShellCommand::ShowLists)->trigger();
     EXPECT_TRUE(Frame().findChild<CLumoView*>()->isVisible());
     EXPECT_EQ(Tabs().Count(), 2);
@@ -142,7 +140,7 @@ TEST_F(WorkspaceTest, TheMenusAreThoseOfTheViewInFrontThenTheWindowsWithOneFile)
     EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Edit"_s, u"Tools"_s} + frames));
     Frame().OpenView(kBirdForm);
     EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Record"_s, u"View"_s} + frames));
-    Frame().resize(kNarrow);
+    Frame().resize(kHandheld);
     EXPECT_EQ(MenuTitles(), (QStringList{u"File"_s, u"Record"_s, u"View"_s})) << "the rest is in File";
     QStringList inFile;
     for (const QAction* entry : Frame().menuBar()->actions().first()->menu()->actions())
@@ -234,7 +232,7 @@ TEST_F(WorkspaceTest, TabsComeBackInTheirOrder)
     Frame().OpenView(kBirdForm);
     Bar().moveTab(2, 0);
     Tabs().BringForward(kBees);
-    Restart(kWide);
+    Restart(kDesktop);
     ASSERT_EQ(Tabs().Count(), 3);
     EXPECT_EQ(Tabs().KeyAt(0), kBirdForm);
     EXPECT_EQ(Tabs().KeyAt(1), kBees);
@@ -245,7 +243,7 @@ TEST_F(WorkspaceTest, TabsComeBackInTheirOrder)
     EXPECT_TRUE(Tabs().Front());
 
     ExecuteElsewhere(u"DROP TABLE Bees"_s);
-    Restart(kWide);
+    Restart(kDesktop);
     EXPECT_EQ(Tabs().Count(), 2);
     EXPECT_EQ(prompt_.shown, QStringList());
 }
@@ -433,7 +431,7 @@ TEST_F(WorkspaceTest, NoNameAndNoNumberOfTablesIsTooMuch)
     ASSERT_TRUE(Open({EntryKind::Table, longName}));
     for (int i = 0; i < 30; ++i)
         Open({EntryKind::Table, u"T%1"_s.arg(i)});
-    for (const QSize& size : {QSize(200, 200), QSize(640, 480), kWide, QSize(4000, 3000)}) {
+    for (const QSize& size : {QSize(200, 200), QSize(640, 480), kDesktop, QSize(4000, 3000)}) {
         Frame().resize(size);
         QCoreApplication::processEvents();
         EXPECT_EQ(Frame().size(), size) << "nothing widens the window";
@@ -444,7 +442,7 @@ TEST_F(WorkspaceTest, EveryPartHasANameForThoseWhoDoNotSee)
 {
     Open(kBirds);
     Frame().OpenView(kBirdForm);
-    for (const QSize& size : {kWide, kNarrow}) {
+    for (const QSize& size : {kDesktop, kHandheld}) {
         Frame().resize(size);
         Command(ShellCommand::ShowLists)->trigger();
         QCoreApplication::processEvents();
@@ -474,13 +472,13 @@ TEST_F(WorkspaceTest, AQueryIsWrittenOpenedAndChangedWithItsViewFollowing)
     };
     const ViewKey few{EntryKind::Query, u"Few"_s};
 
-    for (const QSize size : {kWide, kNarrow}) {
+    for (const QSize size : {kDesktop, kHandheld}) {
         Frame().resize(size);
         State().SetTab(MainTab::Table); // a new query is about the chosen table
         State().Select({EntryKind::Table, kBirds.name, {}, false});
         State().SetTab(MainTab::Query);
-        const QString statement = size == kWide ? u"SELECT Name FROM Birds"_s : u"SELECT Wings FROM Birds"_s;
-        if (size == kWide) {
+        const QString statement = size == kDesktop ? u"SELECT Name FROM Birds"_s : u"SELECT Wings FROM Birds"_s;
+        if (size == kDesktop) {
             inBuilder(ShellCommand::New, [&](CQueryDialog& dialog) {
                 QTest::keyClicks(dialog.findChild<QLineEdit*>(u"queryName"_s), few.name);
                 sql(dialog).setPlainText(statement);

@@ -6,6 +6,7 @@
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 #include "support/test_database.h"
+#include "support/ui/window_sizes.h"
 
 #include <QApplication>
 #include <QCheckBox>
@@ -36,9 +37,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kHandheld(240, 320);
-constexpr QSize kDesktop(1100, 700);
 
 class ImportWizard : public TestDatabase {
 protected:

@@ -454,6 +454,49 @@ TEST_F(FormView, TheScrollBarIsTheFormsAndScrollingTheSettings)
     EXPECT_FALSE(bar->isVisible());
 }
 
+TEST_F(FormView, OpensAtItsTopWithTheFocusInSight)
+{
+    const ControlDraft title = {.type = ControlType::Label, .name = u"title"_s, .place = {10, 2, 100, 24}};
+    const ControlDraft search = {
+        .type = ControlType::DropDownBox, .name = u"search"_s, .place = {10, 30, 100, 18}};
+    const ControlDraft press = {.type = ControlType::Button, .name = u"press"_s, .place = {120, 30, 60, 18}};
+    const auto list = [](int heightPx) {
+        return ControlDraft{.type = ControlType::List, .name = u"list"_s, .place = {10, 55, 200, heightPx}};
+    };
+    const auto name = [](int top) {
+        return ControlDraft{.name = u"Name"_s, .source = u"People.Name"_s, .place = {10, top, 100, 18}};
+    };
+    const struct {
+        const char* what;
+        std::vector<ControlDraft> controls;
+        QString focused;
+        bool atTop;
+    } rows[] = {
+        {"the first field fits", {title, search, press, name(60)}, u"Name"_s, true},
+        {"the first field is further down", {title, press, search, list(100), name(300)}, u"search"_s, true},
+        {"so is all but a list", {title, list(60), name(300)}, u"list"_s, true},
+        {"nothing above is for input", {title, kCounter, press, name(300)}, u"Name"_s, false}};
+    settings.fitToWindow = false;
+    for (const auto& row : rows) {
+        FormDef form = FormOf(row.controls);
+        form.height = 600;
+        for (const bool opensHidden : {false, true}) { // as a form does that an earlier run has left open
+            Make(form);
+            view->resize(320, 200);
+            if (opensHidden)
+                (void)view->Open();
+            view->show();
+            EXPECT_TRUE(QTest::qWaitForWindowActive(view.get()));
+            if (!opensHidden)
+                (void)view->Open();
+            QCoreApplication::processEvents();
+            EXPECT_TRUE(Find(row.focused)->hasFocus()) << row.what << opensHidden;
+            const int scrolled = view->findChild<QScrollArea*>()->verticalScrollBar()->value();
+            EXPECT_EQ(scrolled == 0, row.atTop) << row.what << opensHidden;
+        }
+    }
+}
+
 TEST_F(FormView, ShowsItsRecordsAsAListToo)
 {
     settings.sortByHeader = true;

@@ -90,11 +90,15 @@ protected:
         return Button(QStringLiteral("SAVE"), ButtonFunction::Update, JoinAssignments(assignments));
     }
 
-    void Show(const FormDef& form)
+    void Make(const FormDef& form)
     {
         view = std::make_unique<CFormEngView>(
             FormCall{.form = form, .query = {}},
             FormSurroundings{connection_, path_, store, prompt_, settings, QString()});
+    }
+    void Show(const FormDef& form)
+    {
+        Make(form);
         view->resize(300, 400);
         view->show();
         EXPECT_TRUE(QTest::qWaitForWindowActive(view.get()));

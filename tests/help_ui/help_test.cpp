@@ -9,6 +9,7 @@
 #include "support/printing.h"
 #include "support/ui/screen_checks.h"
 #include "support/ui/spoken_in_windows.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/ui/options_dialog.h"
 
 #include <QAbstractTextDocumentLayout>
@@ -99,7 +100,7 @@ TEST_P(Help, IsNoWiderThanAHandheld)
 {
     QWidget window;
     const auto [style, palette] = std::pair(QApplication::style()->objectName(), QApplication::palette());
-    for (const QSize size : {QSize(240, 320), QSize(320, 240), QSize(1100, 700)}) {
+    for (const QSize size : kWindowSizes) {
         ASSERT_TRUE(UsePalette(size.width() == 320 ? u"dark" : u"light"));
         window.resize(size);
         window.show();

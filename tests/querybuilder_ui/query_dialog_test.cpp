@@ -11,6 +11,7 @@
 #include "querybuilder/ui/name_lists.h"
 #include "querybuilder/ui/result_window.h"
 #include "resources/string_table.h"
+#include "support/ui/window_sizes.h"
 #include "tableview/people_fixture.h"
 #include "tableview/ui/export_wizard.h"
 #include "tableview/ui/table_view.h"
@@ -35,9 +36,6 @@ namespace mirel {
 namespace {
 
 using namespace Qt::StringLiterals;
-
-constexpr QSize kHandheld(240, 320);
-constexpr QSize kDesktop(1100, 700);
 
 const QString kStatement =
     u"SELECT Customers.City, SUM(Orders.Qty) FROM Customers INNER JOIN Orders ON Customers.CustomerID = "

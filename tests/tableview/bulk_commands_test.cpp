@@ -193,6 +193,18 @@ TEST_F(Bulk, TicksAllRecordsInTheUsersWords)
     EXPECT_EQ(Counted(u"Member=TRUE"_s), u"25"_s);
 }
 
+TEST_F(Bulk, SaysThatAYesNoWithoutAValueBecomesNo)
+{
+    Run(u"UPDATE People SET Member=NULL WHERE Name='P1'"_s);
+    EXPECT_TRUE(browser.RunAgain());
+    Select(Member);
+    EXPECT_EQ(browser.SelectedText(), QString());
+    prompt.answers = {true, true};
+    EXPECT_TRUE(bulk.UpdateAll());
+    EXPECT_TRUE(prompt.questions[0].endsWith(u"Set Value: No"_s)) << prompt.questions[0].toStdString();
+    EXPECT_EQ(Counted(u"Member=FALSE"_s), u"25"_s);
+}
+
 TEST_F(Bulk, UpdatesTheRecordsOfTheResultAloneAndStaysInPlace)
 {
     EXPECT_TRUE(browser.AddCondition(u"Member=TRUE"_s));

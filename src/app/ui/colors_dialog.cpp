@@ -1,5 +1,6 @@
 #include "app/ui/colors_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -76,9 +77,7 @@ CColorsDialog::CColorsDialog(const std::optional<QColor>& color, Unset unset, QW
     codeRow->addWidget(label);
     codeRow->addWidget(code_, 1);
     codeRow->addWidget(sample_);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* page = new QWidget(this);
     auto* column = new QVBoxLayout(page);
     column->setContentsMargins({});

@@ -11,7 +11,7 @@ namespace mirel {
 
 EmptyPage::EmptyPage(const ShellActions& actions, QWidget* parent)
     : QStackedWidget(parent)
-    , welcome_(new WelcomePage(actions, this))
+    , actions_(actions)
     , offers_(new QWidget(this))
     , hint_(new QLabel(offers_))
 {
@@ -35,9 +35,7 @@ EmptyPage::EmptyPage(const ShellActions& actions, QWidget* parent)
     column->addWidget(hint_);
     column->addLayout(row);
     column->addStretch();
-    addWidget(welcome_);
     addWidget(offers_);
-    connect(welcome_, &WelcomePage::RecentChosen, this, &EmptyPage::RecentChosen);
     // What cannot be done now is not offered.
     connect(&actions, &ShellActions::followed, this, [this] {
         for (QToolButton* button : buttons_)
@@ -45,12 +43,25 @@ EmptyPage::EmptyPage(const ShellActions& actions, QWidget* parent)
     });
 }
 
+WelcomePage& EmptyPage::Welcome()
+{
+    if (!welcome_) {
+        welcome_ = new WelcomePage(actions_, this);
+        addWidget(welcome_);
+        connect(welcome_, &WelcomePage::RecentChosen, this, &EmptyPage::RecentChosen);
+    }
+    return *welcome_;
+}
+
 void EmptyPage::Show(const MainViewState& state, const QStringList& recent)
 {
-    welcome_->SetRecent(recent);
+    if (!state.HasDatabase()) {
+        Welcome().SetRecent(recent);
+        return setCurrentWidget(welcome_);
+    }
     const bool isEmpty = state.Entries(MainTab::Table).empty();
     hint_->setText(StringText(isEmpty ? Str::EmptyDatabaseHint : Str::EmptyTabsHint));
-    setCurrentWidget(state.HasDatabase() ? offers_ : static_cast<QWidget*>(welcome_));
+    setCurrentWidget(offers_);
 }
 
 } // namespace mirel

@@ -24,7 +24,10 @@ Q_SIGNALS:
     void RecentChosen(const QString& path);
 
 private:
-    WelcomePage* welcome_;
+    WelcomePage& Welcome();
+
+    const ShellActions& actions_;
+    WelcomePage* welcome_ = nullptr; // until no database is open
     QWidget* offers_;
     QLabel* hint_;
     std::vector<QToolButton*> buttons_;

@@ -206,8 +206,8 @@ void FlatStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* opti
     case PE_IndicatorHeaderArrow: // Qt says "down" of an ascending order; here the arrow points to where it grows
         if (const auto* header = qstyleoption_cast<const QStyleOptionHeader*>(option)) {
             const bool ascending = header->sortIndicator == QStyleOptionHeader::SortDown;
-            return DrawArrow(ascending ? PE_IndicatorArrowUp : PE_IndicatorArrowDown, *option, option->rect, *painter,
-                             widget);
+            return DrawArrow(ascending ? PE_IndicatorArrowUp : PE_IndicatorArrowDown, *option, option->rect,
+                             *painter, widget);
         }
         break;
     case PE_FrameGroupBox:
@@ -257,6 +257,10 @@ void FlatStyle::drawControl(ControlElement element, const QStyleOption* option, 
     case CE_MenuBarItem:
         if (const auto* item = qstyleoption_cast<const QStyleOptionMenuItem*>(option))
             return DrawMenuBarItem(*item, *painter, widget);
+        break;
+    case CE_ComboBoxLabel:
+        if (const auto* box = qstyleoption_cast<const QStyleOptionComboBox*>(option))
+            return DrawComboBoxText(*box, *painter, widget);
         break;
     case CE_ToolBar:
     case CE_MenuBarEmptyArea:
@@ -320,6 +324,19 @@ void FlatStyle::DrawComboBox(const QStyleOptionComboBox& option, QPainter& paint
         painter.fillRect(option.rect, option.palette.color(QPalette::Base));
     DrawArrow(PE_IndicatorArrowDown, option,
               proxy()->subControlRect(CC_ComboBox, &option, SC_ComboBoxArrow, widget), painter, widget);
+}
+
+// The base style cuts a long text off without a sign.
+void FlatStyle::DrawComboBoxText(QStyleOptionComboBox box, QPainter& painter, const QWidget* widget) const
+{
+    constexpr int kBesideIconPx = 4;
+    constexpr int kAroundTextPx = 2;
+    int room =
+        proxy()->subControlRect(CC_ComboBox, &box, SC_ComboBoxEditField, widget).width() - 2 * kAroundTextPx;
+    if (!box.currentIcon.isNull())
+        room -= box.iconSize.width() + kBesideIconPx;
+    box.currentText = box.fontMetrics.elidedText(box.currentText, Qt::ElideMiddle, room);
+    TouchTargetStyle::drawControl(CE_ComboBoxLabel, &box, &painter, widget);
 }
 
 void FlatStyle::DrawSpinBox(const QStyleOptionSpinBox& option, QPainter& painter, const QWidget* widget) const

@@ -26,6 +26,7 @@ public:
 
 private:
     void DrawComboBox(const QStyleOptionComboBox& option, QPainter& painter, const QWidget* widget) const;
+    void DrawComboBoxText(QStyleOptionComboBox box, QPainter& painter, const QWidget* widget) const;
     void DrawSpinBox(const QStyleOptionSpinBox& option, QPainter& painter, const QWidget* widget) const;
     void DrawScrollBar(const QStyleOptionSlider& option, QPainter& painter, const QWidget* widget) const;
     void DrawMenuBarItem(QStyleOptionMenuItem item, QPainter& painter, const QWidget* widget) const;

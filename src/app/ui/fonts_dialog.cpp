@@ -1,6 +1,7 @@
 #include "app/ui/fonts_dialog.h"
 
 #include "app/ui/colors_dialog.h"
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
@@ -121,9 +122,7 @@ void CFontsDialog::LayOut()
     grid->addWidget(sample_, 6, 0, 1, 2);
     grid->setColumnStretch(1, 1);
     grid->setRowStretch(6, 1);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* whole = new QVBoxLayout(this);
     whole->addWidget(scroller, 1);
     whole->addWidget(buttons);

@@ -104,6 +104,11 @@ QIcon TouchTargetStyle::standardIcon(StandardPixmap which, const QStyleOption* o
             return ThemeIcon(u"dialog-warning");
         case SP_MessageBoxCritical:
             return ThemeIcon(u"dialog-error");
+        case SP_ToolBarHorizontalExtensionButton:
+        case SP_ToolBarVerticalExtensionButton:
+            return ThemeIcon(u"mirel-more");
+        case SP_LineEditClearButton:
+            return ThemeIcon(u"edit-clear");
         default:
             break;
         }

@@ -9,10 +9,8 @@
 #include "resources/ui/theme_icon.h"
 
 #include <QDir>
-#include <QGestureEvent>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMenu>
 #include <QResizeEvent>
 #include <QStackedWidget>
 #include <QStyle>
@@ -53,7 +51,6 @@ CLumoView::CLumoView(MainViewState& state, ShellActions& actions, QWidget* paren
     , pages_(new QStackedWidget(this))
     , list_(new EntryList(this))
     , emptyText_(new QLabel(this))
-    , welcome_(new WelcomePage(actions, this))
 {
     list_->setObjectName(QStringLiteral("entries"));
     search_->setObjectName(QStringLiteral("search"));
@@ -72,9 +69,8 @@ CLumoView::CLumoView(MainViewState& state, ShellActions& actions, QWidget* paren
     emptyText_->setAlignment(Qt::AlignCenter);
     emptyText_->setForegroundRole(QPalette::PlaceholderText);
     emptyText_->setTextFormat(Qt::PlainText);
-    for (QWidget* page :
-         {static_cast<QWidget*>(list_), static_cast<QWidget*>(emptyText_), static_cast<QWidget*>(welcome_)})
-        pages_->addWidget(page);
+    pages_->addWidget(list_);
+    pages_->addWidget(emptyText_);
 
     header_ = MakeHeader();
     buttonRow_ = MakeButtons();
@@ -146,11 +142,7 @@ void CLumoView::Connect()
             actions_.Of(ShellCommand::Open)->trigger();
     });
     connect(list_, &EntryList::EnterPressed, this, [this] { actions_.Of(ShellCommand::Open)->trigger(); });
-    connect(list_, &QWidget::customContextMenuRequested, this,
-            [this](const QPoint& position) { PopUpMenu(list_->viewport()->mapToGlobal(position)); });
-    connect(welcome_, &WelcomePage::RecentChosen, this, &CLumoView::RecentChosen);
-    list_->viewport()->grabGesture(Qt::TapAndHoldGesture);
-    list_->viewport()->installEventFilter(this);
+    actions_.OfferEntryMenu(*list_, state_);
     for (QAction* action : actions_.OfEntries())
         addAction(action); // their keys work while the view has the focus
 }
@@ -177,7 +169,20 @@ void CLumoView::ShowState()
 
 void CLumoView::ShowRecent(const QStringList& paths)
 {
-    welcome_->SetRecent(paths);
+    recent_ = paths;
+    if (welcome_)
+        welcome_->SetRecent(paths);
+}
+
+WelcomePage& CLumoView::Welcome()
+{
+    if (!welcome_) {
+        welcome_ = new WelcomePage(actions_, this);
+        welcome_->SetRecent(recent_);
+        pages_->addWidget(welcome_);
+        connect(welcome_, &WelcomePage::RecentChosen, this, &CLumoView::RecentChosen);
+    }
+    return *welcome_;
 }
 
 void CLumoView::SetLook(const ViewLook& look)
@@ -197,7 +202,7 @@ void CLumoView::ShowList()
     list_->SetRow(state_.SelectedRow());
     setFocusProxy(list_);
     if (!state_.HasDatabase()) {
-        pages_->setCurrentWidget(welcome_);
+        pages_->setCurrentWidget(&Welcome());
         setFocusProxy(welcome_);
     } else if (!state_.ShownEntries().empty()) {
         pages_->setCurrentWidget(list_);
@@ -241,30 +246,10 @@ void CLumoView::FitButtons()
     }
 }
 
-void CLumoView::PopUpMenu(QPoint globalPosition)
-{
-    QMenu menu(this);
-    actions_.FillMenu(menu, state_.Tab() == MainTab::Favorites ? ShellFavoritePopup : ShellEntryPopup);
-    menu.exec(globalPosition);
-}
-
 void CLumoView::resizeEvent(QResizeEvent* event)
 {
     QWidget::resizeEvent(event);
     FitButtons();
-}
-
-bool CLumoView::eventFilter(QObject* watched, QEvent* event)
-{
-    if (watched == list_->viewport() && event->type() == QEvent::Gesture) {
-        const auto* hold =
-            static_cast<QTapAndHoldGesture*>(static_cast<QGestureEvent*>(event)->gesture(Qt::TapAndHoldGesture));
-        if (hold && hold->state() == Qt::GestureFinished) {
-            PopUpMenu(hold->position().toPoint());
-            return true;
-        }
-    }
-    return QWidget::eventFilter(watched, event);
 }
 
 } // namespace mirel

@@ -37,7 +37,6 @@ Q_SIGNALS:
 
 protected:
     void resizeEvent(QResizeEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     QWidget* MakeHeader();
@@ -45,8 +44,8 @@ private:
     void Connect();
     void ShowList();
     void FitButtons();
-    void PopUpMenu(QPoint globalPosition);
     std::vector<EntryLine> Lines() const;
+    WelcomePage& Welcome();
 
     MainViewState& state_;
     ShellActions& actions_;
@@ -57,7 +56,8 @@ private:
     QStackedWidget* pages_;
     EntryList* list_;
     QLabel* emptyText_;
-    WelcomePage* welcome_;
+    WelcomePage* welcome_ = nullptr; // until no database is open
+    QStringList recent_;
     QWidget* header_;
     QWidget* buttonRow_;
     std::vector<QToolButton*> buttons_;

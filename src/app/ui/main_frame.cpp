@@ -138,10 +138,8 @@ void CMainFrame::MakeParts()
     side->setSpacing(0);
     side->addLayout(lines, 1);
     side->addWidget(Line(QFrame::VLine, sidePane_));
-    lists_ = new CLumoView(state_, *actions_, this);
-    emptyPage_ = new EmptyPage(*actions_, this);
     tabs_ = new ViewTabs([this](const ViewKey& key) { return MakeView(key); }, splitter_);
-    tabs_->SetHomes(emptyPage_, lists_);
+    tabs_->SetHomes({.withBar = [this] { return &Home(); }, .withoutBar = [this] { return &Lists(); }});
     splitter_->addWidget(sidePane_);
     splitter_->addWidget(tabs_);
     splitter_->setStretchFactor(0, 0);
@@ -152,6 +150,29 @@ void CMainFrame::MakeParts()
     column->addWidget(notice_);
     column->addWidget(splitter_, 1);
     setCentralWidget(whole);
+}
+
+CLumoView& CMainFrame::Lists()
+{
+    if (!lists_) {
+        lists_ = new CLumoView(state_, *actions_, tabs_);
+        tabs_->AddHome(lists_);
+        lists_->SetLook(LookOf(DisplayChoice(settings_, DisplayView::Main)));
+        lists_->ShowRecent(settings_.RecentDatabases());
+        connect(lists_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
+    }
+    return *lists_;
+}
+
+EmptyPage& CMainFrame::Home()
+{
+    if (!emptyPage_) {
+        emptyPage_ = new EmptyPage(*actions_, tabs_);
+        tabs_->AddHome(emptyPage_);
+        emptyPage_->Show(state_, settings_.RecentDatabases());
+        connect(emptyPage_, &EmptyPage::RecentChosen, this, &CMainFrame::OpenPath);
+    }
+    return *emptyPage_;
 }
 
 void CMainFrame::MakeMenus()
@@ -181,8 +202,6 @@ void CMainFrame::MakeMenus()
 void CMainFrame::Connect()
 {
     connect(actions_, &CommandActions::given, this, [this](int id) { RunCommand(CommandTable(), id, *this); });
-    connect(lists_, &CLumoView::RecentChosen, this, &CMainFrame::OpenPath);
-    connect(emptyPage_, &EmptyPage::RecentChosen, this, &CMainFrame::OpenPath);
     connect(sideBar_, &SideBar::selectionChanged, this, [this] { panel_->LookAt(state_.Selected()); });
     connect(tabs_, &ViewTabs::frontChanged, this, &CMainFrame::ShowFront);
     connect(tabs_, &ViewTabs::titleChanged, this, &CMainFrame::ShowTitle);
@@ -219,10 +238,13 @@ void CMainFrame::ShowState()
     FollowNames();
     const QStringList recent = settings_.RecentDatabases();
     recentMenu_->setEnabled(!recent.isEmpty());
-    lists_->ShowRecent(recent);
-    lists_->ShowState();
+    if (lists_) {
+        lists_->ShowRecent(recent);
+        lists_->ShowState();
+    }
     sideBar_->ShowState();
-    emptyPage_->Show(state_, recent);
+    if (emptyPage_)
+        emptyPage_->Show(state_, recent);
     panel_->LookAt(state_.Selected());
     panel_->setVisible(state_.HasDatabase());
     FollowTabs();
@@ -271,7 +293,8 @@ void CMainFrame::FitWidth()
     if (wide_ == IsWide())
         return;
     wide_ = IsWide();
-    const bool focusInLists = lists_->isAncestorOf(focusWidget()) || sideBar_->isAncestorOf(focusWidget());
+    const bool focusInLists =
+        (lists_ && lists_->isAncestorOf(focusWidget())) || sideBar_->isAncestorOf(focusWidget());
     sidePane_->setVisible(wide_ && !alone_);
     FitBar();
     ShowState();
@@ -369,7 +392,8 @@ void CMainFrame::FillWindowMenu()
 void CMainFrame::ShowLook()
 {
     const ViewLook look = LookOf(DisplayChoice(settings_, DisplayView::Main));
-    lists_->SetLook(look);
+    if (lists_)
+        lists_->SetLook(look);
     sideBar_->SetLook(look);
     for (HostedView* view : Views()) {
         if (auto* table = qobject_cast<CTableView*>(view))
@@ -447,10 +471,10 @@ void CMainFrame::ShowLists()
         sideBar_->setFocus();
     } else {
         tabs_->ShowHome();
-        lists_->setFocus();
+        Lists().setFocus();
     }
     if (!state_.HasDatabase() && wide_)
-        emptyPage_->setFocus();
+        Home().setFocus();
 }
 
 void CMainFrame::ShowKeyList()

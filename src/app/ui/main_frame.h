@@ -99,6 +99,8 @@ private:
     struct Commands;
 
     void MakeParts();
+    CLumoView& Lists();
+    EmptyPage& Home();
     void MakeMenus();
     void Connect();
     bool IsWide() const { return width() >= kLeastWideWidth; }
@@ -199,12 +201,12 @@ private:
     Profile& profile_;
     ShellActions* actions_;
     std::unique_ptr<OpenViews> openViews_;
-    CLumoView* lists_;
+    CLumoView* lists_ = nullptr; // of a narrow window; null until it is one
     QSplitter* splitter_;
     QWidget* sidePane_;
     SideBar* sideBar_;
     EntryPanel* panel_;
-    EmptyPage* emptyPage_;
+    EmptyPage* emptyPage_ = nullptr; // of a wide one; null until it shows
     ViewTabs* tabs_;
     QLabel* notice_;
     QMenu* fileMenu_;

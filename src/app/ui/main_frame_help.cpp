@@ -22,9 +22,7 @@ void CMainFrame::ShowTour()
 {
     if (findChild<Tour*>())
         return;
-    const auto lists = [this]() -> QWidget* {
-        return wide_ ? static_cast<QWidget*>(sideBar_) : static_cast<QWidget*>(lists_);
-    };
+    const auto lists = [this]() -> QWidget* { return wide_ ? static_cast<QWidget*>(sideBar_) : &Lists(); };
     const auto views = [this]() -> QWidget* { return wide_ ? tabs_ : nullptr; };
     const auto menus = [this]() -> QWidget* { return menuBar(); };
     new Tour({{Str::TourWelcomeTitle, Str::TourWelcome, {}},

@@ -4,6 +4,7 @@
 #include "app/ui/main_frame.h"
 #include "app/ui/view_tabs.h"
 #include "app/ui/view_window.h"
+#include "querybuilder/query_clauses.h"
 #include "querybuilder/statement_history.h"
 #include "querybuilder/ui/query_dialog.h"
 #include "tableview/ui/table_view.h"
@@ -89,20 +90,16 @@ WriteQuery CMainFrame::QueryWriter()
 // A form's query often has no FROM, which the form completes; that of a button stands behind its "SELECT *".
 bool CMainFrame::BuildFormQuery(MakerDialogs::Query& query, QWidget& window)
 {
-    const QString select = u"SELECT *"_s;
-    QueryRequest request{.nameUse = QueryRequest::Name::None, .statement = query.text, .table = query.table};
-    if (query.followsSelect) {
-        request.selectClause = select;
-        if (!query.text.trimmed().startsWith(u"SELECT", Qt::CaseInsensitive))
-            request.statement = select + u' ' + query.text;
-    }
+    const QString select = query.followsSelect ? u"SELECT *"_s : QString();
     StatementHistory history(profile_, ViewsKey());
-    const std::optional<EditedQuery> written = EditQuery(request, ServicesForQueries(history), window);
+    const std::optional<EditedQuery> written = EditQuery({.nameUse = QueryRequest::Name::None,
+                                                          .statement = query.text,
+                                                          .table = query.table,
+                                                          .selectClause = select},
+                                                         ServicesForQueries(history), window);
     if (!written)
         return false;
-    query.text = written->statement;
-    if (query.followsSelect && query.text.startsWith(select, Qt::CaseInsensitive))
-        query.text = query.text.mid(select.size()).trimmed();
+    query.text = query.followsSelect ? WithoutSelectClause(written->statement, select) : written->statement;
     return true;
 }
 

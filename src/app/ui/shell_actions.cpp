@@ -1,6 +1,10 @@
 #include "app/ui/shell_actions.h"
 
 #include "app/ui/main_frame.h"
+#include "platform/ui/hold_popup.h"
+
+#include <QAbstractScrollArea>
+#include <QMenu>
 
 namespace mirel {
 
@@ -35,6 +39,18 @@ void ShellActions::Follow(const MainViewState& state)
                           .tip = now.tip});
     }
     Q_EMIT followed();
+}
+
+void ShellActions::OfferEntryMenu(QAbstractScrollArea& list, const MainViewState& state)
+{
+    constexpr int kHoldMs = 700;
+    list.setContextMenuPolicy(Qt::CustomContextMenu);
+    new HoldPopup(list.viewport(), [] { return kHoldMs; });
+    connect(&list, &QWidget::customContextMenuRequested, this, [this, &list, &state](const QPoint& position) {
+        QMenu menu(&list);
+        FillMenu(menu, state.Tab() == MainTab::Favorites ? ShellFavoritePopup : ShellEntryPopup);
+        menu.exec(list.viewport()->mapToGlobal(position));
+    });
 }
 
 } // namespace mirel

@@ -5,6 +5,8 @@
 
 #include <QAction>
 
+class QAbstractScrollArea;
+
 namespace mirel {
 
 // Where the commands of the main window show.
@@ -32,6 +34,9 @@ public:
     std::vector<QAction*> OfEntries() const;
     // As the lists and their selection decide.
     void Follow(const MainViewState& state);
+    // The popup menu of the selected entry, by the right mouse button, a hold or a key. The state must outlive the
+    // list.
+    void OfferEntryMenu(QAbstractScrollArea& list, const MainViewState& state);
 
 Q_SIGNALS:
     void followed();

@@ -5,10 +5,8 @@
 #include "resources/string_table.h"
 #include "resources/ui/theme_icon.h"
 
-#include <QGestureEvent>
 #include <QKeyEvent>
 #include <QLineEdit>
-#include <QMenu>
 #include <QVBoxLayout>
 
 #include <algorithm>
@@ -84,10 +82,7 @@ void SideBar::Connect()
             actions_.Of(ShellCommand::Open)->trigger();
     });
     connect(tree_, &SideTree::EnterPressed, this, [this] { actions_.Of(ShellCommand::Open)->trigger(); });
-    connect(tree_, &QWidget::customContextMenuRequested, this,
-            [this](const QPoint& position) { PopUpMenu(tree_->viewport()->mapToGlobal(position)); });
-    tree_->viewport()->grabGesture(Qt::TapAndHoldGesture);
-    tree_->viewport()->installEventFilter(this);
+    actions_.OfferEntryMenu(*tree_, state_);
     search_->installEventFilter(this);
     for (QAction* action : actions_.OfEntries())
         tree_->addAction(action); // their keys
@@ -173,23 +168,8 @@ void SideBar::SetLook(const ViewLook& look)
     tree_->viewport()->setBackgroundRole(look.lists.background ? QPalette::Base : QPalette::Window);
 }
 
-void SideBar::PopUpMenu(QPoint globalPosition)
-{
-    QMenu menu(this);
-    actions_.FillMenu(menu, state_.Tab() == MainTab::Favorites ? ShellFavoritePopup : ShellEntryPopup);
-    menu.exec(globalPosition);
-}
-
 bool SideBar::eventFilter(QObject* watched, QEvent* event)
 {
-    if (watched == tree_->viewport() && event->type() == QEvent::Gesture) {
-        const auto* hold =
-            static_cast<QTapAndHoldGesture*>(static_cast<QGestureEvent*>(event)->gesture(Qt::TapAndHoldGesture));
-        if (hold && hold->state() == Qt::GestureFinished) {
-            PopUpMenu(hold->position().toPoint());
-            return true;
-        }
-    }
     if (watched == search_ && event->type() == QEvent::KeyPress) {
         const int key = static_cast<QKeyEvent*>(event)->key();
         if (key == Qt::Key_Down)

@@ -36,7 +36,6 @@ private:
     void Fill();
     void ShowSelection();
     void TakeSelection(const QTreeWidgetItem* item);
-    void PopUpMenu(QPoint globalPosition);
 
     MainViewState& state_;
     ShellActions& actions_;

@@ -74,13 +74,9 @@ ViewTabs::ViewTabs(MakeView make, QWidget* parent)
     connect(bar_, &QTabBar::tabCloseRequested, this, [this](int tab) { (void)Close(tab); });
 }
 
-void ViewTabs::SetHomes(QWidget* withBar, QWidget* withoutBar)
+void ViewTabs::AddHome(QWidget* page)
 {
-    homeWithBar_ = withBar;
-    homeWithoutBar_ = withoutBar;
-    stack_->addWidget(withBar);
-    stack_->addWidget(withoutBar);
-    ShowFront();
+    stack_->addWidget(page);
 }
 
 void ViewTabs::SetBarShown(bool shown)
@@ -289,11 +285,24 @@ void ViewTabs::Step(int by)
 void ViewTabs::ShowFront()
 {
     bar_->setVisible(barShown_ && Count() > 0);
-    if (HostedView* view = Front())
-        stack_->setCurrentWidget(view);
-    else if (homeWithBar_)
-        stack_->setCurrentWidget(barShown_ ? homeWithBar_ : homeWithoutBar_);
+    ShowPage();
     Q_EMIT frontChanged();
+}
+
+void ViewTabs::ShowPage()
+{
+    if (HostedView* view = Front())
+        return stack_->setCurrentWidget(view);
+    const std::function<QWidget*()>& makeHome = barShown_ ? homes_.withBar : homes_.withoutBar;
+    if (!isVisible() || !makeHome)
+        return;
+    stack_->setCurrentWidget(makeHome());
+}
+
+void ViewTabs::showEvent(QShowEvent* event)
+{
+    ShowPage();
+    QWidget::showEvent(event);
 }
 
 bool ViewTabs::ShowTitle(int tab)

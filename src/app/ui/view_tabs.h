@@ -24,8 +24,14 @@ public:
 
     ViewTabs(MakeView make, QWidget* parent);
 
-    // What shows when no view is in front: one page while the bar is there, another one where it is not.
-    void SetHomes(QWidget* withBar, QWidget* withoutBar);
+    // What shows when no view is in front: one page while the bar is there, another one where it is not. A page is
+    // asked for whenever it comes to show, so that none is made that nobody sees.
+    struct Homes {
+        std::function<QWidget*()> withBar;
+        std::function<QWidget*()> withoutBar;
+    };
+    void SetHomes(Homes homes) { homes_ = std::move(homes); }
+    void AddHome(QWidget* page); // one that has just been made
     // Without the bar the home page can be in front of the views.
     void SetBarShown(bool shown);
     bool IsBarShown() const { return barShown_; }
@@ -65,6 +71,7 @@ Q_SIGNALS:
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
 
 private:
     struct Tab {
@@ -75,14 +82,14 @@ private:
     int TabOf(const QObject* view) const;
     void Step(int by);
     void ShowFront();
+    void ShowPage();
     bool ShowTitle(int tab); // true: it is another one
     void Forget(int tab);
 
     MakeView make_;
     QTabBar* bar_;
     QStackedWidget* stack_;
-    QWidget* homeWithBar_ = nullptr;
-    QWidget* homeWithoutBar_ = nullptr;
+    Homes homes_;
     std::vector<Tab> tabs_; // in the order of the bar
     bool barShown_ = true;
     bool atHome_ = true; // while the bar is not there

@@ -3,6 +3,7 @@
 #include "app/language_choice.h"
 #include "app/settings.h"
 #include "platform/program_folder.h"
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
@@ -94,9 +95,7 @@ void ChooseLanguage(const ProgramFolder& folder, Settings& settings, QWidget& wi
     }
     auto* note = new QLabel(StringText(Str::LanguageNextStart), &dialog);
     note->setWordWrap(true);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
-    QObject::connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
-    QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(dialog);
     QObject::connect(list, &QListWidget::itemDoubleClicked, &dialog, &QDialog::accept);
     auto* lines = new QVBoxLayout(&dialog);
     for (QWidget* part : {static_cast<QWidget*>(prompt), static_cast<QWidget*>(list), static_cast<QWidget*>(note),

@@ -76,8 +76,8 @@ QWidget* ImportFieldsPage::MakeList()
                             StringText(Str::ImportColumnType), StringText(Str::ImportColumnSize),
                             StringText(Str::ImportColumnData)});
     list_->setSizePolicy(QSizePolicy::Expanding,
-                         QSizePolicy::Ignored); // what is below must fit a small screen too
-    list_->setMinimumHeight(5 * fontMetrics().height());
+                         QSizePolicy::Ignored);          // what is below must fit a small screen too
+    list_->setMinimumHeight(7 * fontMetrics().height()); // three rows
     list_->header()->setMinimumSectionSize(fontMetrics().height());
     return list_;
 }

@@ -1,5 +1,6 @@
 #include "csvimport/ui/import_options_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/scrolled_page.h"
 #include "resources/string_table.h"
 
@@ -93,9 +94,7 @@ void CImportOptionsDialog::LayOut()
         each->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
         each->setRowWrapPolicy(QFormLayout::WrapLongRows);
     }
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* column = new QVBoxLayout(this);
     column->addWidget(Scrolled(page), 1);
     column->addWidget(buttons);

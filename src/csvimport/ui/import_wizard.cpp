@@ -4,24 +4,16 @@
 #include "csvimport/ui/fields_page.h"
 #include "csvimport/ui/separator_page.h"
 #include "csvimport/ui/source_page.h"
-#include "platform/ui/look_roles.h"
-#include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
-#include <QCoreApplication>
-#include <QDialogButtonBox>
 #include <QDragEnterEvent>
 #include <QDropEvent>
 #include <QGuiApplication>
 #include <QInputMethod>
-#include <QLabel>
 #include <QMimeData>
 #include <QPushButton>
-#include <QScreen>
-#include <QStackedWidget>
 #include <QUrl>
-#include <QVBoxLayout>
 
 #include <algorithm>
 #include <array>
@@ -33,66 +25,26 @@ using namespace Qt::StringLiterals;
 
 constexpr QSize kFirstSize(640, 480);
 
-struct Step {
-    Str title;
-    Str goOn; // what the forward button says
-};
 constexpr std::array kSteps = {
-    Step{Str::ImportStepSource, Str::WizardNext}, Step{Str::ImportStepSeparator, Str::WizardNext},
-    Step{Str::ImportStepDestination, Str::WizardNext}, Step{Str::ImportStepFields, Str::ImportRun}};
+    WizardStep{Str::ImportStepSource, Str::WizardNext}, WizardStep{Str::ImportStepSeparator, Str::WizardNext},
+    WizardStep{Str::ImportStepDestination, Str::WizardNext}, WizardStep{Str::ImportStepFields, Str::ImportRun}};
 
 } // namespace
 
 CImportWizard::CImportWizard(ImportDraft& draft, UserPrompt& prompt, const QString& near, QWidget* parent)
-    : QDialog(parent)
+    : Wizard(kSteps, kFirstSize, parent)
     , draft_(draft)
-    , heading_(new QLabel(this))
-    , pages_(new QStackedWidget(this))
-    , back_(new QPushButton(StringText(Str::WizardBack), this))
-    , next_(new QPushButton(this))
     , sourcePage_(new ImportSourcePage(draft, near, this))
-    , steps_({sourcePage_, new ImportSeparatorPage(draft, prompt, this),
+    , pages_({sourcePage_, new ImportSeparatorPage(draft, prompt, this),
               new ImportDestinationPage(draft, prompt, this), new ImportFieldsPage(draft, prompt, this)})
 {
     setWindowTitle(StringText(Str::ImportTitle));
     setAcceptDrops(true);
-    for (ImportPage* page : steps_) {
-        pages_->addWidget(Scrolled(page));
+    for (ImportPage* page : pages_) {
+        AddPage(page);
         connect(page, &ImportPage::StateChanged, this, &CImportWizard::ShowState);
     }
-    LayOut();
-    ShowStep(0);
-}
-
-void CImportWizard::LayOut()
-{
-    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
-    QFont bold = heading_->font();
-    bold.setBold(true);
-    heading_->setFont(bold);
-    heading_->setWordWrap(true);
-    auto* buttons = new QHBoxLayout;
-    buttons->addWidget(cancel);
-    buttons->addStretch(1);
-    buttons->addWidget(back_);
-    buttons->addWidget(next_);
-    auto* column = new QVBoxLayout(this);
-    column->addWidget(heading_);
-    column->addWidget(pages_, 1);
-    column->addLayout(buttons);
-    for (QPushButton* button : {cancel, back_, next_}) { // three of them stand side by side on a small screen
-        button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
-        button->setMinimumWidth(4 * fontMetrics().height());
-    }
-    cancel->setMinimumWidth( // it is the longest in some languages
-        std::max(cancel->minimumWidth(), fontMetrics().horizontalAdvance(cancel->text()) + spacing::kWide));
-    next_->setDefault(true);
-    for (QPushButton* button : {cancel, back_})
-        button->setAutoDefault(false);
-    connect(cancel, &QPushButton::clicked, this, &QDialog::reject);
-    connect(back_, &QPushButton::clicked, this, [this] { ShowStep(step_ - 1); });
-    connect(next_, &QPushButton::clicked, this, &CImportWizard::GoOn);
-    resize(kFirstSize.boundedTo(screen()->availableSize()));
+    CImportWizard::ShowStep(0);
 }
 
 void CImportWizard::Begin(const ImportSource& source)
@@ -104,41 +56,35 @@ void CImportWizard::Begin(const ImportSource& source)
 
 void CImportWizard::ShowStep(int step)
 {
-    steps_[size_t(step_)]->Leave();
-    step_ = std::clamp(step, 0, int(kSteps.size()) - 1);
-    pages_->setCurrentIndex(step_);
-    const Step& shown = kSteps[size_t(step_)];
-    heading_->setText(StringText(
-        Str::WizardStep, {StringText(shown.title), QString::number(step_ + 1), QString::number(kSteps.size())}));
-    next_->setText(StringText(shown.goOn));
-    back_->setEnabled(step_ > 0);
+    Page().Leave();
+    Wizard::ShowStep(step);
     ShowState();
-    if (next_->isEnabled())
-        next_->setFocus();
-    steps_[size_t(step_)]->Enter();
+    if (NextButton()->isEnabled())
+        NextButton()->setFocus();
+    Page().Enter();
 }
 
 void CImportWizard::ShowState()
 {
-    next_->setEnabled(steps_[size_t(step_)]->CanGoOn());
+    NextButton()->setEnabled(Page().CanGoOn());
 }
 
 void CImportWizard::GoOn()
 {
-    if (!steps_[size_t(step_)]->MayLeave())
+    if (!Page().MayLeave())
         return;
-    if (step_ + 1 < int(kSteps.size()))
-        ShowStep(step_ + 1);
-    else
+    if (IsLastStep())
         Import();
+    else
+        ShowStep(CurrentStep() + 1);
 }
 
 void CImportWizard::Import()
 {
-    steps_[size_t(step_)]->Leave(); // no trial while it runs
+    Page().Leave(); // no trial while it runs
     const ImportDraft::Outcome outcome = draft_.Run();
     if (outcome == ImportDraft::Outcome::Nothing) {
-        steps_[size_t(step_)]->Enter();
+        Page().Enter();
         return;
     }
     QGuiApplication::inputMethod()->hide();

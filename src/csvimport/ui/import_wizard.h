@@ -1,16 +1,12 @@
 #pragma once
 
 #include "csvimport/import_draft.h"
-
-#include <QDialog>
+#include "platform/ui/wizard.h"
 
 #include <optional>
 #include <vector>
 
-class QLabel;
 class QMimeData;
-class QPushButton;
-class QStackedWidget;
 
 namespace mirel {
 
@@ -19,7 +15,7 @@ class ImportSourcePage;
 
 // "Import": the steps of reading a CSV file into a table, over the draft, which must outlive it. A file may be
 // dropped on it.
-class CImportWizard : public QDialog {
+class CImportWizard : public Wizard {
     Q_OBJECT
 
 public:
@@ -33,20 +29,15 @@ protected:
     void dropEvent(QDropEvent* event) override;
 
 private:
-    void LayOut();
-    void ShowStep(int step); // from 0
+    void ShowStep(int step) override;
+    void GoOn() override;
     void ShowState();
-    void GoOn();
     void Import();
+    ImportPage& Page() const { return *pages_[size_t(CurrentStep())]; }
 
     ImportDraft& draft_;
-    QLabel* heading_;
-    QStackedWidget* pages_;
-    QPushButton* back_;
-    QPushButton* next_;
     ImportSourcePage* sourcePage_;
-    std::vector<ImportPage*> steps_;
-    int step_ = 0;
+    std::vector<ImportPage*> pages_; // one for each step
 };
 
 // The one file that a drag carries, if an import could read it; empty otherwise.

@@ -6,6 +6,7 @@
 #include "forms/design/new_controls.h"
 #include "forms/ui/expression_field.h"
 #include "forms/ui/expression_highlighter.h"
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/look_roles.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -154,9 +155,7 @@ void CExpressionDesk::LayOut()
     texts->addWidget(neighbors_);
     values->addLayout(texts, 1);
     values->addWidget(next_);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* column = new QVBoxLayout(this);
     const int margin = small ? spacing::kTight : spacing::kRoom;
     column->setContentsMargins(margin, margin, margin, margin);

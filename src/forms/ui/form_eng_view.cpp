@@ -71,7 +71,7 @@ CFormEngView::CFormEngView(const FormCall& call, const FormSurroundings& surroun
     connect(surface_, &FormSurface::popupRequested, this, &CFormEngView::ShowPopup);
     connect(surface_, &FormSurface::focusMoved, this, [this](QWidget* widget) {
         lastFocused_ = surface_->ControlOf(widget);
-        scroller_->ensureWidgetVisible(widget, 0, widget->height() / 2);
+        ShowControl(*widget);
         ShowActions();
         ShowReason();
     });
@@ -125,7 +125,12 @@ bool CFormEngView::Open()
     const bool opened = form_.Open();
     QApplication::restoreOverrideCursor();
     ShowState();
-    surface_->FocusFirstInput();
+    BeginAtTop();
+    // Once the window has its size; by then the user may be elsewhere.
+    QTimer::singleShot(0, this, [this, first = surface_->focusWidget()] {
+        if (surface_->focusWidget() == first)
+            BeginAtTop();
+    });
     if (form_.HasClock())
         clock_.start(kClockMs, this);
     if (form_.Form().raiseInputPanel != 0)
@@ -269,7 +274,7 @@ void CFormEngView::ShowPage(Page page)
     stack_->setCurrentIndex(int(page));
     ShowState();
     if (page == Page::Form)
-        surface_->FocusFirstInput();
+        BeginAtTop();
     else
         stack_->currentWidget()->setFocus();
 }
@@ -322,6 +327,20 @@ void CFormEngView::FitSurface()
     if (scale != surface_->Scale())
         surface_->SetScale(scale);
     ShowActions();
+}
+
+// A form is shown from its top, and the focus is where that can be seen.
+void CFormEngView::BeginAtTop()
+{
+    scroller_->verticalScrollBar()->setValue(0);
+    surface_->FocusFirstInput(scroller_->viewport()->height());
+    if (QWidget* control = surface_->focusWidget())
+        ShowControl(*control);
+}
+
+void CFormEngView::ShowControl(QWidget& control)
+{
+    scroller_->ensureWidgetVisible(&control, 0, control.height() / 2);
 }
 
 void CFormEngView::ShowScrollBar(bool shown)

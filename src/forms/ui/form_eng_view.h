@@ -97,6 +97,8 @@ private:
     void ShowList();
     void SortByHeader(int field);
     void FitSurface();
+    void BeginAtTop();
+    void ShowControl(QWidget& control);
     void Scroll(int steps);
     bool HasScrollBar() const;
     void ShowScrollBar(bool shown);

@@ -1,5 +1,6 @@
 #include "forms/ui/form_options_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/look_roles.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
@@ -89,9 +90,7 @@ void CFormOptionsDialog::LayOut()
     column->addWidget(words_);
     column->addStretch(1);
 
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     // A small screen scrolls the options and keeps the buttons in sight.
     auto* whole = new QVBoxLayout(this);
     whole->setContentsMargins(margin, margin, margin, margin);

@@ -210,23 +210,30 @@ bool FormSurface::IsComputed(int control) const
     });
 }
 
-// The record counter is first in most lists; nobody begins with it.
-void FormSurface::FocusFirstInput()
+// The record counter is first in most lists; nobody begins with it, nor where the top of the form is out of sight
+// if there is a choice.
+void FormSurface::FocusFirstInput(int heightPx)
 {
-    QWidget* first = nullptr;
-    for (int i = 0; i < int(widgets_.size()); ++i) {
-        QWidget* widget = WidgetOf(i);
+    enum Rank { KeptInSight, UsedInSight, Kept, Any, None };
+    const auto rankOf = [this, heightPx](int control) {
+        const QWidget* widget = WidgetOf(control);
         if (widget->focusPolicy() == Qt::NoFocus || widget->isHidden())
-            continue;
-        if (!first)
-            first = widget;
-        if (IsInput(i) && form_.Controls()[size_t(i)].keepsInput) {
-            first = widget;
-            break;
-        }
+            return None;
+        const ControlRun& run = form_.Controls()[size_t(control)];
+        const bool isInSight = widget->geometry().bottom() < heightPx;
+        const bool isKept = IsInput(control) && run.keepsInput;
+        const bool isUsed = (IsInput(control) && !IsComputed(control)) || run.type == ControlType::List;
+        if (isInSight && isUsed)
+            return isKept ? KeptInSight : UsedInSight;
+        return isKept ? Kept : Any;
+    };
+    int best = -1;
+    for (int control = 0; control < int(widgets_.size()); ++control) {
+        if (rankOf(control) < (best < 0 ? None : rankOf(best)))
+            best = control;
     }
-    if (first)
-        first->setFocus(Qt::TabFocusReason);
+    if (best >= 0)
+        WidgetOf(best)->setFocus(Qt::TabFocusReason);
 }
 
 void FormSurface::FocusControl(int control)

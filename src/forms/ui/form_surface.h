@@ -32,7 +32,9 @@ public:
     QWidget* WidgetOf(int control) const { return widgets_[size_t(control)]->Main(); }
     int ControlOf(const QObject* widget) const; // -1: none of them, nor within one
     int FocusedControl() const;                 // -1: none
-    void FocusFirstInput();
+    // The first box that a record's value is kept in; if there are only others in the top `heightPx`, one of
+    // those.
+    void FocusFirstInput(int heightPx = QWIDGETSIZE_MAX);
     void FocusControl(int control);
     // Gives a control its text of before back. False when it has that already.
     bool Revert(int control);

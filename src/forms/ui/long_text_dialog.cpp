@@ -1,5 +1,6 @@
 #include "forms/ui/long_text_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/memo_edit.h"
 #include "platform/ui/window_place.h"
 
@@ -30,9 +31,7 @@ std::optional<QString> EditLongText(const LongText& longText, QWidget& parent)
     editor->setAccessibleName(longText.title);
     if (longText.typed)
         QObject::connect(editor, &MemoEdit::edited, &dialog, longText.typed);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, &dialog);
-    QObject::connect(buttons, &QDialogButtonBox::accepted, &dialog, &QDialog::accept);
-    QObject::connect(buttons, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(dialog);
     // Enter makes a line here, so the text is taken with it and Ctrl.
     for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter})
         QObject::connect(new QShortcut(Qt::CTRL | key, &dialog), &QShortcut::activated, &dialog, &QDialog::accept);

@@ -7266,5 +7266,80 @@ Möchten Sie die Datei ersetzen?</translation>
         <extracomment>LanguageNextStart</extracomment>
         <translation>Mirel spricht sie ab dem nächsten Start.</translation>
     </message>
+    <message id="67800">
+        <source>No such file or directory</source>
+        <extracomment>ReasonNotThere</extracomment>
+        <translation>Datei oder Ordner nicht gefunden</translation>
+    </message>
+    <message id="67801">
+        <source>Permission denied</source>
+        <extracomment>ReasonNoPermission</extracomment>
+        <translation>Keine Berechtigung</translation>
+    </message>
+    <message id="67802">
+        <source>Operation not permitted</source>
+        <extracomment>ReasonNotPermitted</extracomment>
+        <translation>Vorgang nicht erlaubt</translation>
+    </message>
+    <message id="67803">
+        <source>No space left on device</source>
+        <extracomment>ReasonDiskFull</extracomment>
+        <translation>Auf dem Datenträger ist kein Platz mehr</translation>
+    </message>
+    <message id="67804">
+        <source>Disk quota exceeded</source>
+        <extracomment>ReasonQuota</extracomment>
+        <translation>Das zugeteilte Speicherkontingent ist erschöpft</translation>
+    </message>
+    <message id="67805">
+        <source>Read-only file system</source>
+        <extracomment>ReasonReadOnlyDisk</extracomment>
+        <translation>Der Datenträger ist schreibgeschützt</translation>
+    </message>
+    <message id="67806">
+        <source>Is a directory</source>
+        <extracomment>ReasonIsFolder</extracomment>
+        <translation>Das ist ein Ordner</translation>
+    </message>
+    <message id="67807">
+        <source>Not a directory</source>
+        <extracomment>ReasonNoFolder</extracomment>
+        <translation>Ein Teil des Pfads ist kein Ordner</translation>
+    </message>
+    <message id="67808">
+        <source>File exists</source>
+        <extracomment>ReasonExists</extracomment>
+        <translation>Die Datei gibt es schon</translation>
+    </message>
+    <message id="67809">
+        <source>File name too long</source>
+        <extracomment>ReasonNameTooLong</extracomment>
+        <translation>Der Dateiname ist zu lang</translation>
+    </message>
+    <message id="67810">
+        <source>File too large</source>
+        <extracomment>ReasonFileTooLarge</extracomment>
+        <translation>Die Datei ist zu groß</translation>
+    </message>
+    <message id="67811">
+        <source>Device or resource busy</source>
+        <extracomment>ReasonBusy</extracomment>
+        <translation>Gerät oder Datei wird gerade benutzt</translation>
+    </message>
+    <message id="67812">
+        <source>Too many open files</source>
+        <extracomment>ReasonTooManyFiles</extracomment>
+        <translation>Zu viele offene Dateien</translation>
+    </message>
+    <message id="67813">
+        <source>Input/output error</source>
+        <extracomment>ReasonDiskFault</extracomment>
+        <translation>Ein-/Ausgabefehler des Datenträgers</translation>
+    </message>
+    <message id="67814">
+        <source>Connection timed out</source>
+        <extracomment>ReasonTimeIsUp</extracomment>
+        <translation>Zeitüberschreitung</translation>
+    </message>
 </context>
 </TS>

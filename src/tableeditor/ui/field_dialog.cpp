@@ -1,6 +1,7 @@
 #include "tableeditor/ui/field_dialog.h"
 
 #include "data/field_names.h"
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -68,9 +69,7 @@ void CFieldDialog::LayOut()
     form->addRow(StringText(Str::DesignFieldType), type_);
     form->addRow(StringText(Str::DesignFieldSize), size_);
     form->addRow(StringText(Str::DesignFieldIndexed), index_);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* column = new QVBoxLayout(this);
     column->addWidget(Scrolled(page), 1);
     column->addWidget(buttons);

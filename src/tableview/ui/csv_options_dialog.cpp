@@ -1,5 +1,6 @@
 #include "tableview/ui/csv_options_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/scrolled_page.h"
 #include "resources/string_table.h"
 
@@ -88,9 +89,7 @@ void CCsvOptionsDialog::LayOut()
         each->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
         each->setRowWrapPolicy(QFormLayout::WrapLongRows);
     }
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* column = new QVBoxLayout(this);
     column->addWidget(Scrolled(page), 1);
     column->addWidget(buttons);

@@ -2,8 +2,6 @@
 
 #include "platform/ui/elided_label.h"
 #include "platform/ui/file_choice.h"
-#include "platform/ui/look_roles.h"
-#include "platform/ui/scrolled_page.h"
 #include "platform/ui/wait_cursor.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
@@ -12,8 +10,6 @@
 
 #include <QCheckBox>
 #include <QComboBox>
-#include <QCoreApplication>
-#include <QDialogButtonBox>
 #include <QDir>
 #include <QGridLayout>
 #include <QHeaderView>
@@ -21,8 +17,6 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QRadioButton>
-#include <QScreen>
-#include <QStackedWidget>
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
@@ -36,12 +30,8 @@ using namespace Qt::StringLiterals;
 
 constexpr QSize kFirstSize(600, 440);
 
-struct Step {
-    Str title;
-    Str goOn; // what the forward button says
-};
-constexpr std::array kSteps = {Step{Str::ExportStepSource, Str::WizardNext},
-                               Step{Str::ExportStepSeparator, Str::ExportRun}};
+constexpr std::array kSteps = {WizardStep{Str::ExportStepSource, Str::WizardNext},
+                               WizardStep{Str::ExportStepSeparator, Str::ExportRun}};
 
 struct Separator {
     QChar character;
@@ -99,55 +89,19 @@ QString FileNameOf(QString name, ExportKind kind)
 
 CExportWizard::CExportWizard(ExportDraft& draft, QString name, QString near, WriteQuery writeQuery,
                              QWidget* parent)
-    : QDialog(parent)
+    : Wizard(kSteps, kFirstSize, parent)
     , draft_(draft)
     , name_(std::move(name))
     , near_(std::move(near))
     , writeQuery_(std::move(writeQuery))
-    , heading_(new QLabel(this))
-    , pages_(new QStackedWidget(this))
     , path_(new ElidedLabel(this))
     , preview_(new QListWidget(this))
     , saveAs_(new QPushButton(StringText(Str::ExportSaveAs), this))
-    , back_(new QPushButton(StringText(Str::WizardBack), this))
-    , next_(new QPushButton(this))
 {
     setWindowTitle(StringText(Str::ExportTitle));
     for (QWidget* page : {SourcePage(), SeparatorPage()})
-        pages_->addWidget(Scrolled(page));
-    LayOut();
-    ShowStep(0);
-}
-
-void CExportWizard::LayOut()
-{
-    auto* cancel = new QPushButton(QCoreApplication::translate("QPlatformTheme", "Cancel"), this);
-    QFont bold = heading_->font();
-    bold.setBold(true);
-    heading_->setFont(bold);
-    heading_->setWordWrap(true);
-    auto* buttons = new QHBoxLayout;
-    buttons->addWidget(cancel);
-    buttons->addStretch(1);
-    buttons->addWidget(back_);
-    buttons->addWidget(next_);
-    auto* column = new QVBoxLayout(this);
-    column->addWidget(heading_);
-    column->addWidget(pages_, 1);
-    column->addLayout(buttons);
-    for (QPushButton* button : {cancel, back_, next_}) { // three of them stand side by side on a small screen
-        button->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Fixed);
-        button->setMinimumWidth(4 * fontMetrics().height());
-    }
-    cancel->setMinimumWidth( // it is the longest in some languages
-        std::max(cancel->minimumWidth(), fontMetrics().horizontalAdvance(cancel->text()) + spacing::kWide));
-    next_->setDefault(true);
-    for (QPushButton* button : {cancel, back_})
-        button->setAutoDefault(false);
-    connect(cancel, &QPushButton::clicked, this, &QDialog::reject);
-    connect(back_, &QPushButton::clicked, this, [this] { ShowStep(0); });
-    connect(next_, &QPushButton::clicked, this, &CExportWizard::GoOn);
-    resize(kFirstSize.boundedTo(screen()->availableSize()));
+        AddPage(page);
+    CExportWizard::ShowStep(0);
 }
 
 QWidget* CExportWizard::SourcePage()
@@ -286,16 +240,11 @@ QWidget* CExportWizard::Separators(QWidget* page)
 
 void CExportWizard::ShowStep(int step)
 {
-    pages_->setCurrentIndex(step);
-    const Step& shown = kSteps[size_t(step)];
-    heading_->setText(StringText(
-        Str::WizardStep, {StringText(shown.title), QString::number(step + 1), QString::number(kSteps.size())}));
-    next_->setText(StringText(shown.goOn));
-    back_->setEnabled(step > 0);
+    Wizard::ShowStep(step);
     ShowState();
-    if (step > 0)
+    if (CurrentStep() > 0)
         ShowPreview();
-    (next_->isEnabled() ? next_ : saveAs_)->setFocus();
+    (NextButton()->isEnabled() ? NextButton() : saveAs_)->setFocus();
 }
 
 void CExportWizard::ShowState()
@@ -303,7 +252,7 @@ void CExportWizard::ShowState()
     const QString path = QDir::toNativeSeparators(draft_.Path());
     path_->SetText(path.isEmpty() ? QString() : StringText(Str::ExportPath, {path}));
     path_->setToolTip(path);
-    next_->setEnabled(draft_.CanRun());
+    NextButton()->setEnabled(draft_.CanRun());
     csvOptions_->setVisible(draft_.Options().kind == ExportKind::Csv);
 }
 
@@ -324,8 +273,8 @@ void CExportWizard::ChoosePath()
                            .near = path,
                            .name = FileNameOf(name_, draft_.Options().kind)}));
     ShowState();
-    if (next_->isEnabled())
-        next_->setFocus();
+    if (NextButton()->isEnabled())
+        NextButton()->setFocus();
 }
 
 void CExportWizard::ChooseOptions()
@@ -340,8 +289,8 @@ void CExportWizard::ChooseOptions()
 
 void CExportWizard::GoOn()
 {
-    if (pages_->currentIndex() == 0)
-        ShowStep(1);
+    if (!IsLastStep())
+        ShowStep(CurrentStep() + 1);
     else if (draft_.Run(draft_.Options().kind == ExportKind::Pdf ? ExportPdf : ExportCsv))
         accept();
 }

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "platform/ui/wizard.h"
 #include "tableview/export_draft.h"
 #include "tableview/ui/query_writer.h"
-
-#include <QDialog>
 
 #include <vector>
 
@@ -12,7 +11,6 @@ class QListWidget;
 class QPushButton;
 class QRadioButton;
 class QCheckBox;
-class QStackedWidget;
 class QTreeWidget;
 
 namespace mirel {
@@ -20,7 +18,7 @@ namespace mirel {
 class ElidedLabel;
 
 // "Export": the two steps of writing a result as a file, over the draft, which must outlive it.
-class CExportWizard : public QDialog {
+class CExportWizard : public Wizard {
     Q_OBJECT
 
 public:
@@ -34,22 +32,19 @@ private:
     QWidget* SeparatorPage();
     QWidget* Separators(QWidget* page);
     QWidget* Kinds(QWidget* page);
-    void LayOut();
-    void ShowStep(int step); // from 0
+    void ShowStep(int step) override;
+    void GoOn() override;
     void ShowSource();
     void ChooseSource();
     void ShowState();
     void ShowPreview();
     void ChoosePath();
     void ChooseOptions();
-    void GoOn();
 
     ExportDraft& draft_;
     QString name_;
     QString near_;
     WriteQuery writeQuery_;
-    QLabel* heading_;
-    QStackedWidget* pages_;
     ElidedLabel* source_ = nullptr;
     QTreeWidget* fields_ = nullptr;
     QLabel* count_ = nullptr;
@@ -57,8 +52,6 @@ private:
     QListWidget* preview_;
     QPushButton* saveAs_;
     QWidget* csvOptions_ = nullptr; // what is chosen for CSV alone
-    QPushButton* back_;
-    QPushButton* next_;
 };
 
 // Opens the wizard over `window` on the records of a statement, and comes back when it is done with.

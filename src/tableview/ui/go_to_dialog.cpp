@@ -1,5 +1,6 @@
 #include "tableview/ui/go_to_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/window_place.h"
 #include "resources/string_table.h"
 
@@ -26,11 +27,9 @@ CGoToDialog::CGoToDialog(qint64 record, QWidget* parent)
     for (const Str text :
          {Str::GoToFirstChoice, Str::GoToLastChoice, Str::GoToPreviousChoice, Str::GoToNextChoice})
         column->addWidget(AddChoice(StringText(text)));
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     column->addStretch(1);
     column->addWidget(buttons);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
 
     static const QRegularExpression digits(QStringLiteral("\\d{0,18}"));
     number_->setValidator(new QRegularExpressionValidator(digits, number_));

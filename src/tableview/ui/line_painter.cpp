@@ -22,18 +22,19 @@ LinePainter::LinePainter(const QFont& font)
     : metrics_(font)
     , raw_(QRawFont::fromFont(font))
 {
-    QString letters;
-    for (char16_t letter = u' '; letter < kFirstUnknown; ++letter)
-        letters += QChar(letter);
-    const QList<quint32> glyphs = raw_.glyphIndexesForString(letters);
-    const QList<QPointF> advances = raw_.advancesForGlyphIndexes(glyphs);
-    if (glyphs.size() != letters.size() || advances.size() != glyphs.size())
-        return;
-    for (qsizetype i = 0; i < letters.size(); ++i) {
-        const bool isDrawn = glyphs[i] != 0 && letters[i].isPrint();
-        glyphs_[letters[i].unicode()] = glyphs[i];
-        advances_[letters[i].unicode()] = isDrawn ? float(advances[i].x()) : 0.0F;
+}
+
+const LinePainter::Glyph& LinePainter::LookUp(QChar letter) const
+{
+    Glyph& glyph = glyphs_[letter.unicode()];
+    glyph.isKnown = true;
+    const QList<quint32> indexes = raw_.glyphIndexesForString(letter);
+    const QList<QPointF> advances = raw_.advancesForGlyphIndexes(indexes);
+    if (indexes.size() == 1 && advances.size() == 1 && indexes[0] != 0 && letter.isPrint()) {
+        glyph.index = indexes[0];
+        glyph.advance = float(advances[0].x());
     }
+    return glyph;
 }
 
 bool LinePainter::IsPlain(QStringView text) const
@@ -85,7 +86,7 @@ void LinePainter::DrawGlyphs(QPainter& painter, QPointF baseline, QStringView te
     runPositions_.clear();
     qreal x = 0;
     for (const QChar letter : text) {
-        runGlyphs_.push_back(glyphs_[letter.unicode()]);
+        runGlyphs_.push_back(glyphs_[letter.unicode()].index);
         runPositions_.emplace_back(x, 0);
         x += AdvanceOf(letter);
     }

@@ -1,5 +1,6 @@
 #include "tableview/ui/open_query_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "resources/string_table.h"
 
 #include <QDialogButtonBox>
@@ -24,13 +25,11 @@ COpenQueryDialog::COpenQueryDialog(const QStringList& names, QWidget* parent)
     auto* label = new QLabel(StringText(Str::OpenQueryPrompt), this);
     label->setBuddy(list_);
     label->setWordWrap(true);
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     auto* column = new QVBoxLayout(this);
     column->addWidget(label);
     column->addWidget(list_, 1);
     column->addWidget(buttons);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     connect(list_, &QListWidget::itemActivated, this, &QDialog::accept);
     list_->setFocus();
 }

@@ -1,5 +1,6 @@
 #include "tableview/ui/options_dialog.h"
 
+#include "platform/ui/dialog_buttons.h"
 #include "platform/ui/look_roles.h"
 #include "platform/ui/scrolled_page.h"
 #include "platform/ui/window_place.h"
@@ -91,9 +92,7 @@ void COptionsDialog::LayOut()
     column->addLayout(holdRow);
     column->addWidget(sortByHeader_);
 
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
     column->addStretch(1);
     // A small screen scrolls the options and keeps the buttons in sight.
     QWidget* scroller = Scrolled(page);

@@ -371,18 +371,18 @@ void RecordGrid::PaintNumber(QPainter& painter, int column, const QRect& inner, 
 
 void RecordGrid::PaintGridLines(QPainter& painter, const QRect& dirty) const
 {
-    painter.setPen(ColorOfRole(LookRole::Line, palette()));
+    const QColor color = ColorOfRole(LookRole::Line, palette());
     const int bottom = browser_.Page().RowCount() * rowHeightPx_ - 1;
     const int right = layout_.TotalPx() - horizontalScrollBar()->value() - 1;
     for (int y = rowHeightPx_ - 1; y <= std::min(bottom, dirty.bottom()); y += rowHeightPx_)
-        painter.drawLine(0, y, right, y);
+        painter.fillRect(0, y, right + 1, 1, color); // many times quicker than a line
     if (bottom < 0)
         return;
     int x = -horizontalScrollBar()->value() - 1;
     for (int column = 0; column < layout_.Count(); ++column) {
         x += layout_.WidthPx(column);
         if (x >= dirty.left() && x <= dirty.right())
-            painter.drawLine(x, 0, x, bottom);
+            painter.fillRect(x, 0, 1, bottom + 1, color);
     }
 }
 

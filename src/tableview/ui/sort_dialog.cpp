@@ -1,6 +1,7 @@
 #include "tableview/ui/sort_dialog.h"
 
 #include "data/filter_condition.h"
+#include "platform/ui/dialog_buttons.h"
 #include "resources/string_table.h"
 #include "tableview/ui/field_chooser.h"
 #include "tableview/ui/pick_box.h"
@@ -23,7 +24,7 @@ CSortDialog::CSortDialog(FieldLists& lists, const QString& table, const QString&
     chooser->Choose(table, field);
     auto* directions = new PickBox(this);
     directions->addItems({u"ASC"_s, u"DESC"_s});
-    auto* buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this);
+    QDialogButtonBox* buttons = OkAndCancel(*this);
 
     auto* form = new QFormLayout;
     form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
@@ -40,8 +41,6 @@ CSortDialog::CSortDialog(FieldLists& lists, const QString& table, const QString&
             [this, chooser] { Insert(SortFieldInsertion(terms_->text(), chooser->Table(), chooser->Field())); });
     connect(directions, &QComboBox::textActivated, this,
             [this](const QString& word) { Insert(WordInsertion(terms_->text(), word)); });
-    connect(buttons, &QDialogButtonBox::accepted, this, &QDialog::accept);
-    connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
     terms_->setFocus();
 }
 
