@@ -1,6 +1,7 @@
 #include "provider/sqlite/key_list.h"
 
 #include <algorithm>
+#include <cstring>
 
 namespace mirel::sqlite {
 namespace {
@@ -8,6 +9,22 @@ namespace {
 constexpr size_t kMostSlots = size_t(1) << 28; // 1 GB; a join without a condition has no bound of its own
 
 } // namespace
+
+RecordId IdOf(const RecordKey& key)
+{
+    return RecordId(
+        QByteArray(reinterpret_cast<const char*>(key.constData()), key.size() * qsizetype(sizeof(qint64))));
+}
+
+std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables)
+{
+    const QByteArray& bytes = id.Key();
+    if (bytes.isEmpty() || size_t(bytes.size()) != tables * sizeof(qint64))
+        return {};
+    RecordKey key(qsizetype(tables), kNoRow);
+    memcpy(key.data(), bytes.constData(), size_t(bytes.size()));
+    return key;
+}
 
 bool KeyList::Append(std::span<const qint64> key)
 {

@@ -1,8 +1,11 @@
 #pragma once
 
+#include "platform/record_id.h"
+
 #include <QVarLengthArray>
 #include <QtGlobal>
 
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -13,6 +16,11 @@ using RecordKey = QVarLengthArray<qint64, 4>;
 
 // In place of a row id where an outer join found none.
 inline constexpr qint64 kNoRow = std::numeric_limits<qint64>::min();
+
+// A record's identity is its key.
+RecordId IdOf(const RecordKey& key);
+// None: it is not the key of a record of so many tables.
+std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables);
 
 // The keys of a result in its order, four bytes a row id while all of them fit.
 class KeyList {

@@ -8,29 +8,11 @@
 #include "resources/string_table.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace mirel::sqlite {
 namespace {
 
 const QDeadlineTimer kNoHurry(QDeadlineTimer::Forever);
-
-RecordId IdOf(const RecordKey& key)
-{
-    return RecordId(
-        QByteArray(reinterpret_cast<const char*>(key.constData()), key.size() * qsizetype(sizeof(qint64))));
-}
-
-// None: it is not the key of a record of so many tables.
-std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables)
-{
-    const QByteArray& bytes = id.Key();
-    if (bytes.isEmpty() || size_t(bytes.size()) != tables * sizeof(qint64))
-        return {};
-    RecordKey key(qsizetype(tables), kNoRow);
-    memcpy(key.data(), bytes.constData(), size_t(bytes.size()));
-    return key;
-}
 
 const Outcome& Gone()
 {
