@@ -191,6 +191,7 @@ private:
     void Sum();
     void Writes();
     void Undo();
+    void Undo(const char* what, int records, bool (*change)(OpenResult&, qint64 count));
     void TakeUp();
 
     QString large_;
@@ -334,11 +335,10 @@ void Turns::Writes()
     CompareWrites("delete a half", "-", remove(some), "DELETE FROM Birds WHERE Cost<50000");
 }
 
-// Two hundred thousand changed values, taken back; against making them.
-void Turns::Undo()
+// A change of the first records of the table, taken back; against making it.
+void Turns::Undo(const char* what, int records, bool (*change)(OpenResult&, qint64 count))
 {
-    const QString statement = u"SELECT * FROM Birds WHERE Number<=200000"_s;
-    constexpr int kDamage = 7;
+    const QString statement = u"SELECT * FROM Birds WHERE Number<=%1"_s.arg(records);
     Time making;
     Time undoing;
     for (int i = 0; i < repeat_; ++i) {
@@ -350,7 +350,7 @@ void Turns::Undo()
                 Fail(u"no result"_s);
             const qint64 count = result.Count();
             making.KeepShorter(TimeOf([&] {
-                if (!result.UpdateAll(kDamage, Value::Integer(7), count, [](qint64) { return true; }))
+                if (!change(result, count))
                     Fail(result.LastFailure());
             }));
             undoing.KeepShorter(TimeOf([&] { result.Undo(); }));
@@ -359,7 +359,17 @@ void Turns::Undo()
         }
         connection_.Provider()->CloseDatabase(table_);
     }
-    Say("undo of 200,000 changes", undoing, making, "1.5", u"making them"_s);
+    Say(what, undoing, making, "1.5", u"making them"_s);
+}
+
+void Turns::Undo()
+{
+    Undo("undo of 200,000 changes", 200'000, [](OpenResult& result, qint64 count) {
+        constexpr int kDamage = 7;
+        return result.UpdateAll(kDamage, Value::Integer(7), count, [](qint64) { return true; });
+    });
+    Undo("undo of 20,000 deletions", 20'000,
+         [](OpenResult& result, qint64 count) { return result.DeleteAll(count, [](qint64) { return true; }); });
 }
 
 // Another program writes a record of a sorted result; against opening that result.

@@ -12,7 +12,8 @@
 namespace mirel::cli {
 namespace {
 
-// Up to four bytes that a line cannot contain unchanged: a text with one of them needs quotes or escapes.
+// Up to four bytes, none of them zero, that a line cannot contain unchanged: a text with one of them needs quotes
+// or escapes.
 class SpecialBytes {
 public:
     constexpr explicit SpecialBytes(std::string_view bytes)
@@ -26,7 +27,7 @@ public:
     {
         constexpr size_t kWidth = sizeof(Block);
         if (text.size() < kWidth)
-            return std::ranges::any_of(text, [this](char byte) { return std::ranges::count(bytes_, byte) > 0; });
+            return !text.empty() && StandInBlock(text.data(), text.size());
         for (size_t at = 0; at + kWidth < text.size(); at += kWidth) {
             if (StandInBlock(text.data() + at))
                 return true;
@@ -37,10 +38,10 @@ public:
 private:
     using Block = char __attribute__((vector_size(16)));
 
-    bool StandInBlock(const char* at) const
+    bool StandInBlock(const char* at, size_t size = sizeof(Block)) const
     {
-        Block block;
-        std::memcpy(&block, at, sizeof block);
+        Block block{};
+        std::memcpy(&block, at, size);
         const auto found =
             (block == bytes_[0]) | (block == bytes_[1]) | (block == bytes_[2]) | (block == bytes_[3]);
         std::array<quint64, 2> halves;
@@ -114,7 +115,7 @@ public:
         for (size_t i = 0; i < cells.size(); ++i) {
             WriteSeparator(i);
             const std::string_view text = cellText_.Of(cells[i], fields_[i].type);
-            if (cells[i].kind == Cell::Kind::Real || cells[i].kind == Cell::Kind::Null)
+            if (IsPlain(cells[i], fields_[i].type))
                 output_.Write(text);
             else
                 writeText_(output_, text);
@@ -126,6 +127,12 @@ public:
     void End() override {}
 
 private:
+    // Numbers need no quotes and no escapes; the words of Yes and No may.
+    static bool IsPlain(const Cell& cell, FieldType type)
+    {
+        return cell.kind == Cell::Kind::Real || cell.kind == Cell::Kind::Null ||
+               (cell.kind == Cell::Kind::Integer && type != FieldType::YesNo);
+    }
     void WriteSeparator(size_t column)
     {
         if (column > 0)

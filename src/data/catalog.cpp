@@ -2,6 +2,8 @@
 
 #include "data/db_recordset.h"
 #include "data/provider_error.h"
+#include "platform/user_locale.h"
+#include "provider/cell_value.h"
 #include "provider/dialect/keywords.h"
 #include "provider/dialect/schema.h"
 
@@ -54,12 +56,11 @@ bool ListFirstColumn(DbRecordset& rows, const QString& source, const DatabaseLoc
 {
     if (!Run(rows, source, database))
         return false;
-    while (!rows.IsEof()) {
-        texts += rows.ValueText(0);
-        if (!rows.MoveNext())
-            return false;
-    }
-    return true;
+    const FieldType type = rows.TypeOfField(0);
+    return rows.Read({.fields = {0}}, [&](std::span<const Cell> cells) {
+        texts += VariantText(ValueOfCell(cells.front(), type));
+        return true;
+    });
 }
 
 bool ReadStamp(DbRecordset& rows, const DatabaseLocation& database, QString& stamp)

@@ -189,6 +189,30 @@ public:
     [[nodiscard]] virtual Hr Commit() = 0;
 };
 
+// Writes single records of one table, each known by its identity in the table: what takes many changes back. No
+// position is looked for, so a record costs the same in a table of any size. Outside of a ProviderTransaction it
+// refuses to write.
+//
+// What is written is held against `expected`, the values that the record must have, as GetValue gives them:
+// NoCurrentRecord when it is gone, RecordChanged when it holds others. Nothing is written then, nor when a value
+// or the table refuses it.
+class RecordEditor {
+public:
+    virtual ~RecordEditor() = default;
+
+    // All columns of the table.
+    virtual std::span<const ResultField> Fields() const = 0;
+
+    // `id` becomes another where a changed field is the key.
+    [[nodiscard]] virtual Hr Update(RecordId& id, std::span<const FieldChange> expected,
+                                    std::span<const FieldChange> values) = 0;
+    [[nodiscard]] virtual Hr Delete(const RecordId& id, std::span<const FieldChange> expected) = 0;
+    // `id`: which one the record is to have, where that is free; on success, which it has.
+    [[nodiscard]] virtual Hr Add(RecordId& id, std::span<const FieldChange> values) = 0;
+
+    virtual QString ErrorContext() const = 0; // of the last failure
+};
+
 // Changes that are one transaction, on disk when Commit returns: all that is written to the database from its
 // making on. Destroyed without Commit, it takes them back. They nest: an inner one that is taken back fails the
 // outer one.
@@ -211,6 +235,10 @@ public:
     virtual std::unique_ptr<RecordAppender> CreateAppender(const DatabaseLocation& database, const QString& table,
                                                            const QStringList& columns, Hr& result,
                                                            QString& context) = 0;
+
+    // On failure null; `result` and `context` say why.
+    virtual std::unique_ptr<RecordEditor> CreateEditor(const DatabaseLocation& database, const QString& table,
+                                                       Hr& result, QString& context) = 0;
 
     // Takes the write lock at once, so that what is compared cannot change before it is written. On failure null;
     // `result` and `context` say why. Must be gone before the connection.

@@ -28,8 +28,7 @@ struct Turn {
 constexpr Turn kUndo{&RecordChange::Field::after, &RecordChange::Field::before, RecordChange::Kind::Deleted};
 constexpr Turn kRedo{&RecordChange::Field::before, &RecordChange::Field::after, RecordChange::Kind::Added};
 
-// Turns changes on recordsets of the tables, which reach every record, in any order, at the same cost. What changes a
-// few fields of many records reads no others.
+// Turns changes record by record, wherever they stand in a result.
 class ChangeTurner {
 public:
     ChangeTurner(DbConnection& connection, const DatabaseLocation& database, const Turn& turn)
@@ -42,83 +41,67 @@ public:
     // `id`: of the record as it is now; on return, as it is then.
     Taken Apply(const RecordChange& change, RecordId& id)
     {
-        Table& table = TableOf(change);
-        if (!table.records.IsOpen())
-            return Refuse(table.records);
-        if (change.kind == turn_.adds) {
-            const bool added = table.records.AddNew(Values(table, change), id);
-            id = table.records.IdInTable();
-            return added ? Taken::Done : Refuse(table.records);
-        }
-        if (!table.records.MoveToRecord(id))
-            return table.records.LastResult() == Hr::NoCurrentRecord ? Taken::LeftAlone : Refuse(table.records);
-        if (!HoldsExpected(table, change))
+        Table& table = TableOf(change.table);
+        if (!table.editor)
+            return Taken::Refused;
+        const bool isWhole = Collect(table, change, turn_.to, to_);
+        if (change.kind == turn_.adds)
+            return Told(*table.editor, table.editor->Add(id, to_));
+        // A field that is gone by now: the record is another one.
+        if (!isWhole || !Collect(table, change, turn_.from, from_))
             return Taken::LeftAlone;
-        if (change.kind != RecordChange::Kind::Changed)
-            return table.records.Delete() ? Taken::Done : Refuse(table.records);
-        const bool written = table.records.Update(Values(table, change));
-        id = table.records.IdInTable();
-        return written ? Taken::Done : Refuse(table.records);
+        if (change.kind == RecordChange::Kind::Changed)
+            return Told(*table.editor, table.editor->Update(id, from_, to_));
+        return Told(*table.editor, table.editor->Delete(id, from_));
     }
 
     const QString& Failure() const { return failure_; }
 
 private:
     struct Table {
-        explicit Table(DbConnection& connection)
-            : records(connection)
-        {
-        }
-        DbRecordset records;
+        std::unique_ptr<RecordEditor> editor; // null: it cannot be written
         QHash<QString, int> fields;
     };
 
-    Table& TableOf(const RecordChange& change)
+    Table& TableOf(const QString& name)
     {
-        QStringList fields;
-        if (change.kind == RecordChange::Kind::Changed) {
-            for (const RecordChange::Field& field : change.fields)
-                fields += FieldReference(field.column);
-        }
-        const QString of = u" FROM "_s + FieldReference(change.table);
-        const QString key = fields.join(u',') + of;
-        const auto known = tables_.find(key);
-        if (known != tables_.end())
-            return known->second;
-        Table& table = tables_.try_emplace(key, connection_).first->second;
-        const auto open = [&](const QString& what) {
-            return table.records.Open(u"SELECT "_s + what + of, database_, CursorType::Static, LockType::Optimistic);
-        };
-        // A field may be gone by now: the others then tell that its record is another one.
-        if ((fields.isEmpty() || !open(fields.join(u','))) && !open(u"*"_s))
+        const auto [known, isNew] = tables_.try_emplace(name);
+        Table& table = known->second;
+        if (!isNew)
             return table;
-        for (int field = 0; field < table.records.FieldCount(); ++field)
-            table.fields.insert(table.records.Fields()[size_t(field)].column, field);
+        Hr result = Hr::NotOpen;
+        QString context;
+        if (ProviderConnection* provider = connection_.Provider())
+            table.editor = provider->CreateEditor(database_, name, result, context);
+        if (!table.editor) {
+            failure_ = ProviderErrorText(nullptr, result, context);
+            return table;
+        }
+        for (const ResultField& field : table.editor->Fields())
+            table.fields.insert(field.column, int(table.fields.size()));
         return table;
     }
 
-    bool HoldsExpected(const Table& table, const RecordChange& change) const
+    // False: the table has not all of the fields; `values` has those that are there.
+    static bool Collect(const Table& table, const RecordChange& change, Value RecordChange::Field::*which,
+                        std::vector<FieldChange>& values)
     {
-        return std::ranges::all_of(change.fields, [&](const RecordChange::Field& field) {
-            const int index = table.fields.value(field.column, -1);
-            return index >= 0 && table.records.FieldValue(index) == field.*turn_.from;
-        });
-    }
-
-    std::vector<FieldChange> Values(const Table& table, const RecordChange& change) const
-    {
-        std::vector<FieldChange> values;
+        values.clear();
         for (const RecordChange::Field& field : change.fields) {
-            const int index = table.fields.value(field.column, -1);
-            if (index >= 0)
-                values.push_back({index, field.*turn_.to});
+            const auto index = table.fields.constFind(field.column);
+            if (index != table.fields.constEnd())
+                values.push_back({*index, field.*which});
         }
-        return values;
+        return values.size() == change.fields.size();
     }
 
-    Taken Refuse(const DbRecordset& records)
+    Taken Told(const RecordEditor& editor, Hr result)
     {
-        failure_ = ProviderErrorText(&records, records.LastResult(), records.ErrorContext());
+        if (!Failed(result))
+            return Taken::Done;
+        if (result == Hr::NoCurrentRecord || result == Hr::RecordChanged)
+            return Taken::LeftAlone;
+        failure_ = ProviderErrorText(nullptr, result, editor.ErrorContext());
         return Taken::Refused;
     }
 
@@ -126,8 +109,51 @@ private:
     const DatabaseLocation& database_;
     const Turn& turn_;
     std::map<QString, Table> tables_;
+    std::vector<FieldChange> from_;
+    std::vector<FieldChange> to_;
     QString failure_;
 };
+
+using Place = std::pair<QString, RecordId>; // table and record
+
+// How far a step was turned, from its last change to its first.
+struct Turned {
+    size_t rest = 0;                // the changes before it are still to come
+    std::vector<size_t> changes;    // that were made, in the order of their making
+    QHash<Place, RecordId> renamed; // records that have another identity since
+    qint64 leftAlone = 0;
+    QString refusal;
+    RecordId last; // the record that was written last
+};
+
+// Inside a transaction. Ends at a record that is refused, and where the user stops it.
+Turned TurnStep(const ChangeLog::Step& step, ChangeTurner& turner, Progress* progress)
+{
+    Turned turned;
+    for (turned.rest = step.size(); turned.rest > 0; --turned.rest) {
+        const qint64 done = qint64(step.size() - turned.rest);
+        if (progress && done % kTellEvery == 0 && !progress->Advance(done))
+            break;
+        const RecordChange& change = step[turned.rest - 1];
+        const RecordId before =
+            turned.renamed.isEmpty() ? change.id : turned.renamed.value({change.table, change.id}, change.id);
+        RecordId id = before;
+        const Taken taken = turner.Apply(change, id);
+        if (taken == Taken::Refused) {
+            turned.refusal = turner.Failure();
+            break;
+        }
+        if (taken == Taken::LeftAlone) {
+            ++turned.leftAlone;
+            continue;
+        }
+        if (id != before)
+            turned.renamed.insert({change.table, before}, id);
+        turned.last = id;
+        turned.changes.push_back(turned.rest - 1);
+    }
+    return turned;
+}
 
 } // namespace
 
@@ -181,57 +207,45 @@ ChangeLog::Outcome ChangeLog::Run(Direction direction, DbConnection& connection,
         prompt.ShowError(ProviderErrorText(nullptr, transaction.LastResult(), transaction.ErrorContext()));
         return {};
     }
-    Outcome outcome;
-    Step rest = source.back();
-    Step taken;
-    QHash<Place, RecordId> renamed;
-    qint64 leftAlone = 0;
-    QString refusal;
+    const Step& step = source.back();
+    const qint64 total = qint64(step.size());
+    Turned turned;
     {
-        const qint64 total = qint64(rest.size());
         const std::unique_ptr<Progress> progress =
             total > kTellEvery ? prompt.StartProgress({Str::UndoingChanges, {}}, total) : nullptr;
         ChangeTurner turner(connection, database, direction == Direction::Undo ? kUndo : kRedo);
-        while (!rest.empty() && refusal.isEmpty()) {
-            const qint64 done = total - qint64(rest.size());
-            if (progress && done % kTellEvery == 0 && !progress->Advance(done))
-                break;
-            const RecordChange& change = rest.back();
-            const RecordId before = renamed.value({change.table, change.id}, change.id);
-            RecordId id = before;
-            const Taken what = turner.Apply(change, id);
-            if (what == Taken::Refused) {
-                refusal = turner.Failure();
-                break;
-            }
-            if (what == Taken::LeftAlone) {
-                ++leftAlone;
-            } else {
-                if (!id.IsNull() && id != before)
-                    renamed.insert({change.table, before}, id);
-                outcome.record = id;
-                outcome.column = change.fields.empty() ? QString() : change.fields.front().column;
-                taken.push_back(change);
-            }
-            rest.pop_back();
-        }
+        turned = TurnStep(step, turner, progress.get());
     }
     if (!transaction.Commit()) { // nothing was taken back
         prompt.ShowError(ProviderErrorText(nullptr, transaction.LastResult(), transaction.ErrorContext()));
         return {};
     }
-    source.pop_back();
-    if (!rest.empty())
-        source.push_back(std::move(rest));
-    if (!taken.empty())
-        target.push_back(std::move(taken)); // it runs backwards there, as it has to
-    Rename(renamed);
-    outcome.done = refusal.isEmpty();
+    Outcome outcome{.done = turned.refusal.isEmpty(), .record = turned.last, .column = {}};
+    if (!turned.changes.empty() && !step[turned.changes.back()].fields.empty())
+        outcome.column = step[turned.changes.back()].fields.front().column;
+    Pass(source, target, turned.changes, turned.rest);
+    Rename(turned.renamed);
     if (!outcome.done)
-        prompt.ShowError(refusal);
-    else if (leftAlone > 0)
-        prompt.Show({Str::UndoLeftAlone, {QString::number(leftAlone)}});
+        prompt.ShowError(turned.refusal);
+    else if (turned.leftAlone > 0)
+        prompt.Show({Str::UndoLeftAlone, {QString::number(turned.leftAlone)}});
     return outcome;
+}
+
+// The last step of `source` without what was done of it, which becomes a step of `target`; it runs backwards
+// there, as it has to.
+void ChangeLog::Pass(std::deque<Step>& source, std::deque<Step>& target, std::span<const size_t> done, size_t rest)
+{
+    Step& step = source.back();
+    Step passed;
+    passed.reserve(done.size());
+    for (const size_t at : done)
+        passed.push_back(std::move(step[at]));
+    step.resize(rest);
+    if (step.empty())
+        source.pop_back();
+    if (!passed.empty())
+        target.push_back(std::move(passed));
 }
 
 } // namespace mirel

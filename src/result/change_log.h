@@ -7,6 +7,7 @@
 #include <QString>
 
 #include <deque>
+#include <span>
 #include <utility>
 #include <vector>
 
@@ -63,6 +64,8 @@ private:
 
     Outcome Run(Direction direction, DbConnection& connection, const DatabaseLocation& database,
                 UserPrompt& prompt);
+    static void Pass(std::deque<Step>& source, std::deque<Step>& target, std::span<const size_t> done,
+                     size_t rest);
     // Records that came back under another identity, because theirs was taken, are known by it from now on.
     void Rename(const QHash<Place, RecordId>& renamed);
 

@@ -48,6 +48,22 @@ QString Written(OutputFormat format, std::span<const ResultField> fields, const 
     return QString::fromUtf8(written.readAll());
 }
 
+// Whatever the text's length, and wherever in it the mark stands.
+TEST(RecordWriter, QuotesATextWithAMarkAnywhere)
+{
+    for (const size_t size : {1, 2, 7, 15, 16, 17, 31, 32, 33, 47}) {
+        const std::string plain(size, 'x');
+        EXPECT_EQ(Written(OutputFormat::Csv, std::span(kFields).first(1), {{Cell::OfText(plain)}}),
+                  u"Name\n%1\n"_s.arg(QString::fromStdString(plain)));
+        for (size_t at = 0; at < size; ++at) {
+            std::string marked = plain;
+            marked[at] = ',';
+            EXPECT_EQ(Written(OutputFormat::Csv, std::span(kFields).first(1), {{Cell::OfText(marked)}}),
+                      u"Name\n\"%1\"\n"_s.arg(QString::fromStdString(marked)));
+        }
+    }
+}
+
 TEST(RecordWriter, WritesEachTypeAsItsFormatHasIt)
 {
     EXPECT_EQ(Written(OutputFormat::Csv, kFields, kRecords),

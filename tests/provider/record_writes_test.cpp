@@ -278,6 +278,40 @@ TEST_F(BulkWrites, OfAKeyLeaveTheCursorOnRecordsThatAreThere)
     EXPECT_EQ(FieldOf(*cursor, 0), Value::Integer(7));
 }
 
+// What the way back of many changes is made of; tests/result/change_log_test.cpp has the rest.
+TEST_F(BulkWrites, ByIdentityNeedATransactionAndTheValuesExpected)
+{
+    Outside("CREATE TABLE K (Id INTEGER PRIMARY KEY, Name VARCHAR(3)); INSERT INTO K VALUES (1,'a'),(2,'b')");
+    Hr result = Hr::Unexpected;
+    QString reason;
+    EXPECT_EQ(provider->CreateEditor(path, u"Nowhere"_s, result, reason), nullptr);
+    EXPECT_EQ(result, Hr::NoSuchTable);
+    const auto editor = provider->CreateEditor(path, u"K"_s, result, reason);
+    ASSERT_TRUE(editor) << reason.toStdString();
+    const auto cursor = Open(u"K"_s);
+    RecordId id = cursor->IdInTable();
+    const auto name = [](const char16_t* text) {
+        return std::array{FieldChange{1, Value::Text(QString::fromUtf16(text))}};
+    };
+    EXPECT_EQ(editor->Update(id, name(u"a"), name(u"x")), Hr::Unexpected) << "no transaction";
+    EXPECT_EQ(editor->Add(id, name(u"x")), Hr::Unexpected);
+    const auto transaction = provider->BeginTransaction(path, result, reason);
+    ASSERT_TRUE(transaction);
+    EXPECT_EQ(editor->Update(id, name(u"b"), name(u"x")), Hr::RecordChanged);
+    EXPECT_EQ(editor->Update(id, name(u"a"), name(u"long")), Hr::Overflow);
+    EXPECT_EQ(editor->Update(id, name(u"a"), name(u"x")), Hr::Ok);
+    EXPECT_EQ(editor->Delete(id, name(u"a")), Hr::RecordChanged);
+    EXPECT_EQ(editor->Delete(id, name(u"x")), Hr::Ok);
+    EXPECT_EQ(editor->Delete(id, {}), Hr::NoCurrentRecord);
+    for (RecordId strange : {RecordId(), RecordId("1"), RecordId(QByteArray(16, '\1'))})
+        EXPECT_EQ(editor->Update(strange, {}, name(u"y")), Hr::NoCurrentRecord);
+    EXPECT_EQ(editor->Add(id, name(u"c")), Hr::Ok);
+    EXPECT_EQ(transaction->Commit(), Hr::Ok);
+    EXPECT_EQ(Read(*Open(u"K"_s)), (QStringList{u"1|c"_s, u"2|b"_s}));
+    provider->CloseDatabase(path);
+    EXPECT_EQ(editor->Delete(id, {}), Hr::NotOpen);
+}
+
 class Appending : public RecordWrites {
 protected:
     std::unique_ptr<RecordAppender> Appender(const QStringList& columns, Hr expected = Hr::Ok)

@@ -3,6 +3,7 @@
 #include "provider/sqlite/cedb_recordset.h"
 #include "provider/sqlite/database_file.h"
 #include "provider/sqlite/table_appender.h"
+#include "provider/sqlite/table_editor.h"
 #include "resources/string_table.h"
 
 namespace mirel::sqlite {
@@ -78,6 +79,18 @@ std::unique_ptr<RecordAppender> CedbProvider::CreateAppender(const DatabaseLocat
     result = outcome.code;
     context = outcome.context;
     return appender;
+}
+
+std::unique_ptr<RecordEditor> CedbProvider::CreateEditor(const DatabaseLocation& database, const QString& table,
+                                                         Hr& result, QString& context)
+{
+    Outcome outcome;
+    std::unique_ptr<RecordEditor> editor;
+    if (const std::shared_ptr<DatabaseFile> file = FileOf(database, outcome))
+        editor = OpenEditor(file, table, outcome);
+    result = outcome.code;
+    context = outcome.context;
+    return editor;
 }
 
 std::unique_ptr<ProviderTransaction> CedbProvider::BeginTransaction(const DatabaseLocation& database, Hr& result,

@@ -23,6 +23,8 @@ public:
     std::unique_ptr<RecordAppender> CreateAppender(const DatabaseLocation& database, const QString& table,
                                                    const QStringList& columns, Hr& result,
                                                    QString& context) override;
+    std::unique_ptr<RecordEditor> CreateEditor(const DatabaseLocation& database, const QString& table, Hr& result,
+                                               QString& context) override;
     std::unique_ptr<ProviderTransaction> BeginTransaction(const DatabaseLocation& database, Hr& result,
                                                           QString& context) override;
     void CloseDatabase(const DatabaseLocation& database) override;

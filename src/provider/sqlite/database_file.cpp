@@ -226,6 +226,8 @@ bool DatabaseFile::IsReadOnly() const
 
 Outcome DatabaseFile::OutcomeOf(int resultCode) const
 {
+    if (resultCode == SQLITE_OK || resultCode == SQLITE_ROW || resultCode == SQLITE_DONE)
+        return {};
     const QString reason = handle_ ? QString::fromUtf8(sqlite3_errmsg(handle_.get())) : QString();
     return OutcomeOfSqlite(resultCode, path_, reason);
 }

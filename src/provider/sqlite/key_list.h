@@ -14,12 +14,13 @@ namespace mirel::sqlite {
 // The row ids of a record, one for each table of its result.
 using RecordKey = QVarLengthArray<qint64, 4>;
 
-// What a record is known by outside of this folder. None: it is not the key of a record of so many tables.
-RecordId IdOf(const RecordKey& key);
-std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables);
-
 // In place of a row id where an outer join found none.
 inline constexpr qint64 kNoRow = std::numeric_limits<qint64>::min();
+
+// A record's identity, outside of this folder, is its key.
+RecordId IdOf(const RecordKey& key);
+// None: it is not the key of a record of so many tables.
+std::optional<RecordKey> KeyOf(const RecordId& id, size_t tables);
 
 // The keys of a result in its order, four bytes a row id while all of them fit.
 class KeyList {

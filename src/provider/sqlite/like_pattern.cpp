@@ -15,6 +15,8 @@ namespace {
 // ASCII become one, the long s and the Kelvin sign.
 bool HidesAscii(std::string_view text)
 {
+    if (IsAscii(text))
+        return false;
     constexpr std::string_view kLongS = "\xC5\xBF";
     constexpr std::string_view kKelvin = "\xE2\x84\xAA";
     return text.find(kLongS) != std::string_view::npos || text.find(kKelvin) != std::string_view::npos;
@@ -28,13 +30,6 @@ constexpr bool IsSmall(char unit)
 constexpr char Small(char unit)
 {
     return unit >= 'A' && unit <= 'Z' ? char(unit + ('a' - 'A')) : unit;
-}
-
-// Whether `text` begins with `part`, which is in small letters.
-bool StartsWith(std::string_view text, const std::string& part)
-{
-    return text.size() >= part.size() &&
-           std::equal(part.begin(), part.end(), text.begin(), [](char a, char b) { return a == Small(b); });
 }
 
 // Letters that texts are full of come last; what is not listed is rarer than all of them.
@@ -91,30 +86,14 @@ private:
     size_t nextCapital_;
 };
 
-qsizetype FindShort(std::string_view text, const std::string& part)
+bool StartsWith(std::string_view text, const LikePattern::AsciiPart& part)
 {
-    const size_t anchor = RarestByte(part);
-    for (BothCases places(text.substr(anchor), part[anchor]); places.Place() + anchor < text.size();
-         places.Advance()) {
-        if (StartsWith(text.substr(places.Place()), part))
-            return qsizetype(places.Place());
-    }
-    return -1;
+    return part.Begins(text);
 }
 
-qsizetype Find(std::string_view text, const std::string& part)
+qsizetype Find(std::string_view text, const LikePattern::AsciiPart& part)
 {
-    constexpr size_t kShort = 16; // a longer one is searched for in a time that does not grow with its length
-    if (part.size() > text.size())
-        return -1;
-    if (part.empty())
-        return 0;
-    if (part.size() <= kShort)
-        return FindShort(text, part);
-    std::string small(text);
-    std::ranges::transform(small, small.begin(), Small);
-    const void* found = memmem(small.data(), small.size(), part.data(), part.size());
-    return found ? static_cast<const char*>(found) - small.data() : -1;
+    return part.FindIn(text);
 }
 
 qsizetype Find(QStringView text, const QString& part)
@@ -158,6 +137,43 @@ bool MatchesParts(View text, const std::vector<Part>& parts)
 
 } // namespace
 
+LikePattern::AsciiPart::AsciiPart(std::string small)
+    : small_(std::move(small))
+    , anchor_(RarestByte(small_))
+{
+}
+
+bool LikePattern::AsciiPart::Begins(std::string_view text) const
+{
+    return text.size() >= small_.size() &&
+           std::equal(small_.begin(), small_.end(), text.begin(), [](char a, char b) { return a == Small(b); });
+}
+
+qsizetype LikePattern::AsciiPart::FindByAnchor(std::string_view text) const
+{
+    for (BothCases places(text.substr(anchor_), small_[anchor_]); places.Place() + anchor_ < text.size();
+         places.Advance()) {
+        if (Begins(text.substr(places.Place())))
+            return qsizetype(places.Place());
+    }
+    return -1;
+}
+
+qsizetype LikePattern::AsciiPart::FindIn(std::string_view text) const
+{
+    constexpr size_t kShort = 16; // a longer one is searched for in a time that does not grow with its length
+    if (small_.size() > text.size())
+        return -1;
+    if (small_.empty())
+        return 0;
+    if (small_.size() <= kShort)
+        return FindByAnchor(text);
+    std::string small(text);
+    std::ranges::transform(small, small.begin(), Small);
+    const void* found = memmem(small.data(), small.size(), small_.data(), small_.size());
+    return found ? static_cast<const char*>(found) - small.data() : -1;
+}
+
 LikePattern::LikePattern(std::string_view utf8)
 {
     const QString pattern = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();
@@ -165,19 +181,19 @@ LikePattern::LikePattern(std::string_view utf8)
         folded_.push_back(part);
         const std::string bytes = part.toStdString();
         if (IsAscii(utf8))
-            ascii_.push_back(bytes);
-        else if (IsAscii(bytes) && bytes.size() > probe_.size())
-            probe_ = bytes;
+            ascii_.emplace_back(bytes);
+        else if (IsAscii(bytes) && bytes.size() > (probe_ ? probe_->size() : 0))
+            probe_.emplace(bytes);
     }
 }
 
 bool LikePattern::Matches(std::string_view utf8) const
 {
     // Letters beyond ASCII leave the others alone, but for a few.
-    if ((!ascii_.empty() || !probe_.empty()) && !HidesAscii(utf8)) {
+    if ((!ascii_.empty() || probe_) && !HidesAscii(utf8)) {
         if (!ascii_.empty())
             return MatchesParts(utf8, ascii_);
-        if (Find(utf8, probe_) < 0)
+        if (probe_->FindIn(utf8) < 0)
             return false;
     }
     const QString folded = QString::fromUtf8(utf8.data(), qsizetype(utf8.size())).toCaseFolded();

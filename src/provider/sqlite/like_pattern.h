@@ -2,6 +2,7 @@
 
 #include <QString>
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -16,10 +17,26 @@ public:
 
     bool Matches(std::string_view utf8) const;
 
+    // A part between wildcards, in small letters, and its byte to look for first.
+    class AsciiPart {
+    public:
+        explicit AsciiPart(std::string small);
+
+        size_t size() const { return small_.size(); }
+        bool Begins(std::string_view text) const;
+        qsizetype FindIn(std::string_view text) const; // -1: not there
+
+    private:
+        qsizetype FindByAnchor(std::string_view text) const;
+
+        std::string small_;
+        size_t anchor_;
+    };
+
 private:
-    // Its parts between the wildcards, in small letters. Most texts are ASCII and are compared as bytes.
-    std::vector<std::string> ascii_; // empty when a part is not ASCII
-    std::string probe_;              // then a part that is, to look for before a text is folded
+    // Most texts are ASCII and are compared as bytes.
+    std::vector<AsciiPart> ascii_;   // empty when a part is not ASCII
+    std::optional<AsciiPart> probe_; // then a part that is, to look for before a text is folded
     std::vector<QString> folded_;
 };
 

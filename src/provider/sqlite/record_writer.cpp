@@ -1,6 +1,7 @@
 #include "provider/sqlite/record_writer.h"
 
 #include "provider/conversion.h"
+#include "provider/dialect/structure_checker.h"
 #include "provider/sqlite/sql_writer.h"
 #include "resources/string_table.h"
 
@@ -8,6 +9,19 @@
 #include <optional>
 
 namespace mirel::sqlite {
+
+const dialect::Table* FindWritableTable(DatabaseFile& file, const QString& name, Outcome& outcome)
+{
+    outcome = file.RefreshSchema();
+    if (!outcome.Ok())
+        return nullptr;
+    const dialect::Table* table = file.Schema().FindTable(name);
+    if (!table)
+        outcome = {Hr::NoSuchTable, {}};
+    else if (const std::optional<dialect::Failure> refused = dialect::RefuseChange(*table))
+        outcome = {refused->code, refused->context};
+    return outcome.Ok() ? table : nullptr;
+}
 
 RecordWriter::RecordWriter(DatabaseFile& file, const dialect::Table& table, std::span<const ResultField> fields)
     : file_(file)
@@ -42,6 +56,11 @@ bool RecordWriter::MovesRecords(int field) const
     return KeyColumns().contains(fields_[size_t(field)].column);
 }
 
+bool RecordWriter::MovesRecords(std::span<const FieldChange> values) const
+{
+    return std::ranges::any_of(values, [this](const FieldChange& change) { return MovesRecords(change.field); });
+}
+
 Outcome RecordWriter::Convert(const FieldChange& change, Value& converted) const
 {
     const ResultField& field = fields_[size_t(change.field)];
@@ -59,11 +78,40 @@ Outcome RecordWriter::ConvertAll(std::span<const FieldChange> values, std::vecto
     return {};
 }
 
-// `sql` returns the row id of the record that it wrote, which is bound behind the values.
+QByteArray RecordWriter::InsertSql(std::span<const FieldChange> values, bool atRowId) const
+{
+    if (values.empty() && !atRowId)
+        return "INSERT INTO " + table_ + " DEFAULT VALUES";
+    QByteArray names;
+    QByteArray places;
+    const auto add = [&](const QByteArray& column) {
+        names += (names.isEmpty() ? "" : ",") + column;
+        places += places.isEmpty() ? "?" : ",?";
+    };
+    for (const FieldChange& change : values)
+        add(ColumnOf(change.field));
+    if (atRowId)
+        add(rowId_);
+    return "INSERT INTO " + table_ + " (" + names + ") VALUES (" + places + ')';
+}
+
+QByteArray RecordWriter::UpdateSql(std::span<const FieldChange> values) const
+{
+    QByteArray assignments;
+    for (const FieldChange& change : values)
+        assignments += (assignments.isEmpty() ? "" : ",") + ColumnOf(change.field) + "=?";
+    return "UPDATE " + table_ + " SET " + assignments + " WHERE " + rowId_ + "=?";
+}
+
+QByteArray RecordWriter::DeleteSql() const
+{
+    return "DELETE FROM " + table_ + " WHERE " + rowId_ + "=?";
+}
+
 Outcome RecordWriter::Run(const QByteArray& sql, std::span<const Value> values, qint64& rowId)
 {
     Outcome outcome;
-    Statement statement = file_.Prepare(sql, outcome);
+    Statement statement = file_.Prepare(sql + " RETURNING " + rowId_, outcome);
     if (!statement)
         return outcome;
     for (size_t i = 0; i < values.size(); ++i)
@@ -96,19 +144,10 @@ Outcome RecordWriter::Add(std::span<const FieldChange> values, std::optional<qin
     std::vector<Value> converted;
     if (Outcome outcome = ConvertAll(values, converted); !outcome.Ok())
         return outcome;
-    QByteArray names;
-    QByteArray places;
-    const auto setsRowId = [this](const FieldChange& change) { return MovesRecords(change.field); };
-    if (preferred && std::ranges::none_of(values, setsRowId) && IsFree(*preferred)) {
-        names = rowId_;
-        places = QByteArray::number(*preferred);
-    }
-    for (const FieldChange& change : values) {
-        names += (names.isEmpty() ? "" : ",") + ColumnOf(change.field);
-        places += places.isEmpty() ? "?" : ",?";
-    }
-    const QByteArray record = names.isEmpty() ? " DEFAULT VALUES" : " (" + names + ") VALUES (" + places + ')';
-    Outcome outcome = Run("INSERT INTO " + table_ + record + " RETURNING " + rowId_, converted, rowId);
+    const bool atPreferred = preferred && !MovesRecords(values) && IsFree(*preferred);
+    if (atPreferred)
+        rowId = *preferred;
+    Outcome outcome = Run(InsertSql(values, atPreferred), converted, rowId);
     if (outcome.Ok())
         file_.NoteChange(name_);
     return outcome;
@@ -121,13 +160,8 @@ Outcome RecordWriter::Update(std::span<const FieldChange> values, qint64& rowId)
         return outcome;
     if (values.empty())
         return {};
-    QByteArray assignments;
-    for (const FieldChange& change : values)
-        assignments += (assignments.isEmpty() ? "" : ",") + ColumnOf(change.field) + "=?";
     const qint64 old = rowId;
-    Outcome outcome =
-        Run("UPDATE " + table_ + " SET " + assignments + " WHERE " + rowId_ + "=? RETURNING " + rowId_, converted,
-            rowId);
+    Outcome outcome = Run(UpdateSql(values), converted, rowId);
     if (outcome.Ok())
         file_.NoteValues();
     if (outcome.Ok() && rowId != old)
@@ -137,7 +171,7 @@ Outcome RecordWriter::Update(std::span<const FieldChange> values, qint64& rowId)
 
 Outcome RecordWriter::Delete(qint64 rowId)
 {
-    Outcome outcome = Run("DELETE FROM " + table_ + " WHERE " + rowId_ + "=? RETURNING " + rowId_, {}, rowId);
+    Outcome outcome = Run(DeleteSql(), {}, rowId);
     if (outcome.Ok())
         file_.NoteChange(name_);
     return outcome;

@@ -8,6 +8,9 @@
 
 namespace mirel::sqlite {
 
+// The table of that name; null, and why, when it is not there or cannot be written.
+const dialect::Table* FindWritableTable(DatabaseFile& file, const QString& name, Outcome& outcome);
+
 // Writes single records of one table, by row id. Values are checked and converted for their columns first, so
 // a refused one leaves the record as it was.
 class RecordWriter {
@@ -23,9 +26,14 @@ public:
 
     // Ends with ReadOnly for an expression, BadLiteral or Overflow for what does not fit.
     Outcome Convert(const FieldChange& change, Value& converted) const;
+    // Each has a place for each value, and at the end one for the row id, where it takes one.
+    QByteArray InsertSql(std::span<const FieldChange> values, bool atRowId) const;
+    QByteArray UpdateSql(std::span<const FieldChange> values) const;
+    QByteArray DeleteSql() const;
     QByteArray ColumnOf(int field) const;
     // Whether the field may be the row id under a name of its own, so that records move when it is written.
     bool MovesRecords(int field) const;
+    bool MovesRecords(std::span<const FieldChange> values) const;
     const QString& TableName() const { return name_; }
     const QByteArray& Table() const { return table_; } // as SQL
     const QByteArray& RowId() const { return rowId_; } // its alias

@@ -1,9 +1,9 @@
 #include "provider/sqlite/table_appender.h"
 
-#include "provider/dialect/structure_checker.h"
 #include "provider/sqlite/cell_checker.h"
 #include "provider/sqlite/plan.h"
 #include "provider/sqlite/record_feed.h"
+#include "provider/sqlite/record_writer.h"
 #include "provider/sqlite/sql_writer.h"
 #include "provider/sqlite/transaction.h"
 
@@ -132,18 +132,9 @@ Hr TableAppender::Commit()
 std::unique_ptr<RecordAppender> OpenAppender(std::shared_ptr<DatabaseFile> file, const QString& table,
                                              const QStringList& columns, Outcome& outcome)
 {
-    outcome = file->RefreshSchema();
-    if (!outcome.Ok())
+    const dialect::Table* target = FindWritableTable(*file, table, outcome);
+    if (!target)
         return {};
-    const dialect::Table* target = file->Schema().FindTable(table);
-    if (!target) {
-        outcome = {Hr::NoSuchTable, {}};
-        return {};
-    }
-    if (const std::optional<dialect::Failure> refused = dialect::RefuseChange(*target)) {
-        outcome = {refused->code, refused->context};
-        return {};
-    }
     std::vector<ResultField> fields;
     if (columns.isEmpty()) {
         for (const dialect::Column& column : target->columns)
