@@ -285,12 +285,18 @@ TEST_F(OldOrder, IsLeftWhereItWouldNotDo)
              EXPECT_EQ(qint64(ids.size()), cursor->RecordCount());
          }},
         {"a page of it has been deleted", "DELETE FROM T WHERE Name<'name 2'", [this] { Page(0, 20); }},
+        {"a record is written that has another row id now", "DELETE FROM T WHERE rowid<5; VACUUM",
+         [this] {
+             const FieldChange mine{1, Value::Text(u"mine"_s)};
+             EXPECT_EQ(cursor->Update({&mine, 1}), Hr::NoCurrentRecord);
+         }},
         {"row ids are others", "INSERT INTO T VALUES(-3,'b'); VACUUM",
          [this] { EXPECT_EQ(cursor->TakeUpChanges(Values::ReadAgain), Hr::Ok); }},
     };
     for (const auto& row : rows) {
         SCOPED_TRACE(row.what);
         ASSERT_EQ(cursor->MoveTo(7), Hr::Ok);
+        (void)FieldOf(*cursor);
         other.Run("INSERT INTO T VALUES(9,'another')");
         TakeUp(true);
         other.Run(row.sql);

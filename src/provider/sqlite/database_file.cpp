@@ -1,5 +1,6 @@
 #include "provider/sqlite/database_file.h"
 
+#include "platform/system_reason.h"
 #include "provider/sqlite/functions.h"
 #include "provider/sqlite/schema_reader.h"
 #include "provider/sqlite/system_tables.h"
@@ -173,7 +174,7 @@ Outcome DatabaseFile::Create(const QString& path)
     if (!place.open(QIODevice::WriteOnly | QIODevice::NewOnly)) {
         if (QFileInfo::exists(path))
             return {Hr::CannotOpen, StringText(Str::DatabaseExists, {path})};
-        return {Hr::CannotOpen, StringText(Str::DatabaseFailure, {path, place.errorString()})};
+        return {Hr::CannotOpen, StringText(Str::DatabaseFailure, {path, SystemReason(place)})};
     }
     place.close();
     DatabaseFile file(IdentityOfPath(path));
@@ -200,7 +201,7 @@ Outcome DatabaseFile::Remove(const QString& path)
         return outcome;
     QFile whole(file->Path());
     if (!whole.remove())
-        return {Hr::AccessDenied, StringText(Str::DatabaseFailure, {path, whole.errorString()})};
+        return {Hr::AccessDenied, StringText(Str::DatabaseFailure, {path, SystemReason(whole)})};
     for (const char* suffix : kCompanions)
         QFile::remove(CompanionOf(file->Path(), suffix));
     return {};

@@ -52,7 +52,7 @@ Outcome RecordPositions::ReadVersion(Version& version) const
 
 bool RecordPositions::MayStayOld() const
 {
-    return rows_->IsMadeInSteps(oldFrom_) && !file_.IsWriting() && file_.SchemaVersion() == structure_;
+    return rows_->IsMadeInSteps(oldFrom_) && !file_.IsWriting() && AreKeysTheSame();
 }
 
 Outcome RecordPositions::Look(Change& change)

@@ -36,6 +36,8 @@ public:
 
     void AllowOldOrder(qint64 fromRecords);
     bool IsBehind() const { return coming_ != nullptr; }
+    // The file's structure is what it was: nobody gave the records other row ids.
+    bool AreKeysTheSame() const { return file_.SchemaVersion() == structure_; }
     // `isNew`: the rows are others now. They may be behind once more, where they have been changed meanwhile.
     Outcome CatchUp(const QDeadlineTimer& until, bool& isNew);
     // After a failure: the next look finds that everything has changed.

@@ -78,10 +78,10 @@ Outcome StaticCursor::TakeUpChanges()
     return outcome;
 }
 
-// An old order will do for what is compared by its key.
+// An old order will do for what is compared by its key, as long as keys are what they were.
 Outcome StaticCursor::TakeUpForOneRecord()
 {
-    return positions_->IsBehind() ? Outcome() : TakeUpChanges();
+    return positions_->IsBehind() && positions_->AreKeysTheSame() ? Outcome() : TakeUpChanges();
 }
 
 Outcome StaticCursor::TakeUpChanges(ProviderRecordset::Values values)
