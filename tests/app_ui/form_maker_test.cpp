@@ -466,7 +466,7 @@ TEST_P(FormMakerWindow, ClosesOnlyAsTheUserSays)
 }
 
 INSTANTIATE_TEST_SUITE_P(BothSizes, FormMakerWindow, ::testing::Values(kHandheld, kDesktop),
-                         [](const auto& info) { return info.param == kHandheld ? "Handheld" : "Desktop"; });
+                         [](const auto& size) { return size.param == kHandheld ? "Handheld" : "Desktop"; });
 
 } // namespace
 } // namespace mirel

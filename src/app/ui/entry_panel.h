@@ -19,6 +19,7 @@ public:
 
     // Looks at the entry once the user stays on it.
     void LookAt(const std::optional<MainEntry>& entry);
+    bool IsSettled() const { return !lookTimer_.isActive() && !countTimer_.isActive(); }
     void StopCounting() { summary_.StopCounting(); }
 
 private:

@@ -9,10 +9,9 @@
 #include "help/ui/help_desk.h"
 
 #include <QApplication>
+#include <QDeadlineTimer>
 #include <QDir>
-#include <QEventLoop>
 #include <QFileInfo>
-#include <QTimer>
 
 #include <cstdio>
 
@@ -109,13 +108,15 @@ bool ShowAlone(CMainFrame& frame, const std::optional<ViewKey>& view)
     return false;
 }
 
-// What is counted and read in slices.
-void WaitUntilAllShows()
+// What is counted and sorted in steps, as long as it takes a moment.
+void WaitUntilAllShows(const CMainFrame& frame)
 {
-    constexpr int kMs = 400;
-    QEventLoop loop;
-    QTimer::singleShot(kMs, &loop, &QEventLoop::quit);
-    loop.exec();
+    constexpr int kPatienceMs = 2000;
+    constexpr int kTurnMs = 50;
+    const QDeadlineTimer patience(kPatienceMs);
+    do {
+        QCoreApplication::processEvents(QEventLoop::AllEvents, kTurnMs);
+    } while (!frame.IsSettled() && !patience.hasExpired());
 }
 
 int TakePicture(const WindowOptions& options)
@@ -133,7 +134,7 @@ int TakePicture(const WindowOptions& options)
     frame.show();
     if (!frame.IsAlone())
         frame.RestoreViews();
-    WaitUntilAllShows();
+    WaitUntilAllShows(frame);
     if (frame.grab().save(options.picture, "PNG"))
         return kDone;
     Say(stderr, u"mirel: cannot write %1\n"_s.arg(options.picture));

@@ -78,6 +78,8 @@ public:
     // From here on the window is that of the views opened in it: it shows no lists, and closes with the last view.
     void BeAlone(const ViewKey& view);
     bool IsAlone() const { return aloneWith_.has_value(); }
+    // Nothing of it is still to be looked up, counted or sorted.
+    bool IsSettled() const;
     // From here on other starts with the same database lead here; the instance must outlive the frame.
     void AnswerOtherStarts(Instance& instance);
     // What was being typed when an earlier run was killed; asks nothing when nothing was.

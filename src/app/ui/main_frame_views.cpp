@@ -340,6 +340,12 @@ QList<HostedView*> CMainFrame::Views() const
     return views;
 }
 
+bool CMainFrame::IsSettled() const
+{
+    const QList<HostedView*> views = Views();
+    return panel_->IsSettled() && std::ranges::all_of(views, &HostedView::IsSettled);
+}
+
 // --- kept for the next run ----------------------------------------------------------------------------------
 
 // By the file's name and what was opened of it: a copy of a database looks as the first one does.

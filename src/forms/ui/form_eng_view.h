@@ -55,6 +55,7 @@ public:
     bool MayClose() override;
     void GiveUpEdits() override;
     void TakeUpChanges() override;
+    bool IsSettled() const override { return !form_.IsBehind(); }
     std::optional<RecordDraft> Draft() override;
     bool PutBack(const RecordDraft& draft) override;
     void ChangeSettings(const FormViewSettings& settings);

@@ -41,6 +41,8 @@ public:
     }
     // Shows what others have changed in the database. The selection stays on its record, typed text stays.
     virtual void TakeUpChanges() = 0;
+    // Nothing is left that it counts or sorts in steps.
+    virtual bool IsSettled() const { return true; }
 
 Q_SIGNALS:
     void recordsChanged(); // by this view: others may show them as well

@@ -72,6 +72,7 @@ public:
     bool MayClose() override { return givenUp_ || Settle(browser_.WriteEdit()); }
     void GiveUpEdits() override { givenUp_ = true; }
     void TakeUpChanges() override;
+    bool IsSettled() const override { return browser_.IsSettled(); }
     std::optional<RecordDraft> Draft() override;
     bool PutBack(const RecordDraft& draft) override;
 
