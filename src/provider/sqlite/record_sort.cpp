@@ -96,14 +96,11 @@ void RecordSort::Sort(const Task& task)
     const std::span<Entry> entries = std::span(entries_).subspan(task.first, task.count);
     if (task.count <= kFewEntries || task.at >= kMostKeyBytes)
         return SortWhole(entries);
-    size_t longest = 0;
     quint64 least = ~quint64(0);
     quint64 greatest = 0;
     for (Entry& entry : entries) {
-        const Stored& stored = stored_[entry.stored];
-        longest = std::max(longest, size_t(stored.keySize));
         if (task.at > 0)
-            entry.piece = PieceOf(KeyOf(stored), task.at);
+            entry.piece = PieceOf(KeyOf(stored_[entry.stored]), task.at);
         least = std::min(least, entry.piece);
         greatest = std::max(greatest, entry.piece);
     }
@@ -111,7 +108,7 @@ void RecordSort::Sort(const Task& task)
         return Distribute(task, least, greatest);
     if (least != greatest)
         std::ranges::sort(entries, {}, &Entry::piece);
-    SortEqualPieces(task, longest <= task.at + kPieceBytes);
+    SortEqualPieces(task);
 }
 
 // By the first bits in which they differ, into buckets that are sorted later, each by itself.
@@ -141,16 +138,19 @@ void RecordSort::Distribute(const Task& task, quint64 least, quint64 greatest)
         std::ranges::copy(std::span(scratch_).first(task.count), entries.begin());
 }
 
-void RecordSort::SortEqualPieces(const Task& task, bool isLast)
+void RecordSort::SortEqualPieces(const Task& task)
 {
+    const size_t next = task.at + kPieceBytes;
+    const auto goesOn = [&](const Entry& entry) { return stored_[entry.stored].keySize > next; };
     const std::span<Entry> entries = std::span(entries_).subspan(task.first, task.count);
     for (size_t from = 0, to = 0; from < entries.size(); from = to) {
         while (to < entries.size() && entries[to].piece == entries[from].piece)
             ++to;
-        if (isLast || to - from <= kFewEntries)
-            SortWhole(entries.subspan(from, to - from));
-        else
-            tasks_.push_back({task.first + from, to - from, task.at + kPieceBytes});
+        const std::span<Entry> same = entries.subspan(from, to - from);
+        if (same.size() > kFewEntries && std::ranges::any_of(same, goesOn))
+            tasks_.push_back({task.first + from, same.size(), next});
+        else if (same.size() > 1)
+            SortWhole(same);
     }
 }
 

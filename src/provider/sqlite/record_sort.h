@@ -69,7 +69,7 @@ private:
     void SortNext();
     void Sort(const Task& task);
     void Distribute(const Task& task, quint64 least, quint64 greatest);
-    void SortEqualPieces(const Task& task, bool isLast);
+    void SortEqualPieces(const Task& task);
     void SortWhole(std::span<Entry> entries) const;
     void RankSome();
     void CountRanks();
