@@ -22,6 +22,7 @@ Outcome RecordPositions::Begin(bool isShared)
 {
     isShared_ = isShared;
     rows_ = MakeRows();
+    structure_ = file_.SchemaVersion();
     return ReadVersion(version_);
 }
 
@@ -92,12 +93,6 @@ void RecordPositions::AdoptOwnChange()
 void RecordPositions::AdoptOwnValues()
 {
     version_.values = file_.ValuesVersion();
-}
-
-void RecordPositions::AllowOldOrder(qint64 fromRecords)
-{
-    oldFrom_ = fromRecords;
-    structure_ = file_.SchemaVersion();
 }
 
 void RecordPositions::BeginComing()

@@ -34,7 +34,7 @@ public:
     void AdoptOwnChange();
     void AdoptOwnValues();
 
-    void AllowOldOrder(qint64 fromRecords);
+    void AllowOldOrder(qint64 fromRowIds) { oldFrom_ = fromRowIds; }
     bool IsBehind() const { return coming_ != nullptr; }
     // The file's structure is what it was: nobody gave the records other row ids.
     bool AreKeysTheSame() const { return file_.SchemaVersion() == structure_; }
