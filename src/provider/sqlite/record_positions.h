@@ -69,8 +69,7 @@ private:
     Version version_; // at the last look
 
     qint64 oldFrom_ = std::numeric_limits<qint64>::max(); // among so many row ids
-    qint64 structure_ =
-        -1; // of the file, where an old order is allowed: row ids mean the same as long as it is that
+    qint64 structure_ = -1; // of the file, when the rows were begun
     std::unique_ptr<ResultRows> coming_; // what the rows will be
     Version comingVersion_;              // when they were begun
 };
