@@ -69,9 +69,9 @@ private:
     Version version_; // at the last look
 
     qint64 oldFrom_ = std::numeric_limits<qint64>::max(); // among so many row ids
-    qint64 structure_ = -1; // of the file, when the rows were begun
-    std::unique_ptr<ResultRows> coming_; // what the rows will be
-    Version comingVersion_;              // when they were begun
+    qint64 structure_ = -1;                               // of the file, when the rows were begun
+    std::unique_ptr<ResultRows> coming_;                  // what the rows will be
+    Version comingVersion_;                               // when they were begun
 };
 
 } // namespace mirel::sqlite
