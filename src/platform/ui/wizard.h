@@ -28,7 +28,7 @@ protected:
     void AddPage(QWidget* page); // in the order of the steps
     int CurrentStep() const;
     bool IsLastStep() const { return CurrentStep() + 1 == int(steps_.size()); }
-    // One there is not is the nearest one.
+    // A step out of range stops at the nearest one.
     virtual void ShowStep(int step);
     virtual void GoOn() = 0;
     QPushButton* NextButton() const { return next_; }
